@@ -1,0 +1,66 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+#include "Platform/Dictionary.h"
+#include "Platform/List.h"
+
+#include <cstddef>
+#include <memory>
+#include <string_view>
+
+namespace spectrel {
+
+/// Keys of the state dictionary, which the model owns and every generator fills.
+namespace StateKey {
+inline constexpr std::string_view History = "History"; // list of history entries, oldest first, at most 5
+inline constexpr std::string_view DisplayState = "DisplayState"; // raw material of the latest display build
+inline constexpr std::string_view Display = "Display"; // the display dictionary
+inline constexpr std::string_view ExtraInfo = "ExtraInfo"; // a dictionary, new and empty whenever "Display" is built
+inline constexpr std::string_view Template = "Template"; // the display template, loaded once
+inline constexpr std::string_view Lookup = "Lookup"; // the field lookup that one generator derives from its template
+} // namespace StateKey
+
+/// Turns the log stream of one radio technology into display state.
+class LogGenerator {
+public:
+    static constexpr std::size_t HistoryLimit = 5;
+
+    virtual ~LogGenerator();
+    LogGenerator(const LogGenerator&) = delete;
+    LogGenerator& operator=(const LogGenerator&) = delete;
+
+    /// Applies one inbound log message body. May throw the exceptions that records can raise; nobody catches them.
+    virtual void updateState(Dictionary& state, ByteView data) = 0;
+    /// The display dictionary, or an absent value; appends one history entry.
+    virtual Value generateLogUsingState(Dictionary& state) = 0;
+    /// The property-list dictionary that tells the baseband what to stream.
+    virtual DictionaryRef getStartCommand() = 0;
+    /// A new list of the dictionaries that a snapshot saves.
+    virtual ListRef getSaveContentsFromState(const Dictionary& state) = 0;
+
+    /// The concrete class's name. Two generators of one name draw the same display.
+    virtual std::string_view className() const = 0;
+    /// Goes on where a predecessor of the same class ended: with the display that the state holds and the raw messages
+    /// that no display build has taken yet.
+    virtual void takeOver(LogGenerator& predecessor, Dictionary& state);
+    /// Keeps a message that could not be applied among the raw messages, for a snapshot written at the program's end.
+    virtual void keepRawMessage(ByteView data);
+
+    /// A new generator for the telephony service's technology value; null for any other value.
+    static std::unique_ptr<LogGenerator> generatorFromTechnology(const Value& technology);
+    /// Appends one history entry, built from the state's current values, keeping the newest five.
+    static void updateHistoryInState(Dictionary& state);
+
+protected:
+    /// Logs "Creating Log object: %p".
+    LogGenerator();
+};
+
+/// Puts a new generator (or none) in the place of an earlier one.
+///
+/// One of the same class takes over the display; one of another class finds a state without "Template", "Display" and
+/// "Lookup". The history stays in either case: messages not yet built into a display get a last entry.
+void replaceGenerator(
+    std::unique_ptr<LogGenerator>& generator, std::unique_ptr<LogGenerator> successor, Dictionary& state);
+
+} // namespace spectrel

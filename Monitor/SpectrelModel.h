@@ -1,0 +1,126 @@
+#pragma once
+
+#include "LogGenerator/LogGenerator.h"
+#include "Monitor/SpectrelModelNode.h"
+#include "Platform/Bytes.h"
+#include "Platform/Dictionary.h"
+#include "Platform/List.h"
+#include "Platform/MessagePort.h"
+#include "Platform/RunLoop.h"
+#include "Platform/TelephonyServer.h"
+
+#include <chrono>
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace spectrel {
+
+/// Who is told of the model's news; every program that runs a session has one.
+class SpectrelModelObserver {
+public:
+    virtual ~SpectrelModelObserver() = default;
+    /// The display may have changed: read the tree again. At most once per timer tick, from the main queue.
+    virtual void updateViewControllerFromModel() = 0;
+    /// The session was opened or lost, or the reason why there is none has changed.
+    virtual void sessionDidChange() { }
+    /// One inbound message body, before it is applied.
+    virtual void modelDidReceive(ByteView) { }
+};
+
+/// The monitor model: the log channel to the telephony service, the state that the generator fills, and the display
+/// tree built from it.
+class SpectrelModel {
+public:
+    /// What the model needs of the platform; all outlive it.
+    struct Services {
+        RunLoop& runLoop;
+        MessagePorts& ports;
+        TelephonyServer& telephony;
+    };
+
+    static constexpr std::chrono::milliseconds RefreshInterval{ 2000 };
+    static constexpr std::chrono::seconds RetryDelay{ 5 };
+    static constexpr std::chrono::seconds RequestTimeout{ 1 };
+    /// The application's name on the message ports; other programs take one of their own in its place.
+    static constexpr std::string_view ApplicationPrefix = "org.spectrel.Spectrel";
+
+    /// Opens nothing. The local port is named `portPrefix` + ".BasebandStateReport.LogChannel".
+    SpectrelModel(Services services, SpectrelModelObserver& observer, std::string portPrefix);
+    ~SpectrelModel();
+    SpectrelModel(const SpectrelModel&) = delete;
+    SpectrelModel& operator=(const SpectrelModel&) = delete;
+
+    // The session.
+    bool isConnected() const;
+    bool createPorts();
+    void destroyPorts();
+    void configureGenerator();
+    void startMonitor();
+    void restartMonitor();
+    /// Why there is no session, as the system log told it last, without its decoration; empty while there is one.
+    const std::string& lostReason() const
+    {
+        return _lostReason;
+    }
+
+    // The display.
+    void updateWithData(ByteView data);
+    void refresh();
+    /// The root of the current tree, built at need; null without a generator.
+    NodeRef topLevelNodes();
+    NodeRef nodeAtPath(std::string_view path);
+    /// What a snapshot saves; null without a generator.
+    ListRef getSaveContents();
+    /// The same for a program that is about to end: the messages since the last refresh are folded in first, and the
+    /// message being applied, if one is.
+    ListRef getLastContents();
+
+    const Dictionary& state() const
+    {
+        return *_state;
+    }
+    const LogGenerator* logGenerator() const
+    {
+        return _logGenerator.get();
+    }
+    /// The message being applied right now; empty otherwise.
+    ByteView messageInProgress() const
+    {
+        return _messageInProgress;
+    }
+    /// The technology value that the service answered last; empty before.
+    const std::string& technology() const
+    {
+        return _technology;
+    }
+
+private:
+    std::optional<Bytes> handleMessage(std::int32_t id, ByteView body);
+    void handleInvalidation(const LocalMessagePort& port);
+    bool startSession();
+    void retryLater();
+    void scheduleStart(std::chrono::nanoseconds delay);
+    void fail(std::string_view line);
+    void setLostReason(std::string reason);
+
+    Services _services;
+    SpectrelModelObserver& _observer;
+    std::string _portPrefix;
+    std::string _lostReason;
+    std::string _technology;
+    ByteView _messageInProgress;
+    std::shared_ptr<bool> _alive; // jobs on the queue hold it weakly: they end with the model
+
+    std::shared_ptr<LocalMessagePort> _recvPort;
+    std::shared_ptr<RemoteMessagePort> _sendPort;
+    std::unique_ptr<Timer> _displayUpdateTimer;
+    bool _updated = false;
+    std::unique_ptr<LogGenerator> _logGenerator;
+    DictionaryRef _state;
+    NodeRef _nodes;
+    std::unique_ptr<PathIndex> _nodesByPath;
+};
+
+} // namespace spectrel

@@ -1,0 +1,39 @@
+#pragma once
+
+#include <chrono>
+#include <cstdint>
+#include <string>
+#include <string_view>
+
+namespace spectrel {
+
+/// A moment, UTC, to the microsecond.
+using Moment = std::chrono::sys_time<std::chrono::microseconds>;
+
+struct ZoneState {
+    std::int32_t secondsEastOfUTC = 0; // daylight-saving time included
+    bool isDaylightSaving = false;
+};
+
+/// The device's clock and its time zone.
+class Clock {
+public:
+    virtual ~Clock() = default;
+    virtual Moment now() const = 0;
+    virtual ZoneState zoneAt(Moment moment) const = 0;
+    /// The moment in the device's time zone by a pattern such as "'Updated' yyyy-MM-dd 'at' HH:mm:ss": quoted text is
+    /// literal, yyyy MM dd HH mm ss are the calendar fields.
+    virtual std::string formatted(Moment moment, std::string_view pattern) const = 0;
+
+    /// The clock that the log generators read; the system's until another is installed. It must outlive its use.
+    static void install(Clock* clock);
+    static Clock& installed();
+};
+
+/// The platform's default date form, in UTC whatever the device's zone: "2019-12-09 21:26:56 +0000".
+std::string defaultDateForm(Moment moment);
+
+/// The moment that such a text tells; none when it is not in that form.
+bool parseDefaultDateForm(std::string_view text, Moment& moment);
+
+} // namespace spectrel

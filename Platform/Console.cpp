@@ -1,0 +1,32 @@
+#include "Platform/Console.h"
+
+#include <cstdio>
+
+namespace spectrel {
+
+namespace {
+Console* installedConsole = nullptr;
+}
+
+void Console::install(Console* console)
+{
+    installedConsole = console;
+}
+
+Console* Console::installed()
+{
+    return installedConsole;
+}
+
+void consoleLine(std::string_view text)
+{
+    if (installedConsole)
+        installedConsole->line(text);
+}
+
+void StandardErrorConsole::line(std::string_view text)
+{
+    std::fprintf(stderr, "%.*s\n", static_cast<int>(text.size()), text.data());
+}
+
+} // namespace spectrel

@@ -1,0 +1,35 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+#include "Platform/Value.h"
+
+#include <cstddef>
+#include <optional>
+#include <string>
+
+namespace spectrel {
+
+/// What a list may hold before it "does not parse": enough for any record or template, and a wall for hostile input.
+struct PropertyListLimits {
+    static constexpr std::size_t Depth = 128; // containers within containers
+    static constexpr std::size_t Values = 1'000'000; // shared references counted each time they are met
+    static constexpr std::size_t ExpandedBytes = 64 * 1024 * 1024; // texts and data, shared ones counted each time
+};
+
+/// Reads a property list in its XML or its binary form; which one, the first bytes tell.
+///
+/// Strict: malformed numbers, missing values, trailing garbage and unknown elements do not parse. Keys keep the
+/// list's order; a key given twice keeps its last value.
+std::optional<Value> parsePropertyList(ByteView bytes);
+
+/// The XML form (format code 100), UTF-8, as every reader of property lists takes it; dictionary entries in their
+/// order. None when the value cannot be written: absent, or a text that XML cannot carry.
+std::optional<std::string> serialisePropertyList(const Value& value);
+
+/// Writes the XML form straight to the path, mode 0600. On failure false, with `reason` telling why.
+bool writePropertyListToFile(const Value& value, const std::string& path, std::string& reason);
+
+/// Reads a whole file as a property list; none when it cannot be read or does not parse.
+std::optional<Value> readPropertyListFile(const std::string& path);
+
+} // namespace spectrel

@@ -1,0 +1,59 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+#include "Platform/Clock.h"
+
+#include <cstdint>
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace spectrel {
+
+/// The five radio technologies, by the names that the command line and the recordings use.
+enum class Technology : std::uint8_t { IFX, GSM, CDMA, LTE, UTRAN };
+
+/// "ifx", "gsm", "cdma", "lte", "utran".
+std::string_view technologyName(Technology technology);
+std::optional<Technology> technologyNamed(std::string_view name);
+/// The telephony framework's constant, such as "kRKLogChannelTechnology_Zephyr_LTE".
+std::string_view technologyConstant(Technology technology);
+std::optional<Technology> technologyOfConstant(std::string_view constant);
+
+/// One inbound log message as it was delivered, wrapper and all.
+struct RecordedMessage {
+    Moment time;
+    ByteView body; // valid until the next one is read
+};
+
+/// Reads a recording message by message, whatever the kind of file: a capture, a snapshot or a DLF.
+class RecordingReader {
+public:
+    virtual ~RecordingReader() = default;
+    /// None when the file does not tell it.
+    virtual std::optional<Technology> technology() const = 0;
+    /// False at the end and at damage; `damage` then tells which.
+    virtual bool next(RecordedMessage& message) = 0;
+    /// What ended the reading early, with the place in the file ("message 12 at byte 3481: ..."); empty at a clean end.
+    virtual const std::string& damage() const = 0;
+};
+
+/// Opens a recording; its content tells its kind. Null when it cannot be read or is of no known kind, with `reason`
+/// telling why (without the file's name).
+std::unique_ptr<RecordingReader> openRecording(const std::string& path, std::string& reason);
+
+/// Writes a capture file (classic pcap); the link type tells the technology.
+class RecordingWriter {
+public:
+    virtual ~RecordingWriter() = default;
+    /// False when the message cannot be written; `error` tells why.
+    virtual bool write(Moment time, ByteView body) = 0;
+    virtual bool flush() = 0;
+    virtual const std::string& error() const = 0;
+};
+
+/// Null when the file cannot be made, with `reason` telling why. "-" is standard output.
+std::unique_ptr<RecordingWriter> createRecording(const std::string& path, Technology technology, std::string& reason);
+
+} // namespace spectrel

@@ -1,0 +1,18 @@
+# Flags of every target of the project, in one interface target.
+find_program(CCACHE_PROGRAM ccache)
+if(CCACHE_PROGRAM)
+    set(CMAKE_CXX_COMPILER_LAUNCHER ${CCACHE_PROGRAM})
+endif()
+
+add_library(spectrel_options INTERFACE)
+target_compile_features(spectrel_options INTERFACE cxx_std_20)
+target_compile_options(spectrel_options INTERFACE
+    -Wall -Wextra -Wpedantic -Wshadow -Wconversion -Wno-sign-conversion -Werror)
+target_include_directories(spectrel_options INTERFACE ${CMAKE_SOURCE_DIR})
+target_compile_definitions(spectrel_options INTERFACE SPECTREL_VERSION="${PROJECT_VERSION}")
+if(SPECTREL_SANITIZERS)
+    target_compile_options(spectrel_options INTERFACE
+        -fsanitize=${SPECTREL_SANITIZERS} -fno-sanitize-recover=all -fno-omit-frame-pointer -g)
+    target_link_options(spectrel_options INTERFACE -fsanitize=${SPECTREL_SANITIZERS})
+endif()
+set(CMAKE_CXX_EXTENSIONS OFF)
