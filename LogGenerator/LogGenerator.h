@@ -40,9 +40,9 @@ public:
 
     /// The concrete class's name. Two generators of one name draw the same display.
     virtual std::string_view className() const = 0;
-    /// Goes on where a predecessor of the same class ended: with the display that the state holds and the raw messages
-    /// that no display build has taken yet.
-    virtual void takeOver(LogGenerator& predecessor, Dictionary& state);
+    /// Goes on where a predecessor of the same class ended: with the display that the state holds and, when the
+    /// predecessor is still there (not null), with the raw messages that no display build has taken yet.
+    virtual void takeOver(LogGenerator* predecessor, Dictionary& state);
     /// Keeps a message that could not be applied among the raw messages, for a snapshot written at the program's end.
     virtual void keepRawMessage(ByteView data);
 
@@ -52,15 +52,10 @@ public:
     static void updateHistoryInState(Dictionary& state);
 
 protected:
-    /// Logs "Creating Log object: %p".
-    LogGenerator();
+    LogGenerator() = default;
+    /// The initialiser: logs "Creating Log object: %p". Apart from the constructor because one generator may stay
+    /// uninitialised for want of a template.
+    void init();
 };
-
-/// Puts a new generator (or none) in the place of an earlier one.
-///
-/// One of the same class takes over the display; one of another class finds a state without "Template", "Display" and
-/// "Lookup". The history stays in either case: messages not yet built into a display get a last entry.
-void replaceGenerator(
-    std::unique_ptr<LogGenerator>& generator, std::unique_ptr<LogGenerator> successor, Dictionary& state);
 
 } // namespace spectrel

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "LogGenerator/LogGenerator.h"
+#include "LogGenerator/GeneratorSlot.h"
 #include "Monitor/SpectrelModelNode.h"
 #include "Platform/Bytes.h"
 #include "Platform/Dictionary.h"
@@ -97,18 +97,23 @@ public:
     }
 
 private:
-    std::optional<Bytes> handleMessage(std::int32_t id, ByteView body);
-    void handleInvalidation(const LocalMessagePort& port);
+    void handleMessage(std::int32_t id, ByteView body) noexcept;
+    void handleInvalidation(const LocalMessagePort* port);
+    bool openLogChannel(const std::string& localName, std::string& serviceName);
     bool startSession();
-    void retryLater();
-    void scheduleStart(std::chrono::nanoseconds delay);
-    void fail(std::string_view line);
-    void setLostReason(std::string reason);
+    void closePorts();
+    void announceChange();
+    void reloadScreens();
+    RunLoop::Job whileAlive(void (SpectrelModel::*operation)());
+    void fail(const char* format, ...) __attribute__((format(printf, 2, 3)));
 
     Services _services;
     SpectrelModelObserver& _observer;
     std::string _portPrefix;
-    std::string _lostReason;
+    std::string _lostReason; // of the latest attempt to open a session
+    bool _attemptHasReason = false;
+    bool _announcedConnected = false; // what the observer was told last
+    std::string _announcedReason;
     std::string _technology;
     ByteView _messageInProgress;
     std::shared_ptr<bool> _alive; // jobs on the queue hold it weakly: they end with the model
@@ -117,10 +122,10 @@ private:
     std::shared_ptr<RemoteMessagePort> _sendPort;
     std::unique_ptr<Timer> _displayUpdateTimer;
     bool _updated = false;
-    std::unique_ptr<LogGenerator> _logGenerator;
+    GeneratorSlot _logGenerator;
     DictionaryRef _state;
     NodeRef _nodes;
-    std::unique_ptr<PathIndex> _nodesByPath;
+    std::unique_ptr<PathIndex> _nodesByPath; // set and cleared together with the tree
 };
 
 } // namespace spectrel

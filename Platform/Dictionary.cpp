@@ -1,5 +1,7 @@
 #include "Platform/Dictionary.h"
 
+#include "Platform/List.h"
+
 namespace spectrel {
 
 namespace {
@@ -133,6 +135,15 @@ DictionaryRef Dictionary::copy() const
     auto copied = make();
     copied->_entries = _entries;
     return copied;
+}
+
+Value copyTopLevel(const Value& value)
+{
+    if (const auto& dictionary = value.dictionary())
+        return dictionary->copy();
+    if (const auto& list = value.list())
+        return list->copy();
+    return value;
 }
 
 } // namespace spectrel

@@ -66,4 +66,7 @@ private:
     mutable std::unique_ptr<Index> _index; // positions in key order, only while large
 };
 
+/// A container with the same top level, what is inside staying shared; any other value as it is.
+Value copyTopLevel(const Value& value);
+
 } // namespace spectrel

@@ -1,0 +1,67 @@
+#pragma once
+
+#include "LogGenerator/Template/ClassDictionary.h"
+#include "LogGenerator/Template/RecordView.h"
+#include "Platform/List.h"
+#include "Platform/Value.h"
+
+#include <cstdint>
+#include <string_view>
+#include <vector>
+
+namespace spectrel {
+
+/// Added to the 16-bit code of a record of the extra stream (type byte 0xFF).
+constexpr std::uint32_t ExtraStream = 0xFF0000;
+
+/// A section: decodes the records of a few log codes into its own node of the display dictionary.
+///
+/// A concrete section's constructor takes the index's two dictionaries and calls `enterInto` with them.
+class Base {
+public:
+    virtual ~Base() = default;
+    Base(const Base&) = delete;
+    Base& operator=(const Base&) = delete;
+
+    /// The key under which the section's subtree stands in the template.
+    virtual std::string_view getSectionName() const = 0;
+    /// The log codes that the section wants, extra-stream codes with 0xFF0000 added. A code listed twice is delivered
+    /// twice.
+    virtual std::vector<std::uint32_t> getLogCodeArray() const = 0;
+    /// One whole record, header included, of a code that the section subscribed to.
+    virtual void updateWithData(RecordView record, std::uint32_t logCode) = 0;
+
+    /// Binds the section to its node of the current display and logs its name.
+    void updateSectionRef(Value node);
+    /// Subscribes the section to its codes, in their order, and logs their number.
+    void updateLogCodeDict(CodeDictionary& codeDict);
+
+    /// Empties a displayed list under `ArrayLock`.
+    static void clearElementsInArray(List& array);
+    /// Refills a displayed list under `ArrayLock`, so that no half-filled one is ever shown.
+    static void replaceArray(List& array, const List& elements);
+
+    /// Energy ratio in whole decibels.
+    ///
+    /// Units:  `ratio` is linear, 524288 (2^19) being 0 dB; the result is in dB, -31 to 0.
+    /// Shape:  the first rung of a descending ladder that `ratio` exceeds.
+    /// Errors: none. 705 and below give 0, the same as full scale: kept on purpose.
+    /// Source: 10*log10(ratio / 2^19) rounded down; the lower rungs drift off the curve and stay so.
+    static std::int16_t lookUpECNO(std::uint32_t ratio);
+
+protected:
+    Base() = default;
+    void enterInto(ClassDictionary& dict, CodeDictionary& codeDict);
+
+    /// Keyed stores into the section's dictionary; silently lost while there is none.
+    void store(std::string_view key, std::string_view text);
+    void store(std::string_view key, const Value& value);
+    void removeKey(std::string_view key);
+
+    /// "Received an unknown log message: %d", priority 3.
+    static void logUnknownMessage(std::uint32_t logCode);
+
+    Value sectionRef; // a dictionary or a list of the current display; absent until the display is built
+};
+
+} // namespace spectrel

@@ -1,0 +1,40 @@
+#include "Monitor/Snapshot.h"
+
+#include "Platform/Dictionary.h"
+#include "Platform/PropertyList.h"
+
+#include <filesystem>
+#include <system_error>
+
+namespace spectrel {
+
+DictionaryRef makeSnapshot(Moment openedAt, ListRef saveContents, const std::optional<std::string>& description)
+{
+    auto snapshot = Dictionary::make({ { "Timestamp", defaultDateForm(openedAt) } });
+    // The first absent value ends the dictionary.
+    if (!saveContents)
+        return snapshot;
+    snapshot->set("Data", saveContents);
+    if (description)
+        snapshot->set("Description", *description);
+    return snapshot;
+}
+
+std::string snapshotPath(const std::string& directory, Moment savedAt)
+{
+    const auto seconds = std::chrono::floor<std::chrono::seconds>(savedAt).time_since_epoch().count();
+    return directory + "/SpectrelSnapshot-" + std::to_string(seconds) + ".spectrel";
+}
+
+bool writeSnapshot(const DictionaryRef& snapshot, const std::string& path, std::string& reason)
+{
+    std::error_code error;
+    std::filesystem::create_directories(std::filesystem::path(path).parent_path(), error);
+    if (error) {
+        reason = error.message();
+        return false;
+    }
+    return writePropertyListToFile(snapshot, path, reason);
+}
+
+} // namespace spectrel

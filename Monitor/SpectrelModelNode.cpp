@@ -1,0 +1,87 @@
+#include "Monitor/SpectrelModelNode.h"
+
+#include "LogGenerator/Template/ArrayLock.h"
+#include "Monitor/DisplayOrder.h"
+#include "Platform/List.h"
+
+namespace spectrel {
+
+namespace {
+
+constexpr const char* RootName = "Spectrel";
+constexpr const char* RootPath = "/";
+constexpr const char* UnknownValue = "(unknown)";
+
+/// Builds the node of one value after all its descendants, so that of two nodes with one path the later stays.
+class TreeBuilder {
+public:
+    explicit TreeBuilder(PathIndex& index)
+        : _index(index)
+    {
+    }
+
+    NodeRef build(std::string name, const Value& value, const std::string& path)
+    {
+        NodeRef node;
+        if (const auto* text = value.string())
+            node = std::make_shared<SpectrelModelLeafNode>(std::move(name), *text);
+        else if (const auto& dictionary = value.dictionary())
+            node = std::make_shared<SpectrelModelTreeNode>(std::move(name), childrenOf(*dictionary, path));
+        else if (const auto& list = value.list())
+            node = std::make_shared<SpectrelModelTreeNode>(std::move(name), childrenOf(*list, path));
+        else
+            node = std::make_shared<SpectrelModelLeafNode>(std::move(name), UnknownValue);
+        _index[path] = node;
+        return node;
+    }
+
+private:
+    NodeList childrenOf(const Dictionary& dictionary, const std::string& path)
+    {
+        NodeList children;
+        children.reserve(dictionary.count());
+        forEachDisplayChild(dictionary, [&](std::string_view name, const Value& value) {
+            children.push_back(build(std::string(name), value, pathByAppending(path, name)));
+        });
+        return children;
+    }
+
+    NodeList childrenOf(const List& list, const std::string& path)
+    {
+        NodeList children;
+        children.reserve(list.count());
+        ArrayLock::lockArray(); // sections may be filling the same list
+        for (const Value& element : list.elements()) {
+            std::string name = std::to_string(children.size());
+            const std::string childPath = pathByAppending(path, name);
+            children.push_back(build(std::move(name), element, childPath));
+        }
+        ArrayLock::unlockArray();
+        return children;
+    }
+
+    PathIndex& _index;
+};
+
+} // namespace
+
+std::string pathByAppending(std::string_view path, std::string_view component)
+{
+    component.remove_prefix(std::min(component.find_first_not_of('/'), component.size()));
+    std::string joined;
+    joined.reserve(path.size() + 1 + component.size());
+    joined = path;
+    if (component.empty())
+        return joined;
+    if (!joined.ends_with('/'))
+        joined += '/';
+    joined += component;
+    return joined;
+}
+
+NodeRef SpectrelModelNode::makeTreeFromObject(const Value& display, PathIndex& pathDictionary)
+{
+    return TreeBuilder(pathDictionary).build(RootName, display, RootPath);
+}
+
+} // namespace spectrel

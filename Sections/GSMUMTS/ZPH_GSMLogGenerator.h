@@ -1,0 +1,17 @@
+#pragma once
+
+#include "LogGenerator/Template/ZPHLogGenerator2.h"
+
+namespace spectrel {
+
+/// GSM/UMTS: template "ZPH_GSM".
+class ZPH_GSMLogGenerator final : public ZPHLogGenerator2 {
+public:
+    ZPH_GSMLogGenerator();
+    ~ZPH_GSMLogGenerator() override;
+
+    static std::unique_ptr<ZPH_GSMLogGenerator> generator();
+    std::string_view className() const override;
+};
+
+} // namespace spectrel

@@ -1,0 +1,17 @@
+#pragma once
+
+#include "LogGenerator/Template/ZPHLogGenerator2.h"
+
+namespace spectrel {
+
+/// UTRAN: the template is the first property-list resource whose path contains "UTRAN", in any case. Without one the
+/// generator stays uninitialised: it asks for no codes, routes no record and builds no display.
+class UTRANLogGenerator final : public ZPHLogGenerator2 {
+public:
+    UTRANLogGenerator();
+
+    static std::unique_ptr<UTRANLogGenerator> generator();
+    std::string_view className() const override;
+};
+
+} // namespace spectrel
