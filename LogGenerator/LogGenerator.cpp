@@ -40,6 +40,8 @@ void LogGenerator::init()
 
 void LogGenerator::takeOver(LogGenerator*, Dictionary&) { }
 
+void LogGenerator::discardRawMessages() { }
+
 void LogGenerator::keepRawMessage(ByteView) { }
 
 void LogGenerator::updateHistoryInState(Dictionary& state)

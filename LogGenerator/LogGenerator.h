@@ -43,6 +43,8 @@ public:
     /// Goes on where a predecessor of the same class ended: with the display that the state holds and, when the
     /// predecessor is still there (not null), with the raw messages that no display build has taken yet.
     virtual void takeOver(LogGenerator* predecessor, Dictionary& state);
+    /// Forgets the raw messages that no display build has taken yet, for programs that save no snapshot.
+    virtual void discardRawMessages();
     /// Keeps a message that could not be applied among the raw messages, for a snapshot written at the program's end.
     virtual void keepRawMessage(ByteView data);
 

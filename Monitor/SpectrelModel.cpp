@@ -224,8 +224,8 @@ void SpectrelModel::handleMessage(std::int32_t id, ByteView body) noexcept
     // Nothing catches what a record raises: the process ends here, and the terminate handler finds the message.
     if (id != LogMessageId)
         return;
-    _observer.modelDidReceive(body);
-    updateWithData(body);
+    if (_observer.modelShouldApply(body))
+        updateWithData(body);
 }
 
 void SpectrelModel::handleInvalidation(const LocalMessagePort* port)

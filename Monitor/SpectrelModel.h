@@ -25,8 +25,11 @@ public:
     virtual void updateViewControllerFromModel() = 0;
     /// The session was opened or lost, or the reason why there is none has changed.
     virtual void sessionDidChange() { }
-    /// One inbound message body, before it is applied.
-    virtual void modelDidReceive(ByteView) { }
+    /// One inbound message body. False keeps it from being applied: a recorder wants the bytes alone.
+    virtual bool modelShouldApply(ByteView)
+    {
+        return true;
+    }
 };
 
 /// The monitor model: the log channel to the telephony service, the state that the generator fills, and the display

@@ -38,6 +38,12 @@ void ZPHLogGenerator::takeOver(LogGenerator* predecessor, Dictionary&)
         _binData = std::move(earlier->_binData);
 }
 
+void ZPHLogGenerator::discardRawMessages()
+{
+    if (_binData)
+        _binData->clear();
+}
+
 void ZPHLogGenerator::keepRawMessage(ByteView data)
 {
     if (_binData)

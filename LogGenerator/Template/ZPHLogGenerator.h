@@ -13,6 +13,7 @@ class ZPHLogGenerator : public LogGenerator {
 public:
     ListRef getSaveContentsFromState(const Dictionary& state) override;
     void takeOver(LogGenerator* predecessor, Dictionary& state) override;
+    void discardRawMessages() override;
     void keepRawMessage(ByteView data) override;
 
     /// The version-report record, then every history entry's raw messages without their very first byte. Null when the

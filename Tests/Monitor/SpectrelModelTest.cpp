@@ -30,13 +30,15 @@ public:
     {
         news += (model->isConnected() ? "connected" : "lost") + std::string(":") + model->lostReason() + "\n";
     }
-    void modelDidReceive(ByteView body) override
+    bool modelShouldApply(ByteView body) override
     {
         received += body.size();
+        return applies;
     }
     SpectrelModel* model = nullptr;
     int reloads = 0;
     std::size_t received = 0;
+    bool applies = true;
     std::string news;
 };
 
@@ -425,6 +427,15 @@ TEST_F(SpectrelModelTest, ManyMessagesInATickYieldOneRebuild)
     loop.advance(2s);
     EXPECT_EQ(observer.reloads, 1);
     EXPECT_EQ(historyCount(), 1u);
+}
+
+TEST_F(SpectrelModelTest, MessageThatTheObserverKeepsIsNotApplied)
+{
+    model.startMonitor();
+    observer.applies = false;
+    receive(servingCell());
+    EXPECT_EQ(observer.received, 38u);
+    EXPECT_EQ(model.state().count(), 0u);
 }
 
 TEST_F(SpectrelModelTest, SecondTickAfterOneMessageDoesNothing)
