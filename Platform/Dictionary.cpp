@@ -2,6 +2,8 @@
 
 #include "Platform/List.h"
 
+#include <set>
+
 namespace spectrel {
 
 namespace {
@@ -12,12 +14,10 @@ constexpr std::size_t NotFound = static_cast<std::size_t>(-1);
 /// Above this many entries a search goes through the sorted index; below, a walk is faster.
 constexpr std::size_t LargestWalked = 48;
 
-} // namespace
-
 /// Orders positions by the keys they hold; a text finds its position without being copied.
-struct Dictionary::ByKey {
+struct ByKey {
     using is_transparent = void;
-    const std::vector<Entry>* entries;
+    const std::vector<Dictionary::Entry>* entries;
 
     bool operator()(std::size_t left, std::size_t right) const
     {
@@ -32,6 +32,14 @@ struct Dictionary::ByKey {
         return left < (*entries)[right].key;
     }
 };
+
+} // namespace
+
+struct Dictionary::Index : std::set<std::size_t, ByKey> {
+    using set::set;
+};
+
+Dictionary::Dictionary() = default;
 
 Dictionary::Dictionary(std::initializer_list<Entry> entries)
 {

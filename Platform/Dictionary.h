@@ -5,7 +5,6 @@
 #include <cstddef>
 #include <initializer_list>
 #include <memory>
-#include <set>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -23,7 +22,7 @@ public:
         Value value;
     };
 
-    Dictionary() = default;
+    Dictionary();
     Dictionary(std::initializer_list<Entry> entries);
     Dictionary(const Dictionary&) = delete;
     Dictionary& operator=(const Dictionary&) = delete;
@@ -55,8 +54,7 @@ public:
     DictionaryRef copy() const;
 
 private:
-    struct ByKey;
-    using Index = std::set<std::size_t, ByKey>;
+    struct Index;
 
     std::size_t positionOf(std::string_view key) const;
     std::size_t append(std::string_view key, Value value);
