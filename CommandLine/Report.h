@@ -1,0 +1,23 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+
+#include <exception>
+#include <string>
+#include <string_view>
+
+namespace spectrel {
+
+/// "spectrel: LINE" on standard error.
+void report(std::string_view line);
+
+/// The log code of a message as it is routed, "code 0xB0C2" or "code 0xFF0001"; says so when it has none.
+std::string codeText(ByteView message);
+
+/// The exception's class, readable, with what it says of itself where that tells more.
+std::string exceptionName(const std::exception& exception);
+
+/// Two digits a byte.
+std::string hexadecimal(ByteView bytes);
+
+} // namespace spectrel
