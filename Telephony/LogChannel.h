@@ -2,6 +2,7 @@
 
 #include "Platform/MessagePort.h"
 #include "Platform/RunLoop.h"
+#include "Platform/Value.h"
 #include "Telephony/LogSource.h"
 
 #include <cstdint>

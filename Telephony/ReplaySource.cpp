@@ -21,8 +21,9 @@ void tell(const std::string& line)
 /// One channel's way through the files.
 class ReplaySource::Stream final : public LogStream {
 public:
-    Stream(RunLoop& runLoop, const ReplayOptions& options, MessageSink& sink)
+    Stream(RunLoop& runLoop, const Clock& clock, const ReplayOptions& options, MessageSink& sink)
         : _runLoop(runLoop)
+        , _clock(clock)
         , _options(options)
         , _sink(sink)
         , _alive(std::make_shared<bool>(true))
@@ -73,10 +74,10 @@ private:
             return {};
         if (!_origin) {
             _origin = _message->time;
-            _startedAt = std::chrono::steady_clock::now();
+            _startedAt = _clock.now();
         }
         const std::chrono::duration<double> place = _message->time - *_origin;
-        const std::chrono::duration<double> played = std::chrono::steady_clock::now() - _startedAt;
+        const std::chrono::duration<double> played = _clock.now() - _startedAt;
         return std::chrono::duration_cast<std::chrono::nanoseconds>(place / _options.speed - played);
     }
 
@@ -116,6 +117,7 @@ private:
     }
 
     RunLoop& _runLoop;
+    const Clock& _clock;
     const ReplayOptions& _options;
     MessageSink& _sink;
     std::shared_ptr<bool> _alive;
@@ -123,19 +125,21 @@ private:
     std::size_t _file = 0; // the next one to open
     std::optional<RecordedMessage> _message; // read, not delivered yet
     std::optional<Moment> _origin;
-    std::chrono::steady_clock::time_point _startedAt;
+    Moment _startedAt{};
     bool _isStopped = false; // the client had no room
     bool _hasPlayed = false; // since the last rewind
 };
 
-ReplaySource::ReplaySource(RunLoop& runLoop, ReplayOptions options, Technology technology)
+ReplaySource::ReplaySource(RunLoop& runLoop, const Clock& clock, ReplayOptions options, Technology technology)
     : _runLoop(runLoop)
+    , _clock(clock)
     , _options(std::move(options))
     , _technology(technology)
 {
 }
 
-std::unique_ptr<ReplaySource> ReplaySource::open(RunLoop& runLoop, ReplayOptions options, std::string& reason)
+std::unique_ptr<ReplaySource> ReplaySource::open(
+    RunLoop& runLoop, const Clock& clock, ReplayOptions options, std::string& reason)
 {
     std::optional<Technology> technology;
     for (const std::string& file : options.files) {
@@ -160,12 +164,12 @@ std::unique_ptr<ReplaySource> ReplaySource::open(RunLoop& runLoop, ReplayOptions
         reason = "no file to replay";
         return nullptr;
     }
-    return std::unique_ptr<ReplaySource>(new ReplaySource(runLoop, std::move(options), *technology));
+    return std::unique_ptr<ReplaySource>(new ReplaySource(runLoop, clock, std::move(options), *technology));
 }
 
 std::unique_ptr<LogStream> ReplaySource::start(MessageSink& sink)
 {
-    return std::make_unique<Stream>(_runLoop, _options, sink);
+    return std::make_unique<Stream>(_runLoop, _clock, _options, sink);
 }
 
 } // namespace spectrel

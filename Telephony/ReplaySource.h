@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Platform/Clock.h"
 #include "Platform/Recording.h"
 #include "Platform/RunLoop.h"
 #include "Telephony/LogSource.h"
@@ -25,7 +26,8 @@ class ReplaySource final : public LogSource {
 public:
     /// Null when a file cannot be read, does not tell its technology, or tells another one than the first; `reason`
     /// names the file.
-    static std::unique_ptr<ReplaySource> open(RunLoop& runLoop, ReplayOptions options, std::string& reason);
+    static std::unique_ptr<ReplaySource> open(
+        RunLoop& runLoop, const Clock& clock, ReplayOptions options, std::string& reason);
 
     Technology technology() const override
     {
@@ -35,9 +37,10 @@ public:
 
 private:
     class Stream;
-    ReplaySource(RunLoop& runLoop, ReplayOptions options, Technology technology);
+    ReplaySource(RunLoop& runLoop, const Clock& clock, ReplayOptions options, Technology technology);
 
     RunLoop& _runLoop;
+    const Clock& _clock;
     ReplayOptions _options;
     Technology _technology;
 };

@@ -79,7 +79,7 @@ int fail(const std::string& line)
 std::unique_ptr<LogSource> makeSource(Options& options, RunLoop& runLoop, const Clock& clock, std::string& reason)
 {
     if (options.simulate.empty())
-        return ReplaySource::open(runLoop, std::move(options.replay), reason);
+        return ReplaySource::open(runLoop, clock, std::move(options.replay), reason);
     if (options.simulate == technologyName(Technology::LTE))
         return std::make_unique<SimulatorSource>(runLoop, clock, options.seed, options.rate);
     reason = "there is no simulated baseband of technology " + options.simulate + " yet";
