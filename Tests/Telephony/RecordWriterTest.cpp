@@ -1,5 +1,7 @@
 #include "Telephony/Encoders/RecordWriter.h"
 
+#include "Platform/Dictionary.h"
+#include "Platform/List.h"
 #include "Platform/PropertyList.h"
 #include "Telephony/Encoders/LTERecords.h"
 #include "Telephony/Encoders/PropertyListRecords.h"

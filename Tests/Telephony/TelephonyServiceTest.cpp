@@ -1,6 +1,7 @@
 #include "Telephony/TelephonyService.h"
 
 #include "Platform/Dictionary.h"
+#include "Platform/List.h"
 #include "Platform/PropertyList.h"
 #include "Platform/TelephonyConstants.h"
 #include "Platform/TelephonyProtocol.h"
