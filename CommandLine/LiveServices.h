@@ -3,6 +3,7 @@
 #include "Monitor/SpectrelModel.h"
 #include "Platform/Qt/QtClock.h"
 #include "Platform/Qt/QtRunLoop.h"
+#include "Platform/Qt/TerminationSignals.h"
 #include "Platform/Sockets/SocketMessagePorts.h"
 #include "Platform/Sockets/SocketTelephonyServer.h"
 
@@ -11,11 +12,13 @@
 namespace spectrel {
 
 /// What every program with a live session stands on: the run loop, the device's clock (installed), the message ports
-/// and the telephony service.
+/// and the telephony service. The loop ends when the program is interrupted.
 class LiveServices {
 public:
     LiveServices();
     ~LiveServices();
+    LiveServices(const LiveServices&) = delete;
+    LiveServices& operator=(const LiveServices&) = delete;
 
     QtRunLoop& runLoop()
     {
@@ -33,19 +36,7 @@ private:
     QtClock _clock;
     SocketMessagePorts _ports;
     SocketTelephonyServer _telephony;
-};
-
-/// Ends the run loop when the program is interrupted (SIGINT, SIGTERM, SIGHUP) while this lives.
-class StopSignals {
-public:
-    explicit StopSignals(QtRunLoop& runLoop);
-    ~StopSignals();
-    StopSignals(const StopSignals&) = delete;
-    StopSignals& operator=(const StopSignals&) = delete;
-
-private:
-    struct Notifier;
-    std::unique_ptr<Notifier> _notifier;
+    TerminationSignals _terminationSignals;
 };
 
 } // namespace spectrel

@@ -23,10 +23,12 @@ public:
 
     int run()
     {
-        const StopSignals stopSignals(_live.runLoop());
+        if (const std::filesystem::path folder = std::filesystem::path(_options.file).parent_path();
+            _options.file != "-" && ::access(folder.empty() ? "." : folder.c_str(), W_OK) != 0)
+            return fail(_options.file + ": " + std::strerror(errno)), _status;
         _live.runLoop().async([this] { _model.restartMonitor(); });
         if (_options.duration)
-            _live.runLoop().after(*_options.duration, [this] { _live.runLoop().stop(); });
+            _live.runLoop().after(*_options.duration, [this] { _live.runLoop().quit(); });
         _live.runLoop().run();
         _model.destroyPorts();
         flush();
@@ -57,7 +59,7 @@ private:
     {
         report(line);
         _status = 1;
-        _live.runLoop().stop();
+        _live.runLoop().quit();
     }
 
     /// The capture's link type tells the technology, so another technology needs another file.
@@ -103,7 +105,7 @@ private:
             _live.runLoop().after(FlushDelay, [this] { flush(); });
         }
         if (++_messages == _options.count)
-            _live.runLoop().stop();
+            _live.runLoop().quit();
     }
 
     void flush()

@@ -26,10 +26,9 @@ public:
     int run()
     {
         Ending::install(_model, {});
-        const StopSignals stopSignals(_live.runLoop());
         _live.runLoop().async([this] { _model.restartMonitor(); });
         if (_options.duration)
-            _live.runLoop().after(*_options.duration, [this] { _live.runLoop().stop(); });
+            _live.runLoop().after(*_options.duration, [this] { _live.runLoop().quit(); });
         _output.flush();
         _live.runLoop().run();
         return _status;
@@ -46,10 +45,10 @@ public:
         if (!_output.flush()) {
             report("standard output: cannot be written");
             _status = 1;
-            _live.runLoop().stop();
+            _live.runLoop().quit();
         }
         if (++_refreshes == _options.count)
-            _live.runLoop().stop();
+            _live.runLoop().quit();
     }
 
     void sessionDidChange() override

@@ -3,7 +3,7 @@
 #include "Platform/Environment.h"
 #include "Platform/Qt/QtClock.h"
 #include "Platform/Qt/QtRunLoop.h"
-#include "Platform/Qt/StopSignals.h"
+#include "Platform/Qt/TerminationSignals.h"
 #include "Platform/Sockets/SocketMessagePorts.h"
 #include "Telephony/ReplaySource.h"
 #include "Telephony/Simulator/SimulatorSource.h"
@@ -99,7 +99,7 @@ int serve(Options& options)
     if (!service.start())
         return fail("cannot take the telephony service's port in " + Places::portDirectory()
             + ": another service runs there, or the folder is not this user's own");
-    const StopSignals stopSignals([&runLoop] { runLoop.stop(); });
+    const TerminationSignals terminationSignals([&runLoop](int) { runLoop.quit(); });
     if (options.readyDescriptor >= 0) {
         if (::write(options.readyDescriptor, "ready\n", 6) != 6)
             return fail("--ready-fd: the descriptor cannot be written");
