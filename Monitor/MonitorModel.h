@@ -1,0 +1,28 @@
+#pragma once
+
+#include "Monitor/SpectrelModelNode.h"
+#include "Platform/List.h"
+
+#include <string>
+#include <string_view>
+
+namespace spectrel {
+
+/// What the screens ask of a model: the live session's, or one that plays a recording.
+class MonitorModel {
+public:
+    virtual ~MonitorModel() = default;
+
+    virtual bool isConnected() const = 0;
+    virtual void restartMonitor() = 0;
+    /// Why there is no session, for people; empty while there is one or nothing is known.
+    virtual const std::string& lostReason() const = 0;
+
+    /// The root of the current tree, built at need; null when there is none.
+    virtual NodeRef topLevelNodes() = 0;
+    virtual NodeRef nodeAtPath(std::string_view path) = 0;
+    /// What a snapshot saves; null when there is nothing that could tell.
+    virtual ListRef getSaveContents() = 0;
+};
+
+} // namespace spectrel
