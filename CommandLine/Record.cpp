@@ -4,7 +4,10 @@
 #include "CommandLine/Report.h"
 #include "Platform/Recording.h"
 
+#include <cerrno>
+#include <cstring>
 #include <filesystem>
+#include <unistd.h>
 
 namespace spectrel {
 
@@ -24,8 +27,10 @@ public:
     int run()
     {
         if (const std::filesystem::path folder = std::filesystem::path(_options.file).parent_path();
-            _options.file != "-" && ::access(folder.empty() ? "." : folder.c_str(), W_OK) != 0)
-            return fail(_options.file + ": " + std::strerror(errno)), _status;
+            _options.file != "-" && ::access(folder.empty() ? "." : folder.c_str(), W_OK) != 0) {
+            fail(_options.file + ": " + std::strerror(errno));
+            return _status;
+        }
         _live.runLoop().async([this] { _model.restartMonitor(); });
         if (_options.duration)
             _live.runLoop().after(*_options.duration, [this] { _live.runLoop().quit(); });
