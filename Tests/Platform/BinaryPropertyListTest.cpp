@@ -19,7 +19,7 @@ std::string bigEndian(std::uint64_t number, std::size_t width)
 {
     std::string bytes;
     for (std::size_t i = width; i > 0; --i)
-        bytes += static_cast<char>(number >> (8 * (i - 1)));
+        bytes += i > 8 ? char(0) : static_cast<char>(number >> (8 * (i - 1)));
     return bytes;
 }
 
