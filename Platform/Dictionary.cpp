@@ -37,6 +37,8 @@ Dictionary::Dictionary(std::initializer_list<Entry> entries)
         set(entry.key, entry.value);
 }
 
+Dictionary::Dictionary() = default;
+
 Dictionary::~Dictionary() = default;
 
 DictionaryRef Dictionary::make(std::initializer_list<Entry> entries)

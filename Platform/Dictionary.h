@@ -23,7 +23,7 @@ public:
         Value value;
     };
 
-    Dictionary() = default;
+    Dictionary();
     Dictionary(std::initializer_list<Entry> entries);
     Dictionary(const Dictionary&) = delete;
     Dictionary& operator=(const Dictionary&) = delete;
