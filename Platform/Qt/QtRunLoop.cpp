@@ -1,7 +1,6 @@
 #include "Platform/Qt/QtRunLoop.h"
 
 #include <QCoreApplication>
-#include <QDeadlineTimer>
 #include <QSocketNotifier>
 #include <QTimer>
 
@@ -131,12 +130,14 @@ void QtRunLoop::quit(int status)
 
 bool QtRunLoop::runUntil(const std::function<bool()>& done, std::chrono::nanoseconds limit)
 {
-    const QDeadlineTimer deadline(limit, Qt::PreciseTimer);
-    QTimer atLimit; // only wakes the loop up
+    bool isOver = false;
+    QTimer atLimit;
     atLimit.setSingleShot(true);
+    atLimit.setTimerType(Qt::PreciseTimer);
+    QObject::connect(&atLimit, &QTimer::timeout, [&isOver] { isOver = true; });
     atLimit.start(milliseconds(limit));
     while (!done()) {
-        if (deadline.hasExpired())
+        if (isOver)
             return false;
         QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
     }

@@ -59,6 +59,7 @@ class Place(unittest.TestCase):
         self.folder = tempfile.mkdtemp(prefix="spectrel-test-")
         self.addCleanup(shutil.rmtree, self.folder, ignore_errors=True)
         self.processes = []
+        self.gathered = {}  # what a process has printed beyond the lines asked for
         self.addCleanup(self.end_processes)
         self.environment = {
             **{key: value for key, value in os.environ.items() if not key.startswith(("SPECTREL_PORT", "XDG_"))},
@@ -109,9 +110,19 @@ class Place(unittest.TestCase):
 
     def next_line(self, process):
         """The next line of a process's standard output."""
-        readable, _, _ = select.select([process.stdout], [], [], WAIT)
-        self.assertTrue(readable, "no further line came")
-        return process.stdout.readline()
+        gathered = self.gathered.setdefault(process, b"")
+        while b"\n" not in gathered:
+            readable, _, _ = select.select([process.stdout], [], [], WAIT)
+            data = os.read(process.stdout.fileno(), 65536) if readable else b""
+            self.assertTrue(data, "no further line came")
+            gathered += data
+        line, _, self.gathered[process] = gathered.partition(b"\n")
+        return line.decode() + "\n"
+
+    def last_line(self, process):
+        """The last line of a process that has been told to end."""
+        *_, last = (self.gathered.get(process, b"").decode() + process.stdout.read()).splitlines()
+        return last
 
     def wait_until(self, condition, what):
         end = time.monotonic() + WAIT

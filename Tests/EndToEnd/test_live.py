@@ -5,6 +5,7 @@ import json
 import os
 import plistlib
 import signal
+import subprocess
 import unittest
 
 from harness import Place, capture, record, serving_cell, sim_files
@@ -29,7 +30,7 @@ class Watch(Place):
 
     def test_without_terminal_and_display_the_program_watches(self):
         self.start_service("--replay", self.write("a.pcap", capture([serving_cell(5)])), "--speed", "0")
-        process = self.start("spectrel", stdout=-1, stderr=-1)
+        process = self.start("spectrel", stdout=subprocess.PIPE, stderr=subprocess.PIPE)
         self.assertEqual(self.next_line(process), "Serving Cell Info\n")
         self.assertEqual(self.next_line(process), "  Physical Cell ID: 5\n")
         process.send_signal(signal.SIGINT)
@@ -119,23 +120,24 @@ class Record(Place):
         self.assertEqual(decoded[0], decoded[1])
 
     def test_recording_the_simulator_beside_a_watch_ends_in_the_same_values(self):
-        self.start_service("--simulate", "lte")
+        service = self.start_service("--simulate", "lte")
+        recording = self.start("spectrel", "record", self.path("r.pcap"), stderr=subprocess.PIPE)
+        self.wait_until(lambda: os.path.exists(self.path("r.pcap")), "the recording did not begin")
         watching = self.start_watch("--format", "json")
-        recording = self.start("spectrel", "record", self.path("r.pcap"), stderr=-1)
         for _ in range(3):
             self.next_line(watching)
-        for process in self.processes:
-            process.send_signal(signal.SIGSTOP if process is self.processes[0] else signal.SIGCONT)
-        *_, last = [self.next_line(watching)]
-        recording.send_signal(signal.SIGINT)
+        service.kill()
+        for process in (watching, recording):
+            self.assertIn("Connecting...", process.stderr.readline())
+            process.send_signal(signal.SIGINT)
         self.assertEqual(recording.wait(), 0)
-        self.processes[0].send_signal(signal.SIGCONT)
+        shown = json.loads(self.last_line(watching))
         decoded = json.loads(self.run_spectrel("decode", "--format", "json", self.path("r.pcap")).stdout)
-        self.assertEqual(decoded["Serving Cell Info"], json.loads(last)["Serving Cell Info"])
+        self.assertEqual(decoded, shown)
 
     def test_interrupted_recording_is_whole(self):
         self.start_service("--simulate", "lte")
-        recording = self.start("spectrel", "record", self.path("r.pcap"), stderr=-1)
+        recording = self.start("spectrel", "record", self.path("r.pcap"), stderr=subprocess.PIPE)
         self.wait_until(lambda: os.path.exists(self.path("r.pcap")) and os.path.getsize(self.path("r.pcap")) > 2000,
                         "nothing was recorded")
         recording.send_signal(signal.SIGTERM)

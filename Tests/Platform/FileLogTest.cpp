@@ -1,5 +1,5 @@
 #include "Platform/Syslog/FileLog.h"
-#include "Tests/Platform/TemporaryFolder.h"
+#include "Tests/Platform/ScratchFolder.h"
 
 #include <fstream>
 #include <gmock/gmock.h>
@@ -19,8 +19,8 @@ protected:
         return { std::istreambuf_iterator<char>(file), {} };
     }
 
-    TemporaryFolder folder;
-    std::string path = folder.path() + "/log";
+    ScratchFolder folder;
+    std::string path = folder.path().string() + "/log";
     std::string reason;
 };
 
@@ -57,8 +57,8 @@ TEST_F(FileLogTest, BufferedLinesAreThereAfterFlush)
 
 TEST_F(FileLogTest, FileThatCannotBeMadeTellsWhy)
 {
-    EXPECT_EQ(FileLog::create(folder.path() + "/no/log", FileLog::Writing::Buffered, reason), nullptr);
-    EXPECT_EQ(reason, folder.path() + "/no/log: No such file or directory");
+    EXPECT_EQ(FileLog::create(folder.path().string() + "/no/log", FileLog::Writing::Buffered, reason), nullptr);
+    EXPECT_EQ(reason, folder.path().string() + "/no/log: No such file or directory");
 }
 
 TEST_F(FileLogTest, FullDeviceIsReportedByFlush)

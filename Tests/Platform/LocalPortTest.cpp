@@ -78,7 +78,7 @@ TEST_F(LocalPortTest, StaleNameOfAKilledProcessIsTakenOver)
     });
     ASSERT_TRUE(holder.await());
     holder.kill();
-    EXPECT_EQ(::access((folder.path() + "/" + Name).c_str(), F_OK), 0) << "nothing stale to take over";
+    EXPECT_EQ(::access((folder.path().string() + "/" + Name).c_str(), F_OK), 0) << "nothing stale to take over";
     const auto local = serve(keeping());
     ASSERT_NE(local, nullptr);
     send(*ports.createRemote(Name), 0, "to the heir");
@@ -117,7 +117,7 @@ TEST_F(LocalPortTest, InvalidatedNameIsFreeAtOnce)
     EXPECT_EQ(elsewhere.createLocal(Name, keeping()).port, nullptr);
     local->invalidate();
     EXPECT_FALSE(local->isValid());
-    EXPECT_TRUE(std::filesystem::is_empty(folder.path()));
+    EXPECT_TRUE(std::filesystem::is_empty(folder.path().string()));
     EXPECT_NE(elsewhere.createLocal(Name, keeping()).port, nullptr);
 }
 
@@ -208,7 +208,7 @@ TEST_F(LocalPortTest, RequestIsAnsweredWithItsIdAndSequenceNumber)
         return Bytes{ 'y', 'e', 's' };
     });
     ForkedPeer asker([this](ForkedPeer&) {
-        const int socket = raw::connectTo(folder.path(), Name);
+        const int socket = raw::connectTo(folder.path().string(), Name);
         raw::send(socket, raw::packet(2, 7, 41, "question"));
         const bool isRight = raw::receive(socket) == raw::packet(3, 7, 41, "yes");
         raw::send(socket, raw::packet(1, 0, 0, isRight ? "right" : "wrong"));
@@ -222,7 +222,7 @@ TEST_F(LocalPortTest, RequestWithoutAnAnswerGetsAnEmptyReplyAndOneWayMessagesGet
 {
     const auto local = serve(keeping());
     ForkedPeer asker([this](ForkedPeer&) {
-        const int socket = raw::connectTo(folder.path(), Name);
+        const int socket = raw::connectTo(folder.path().string(), Name);
         raw::send(socket, raw::packet(1, 1, 1, "one-way"));
         raw::send(socket, raw::packet(2, 2, 2, "question"));
         const bool isRight = raw::receive(socket) == raw::packet(3, 2, 2, "");
@@ -240,7 +240,7 @@ TEST_F(LocalPortTest, AnswerThatIsTooLargeIsLoggedAndLeftEmpty)
         return Bytes(LargestMessage + 1);
     });
     ForkedPeer asker([this](ForkedPeer&) {
-        const int socket = raw::connectTo(folder.path(), Name);
+        const int socket = raw::connectTo(folder.path().string(), Name);
         raw::send(socket, raw::packet(2, 2, 2, "question"));
         raw::send(socket, raw::packet(1, 3, 3, raw::receive(socket) == raw::packet(3, 2, 2, "") ? "right" : "wrong"));
         return 0;
@@ -250,14 +250,14 @@ TEST_F(LocalPortTest, AnswerThatIsTooLargeIsLoggedAndLeftEmpty)
     EXPECT_EQ(log.takeLog(), "<3>Message port org.spectrel.Test: an answer of 262145 bytes is too large\n");
 }
 
-class GarbageTest : public LocalPortTest, public testing::WithParamInterface<std::string> { };
+class GarbageTest : public LocalPortTest, public testing::WithParamInterface<raw::NamedPacket> { };
 
 TEST_P(GarbageTest, EndsTheConnectionThatSentItAndHarmsNobodyElse)
 {
     const auto local = serve(keeping());
     const auto honest = ports.createRemote(Name);
-    const int stranger = raw::connectTo(folder.path(), Name);
-    ASSERT_TRUE(raw::send(stranger, GetParam()));
+    const int stranger = raw::connectTo(folder.path().string(), Name);
+    ASSERT_TRUE(raw::send(stranger, GetParam().bytes));
     raw::send(stranger, raw::packet(1, 9, 9, "after the garbage"));
     send(*honest, 0, "before");
     ASSERT_TRUE(turnUntilReceived(1));
@@ -272,16 +272,21 @@ TEST_P(GarbageTest, EndsTheConnectionThatSentItAndHarmsNobodyElse)
 }
 
 INSTANTIATE_TEST_SUITE_P(Packets, GarbageTest,
-    testing::Values("x", std::string("\x53\x01\x00\x00\x00\x00\x00\x00\x00\x00\x00", 11), raw::packet(1, 0, 0, ""),
-        raw::packet(2, 0, 0, ""), raw::packet(3, 0, 0, "a reply"), raw::packet(4, 0, 0, "no kind"),
-        raw::packet(0, 0, 0, "no kind"), "T" + raw::packet(1, 0, 0, "body").substr(1),
-        raw::packet(1, 0, 0, std::string(LargestMessage + 1, 'x'))));
+    testing::Values(raw::NamedPacket{ "one byte", "x" },
+        raw::NamedPacket{ "half a header", std::string("\x53\x01\0\0\0\0\0\0\0\0\0", 11) },
+        raw::NamedPacket{ "message without a body", raw::packet(1, 0, 0, "") },
+        raw::NamedPacket{ "request without a body", raw::packet(2, 0, 0, "") },
+        raw::NamedPacket{ "reply to nothing", raw::packet(3, 0, 0, "body") },
+        raw::NamedPacket{ "kind 0", raw::packet(0, 0, 0, "body") },
+        raw::NamedPacket{ "kind 4", raw::packet(4, 0, 0, "body") },
+        raw::NamedPacket{ "another mark", "T" + raw::packet(1, 0, 0, "body").substr(1) },
+        raw::NamedPacket{ "one byte too many", raw::packet(1, 0, 0, std::string(LargestMessage + 1, 'x')) }));
 
 TEST_F(LocalPortTest, EmptyPacketEndsItsConnectionOnly)
 {
     const auto local = serve(keeping());
     const auto honest = ports.createRemote(Name);
-    const int stranger = raw::connectTo(folder.path(), Name);
+    const int stranger = raw::connectTo(folder.path().string(), Name);
     ASSERT_EQ(::send(stranger, "", 0, MSG_NOSIGNAL), 0);
     raw::send(stranger, raw::packet(1, 9, 9, "after"));
     send(*honest, 0, "still here");
@@ -297,7 +302,7 @@ TEST_F(LocalPortTest, SendersBeyondTheBoundAreTurnedAwayUntilOneLeaves)
     const auto local = serve(keeping());
     std::vector<int> sockets;
     for (std::size_t i = 0; i < SocketLocalPort::MostConnections; ++i) {
-        sockets.push_back(raw::connectTo(folder.path(), Name));
+        sockets.push_back(raw::connectTo(folder.path().string(), Name));
         ASSERT_TRUE(raw::send(sockets.back(), raw::packet(1, 0, 0, "in")));
         ASSERT_TRUE(turnUntilReceived(i + 1));
     }
@@ -323,12 +328,12 @@ TEST_F(LocalPortTest, SenderOfAnotherUserIsTurnedAway)
     if (::geteuid() != 0)
         return; // only root can be somebody else for a moment
     const auto local = serve(keeping());
-    ::chmod(folder.path().c_str(), 0755);
-    ::chmod((folder.path() + "/" + Name).c_str(), 0777);
+    ::chmod(folder.path().string().c_str(), 0755);
+    ::chmod((folder.path().string() + "/" + Name).c_str(), 0777);
     ForkedPeer stranger([this](ForkedPeer&) {
         if (::setuid(65534) != 0)
             return 1;
-        const int socket = raw::connectTo(folder.path(), Name);
+        const int socket = raw::connectTo(folder.path().string(), Name);
         raw::send(socket, raw::packet(1, 0, 0, "let me in"));
         return raw::receive(socket).empty() ? 0 : 2;
     });
@@ -343,7 +348,7 @@ TEST_F(LocalPortTest, FolderOfSomebodyElseIsRefused)
 {
     std::string foreign = "/"; // root's, for an ordinary user
     if (::geteuid() == 0) {
-        foreign = folder.path() + "/foreign";
+        foreign = folder.path().string() + "/foreign";
         ASSERT_EQ(::mkdir(foreign.c_str(), 0700), 0);
         ASSERT_EQ(::chown(foreign.c_str(), 65534, 65534), 0);
     }
@@ -354,7 +359,7 @@ TEST_F(LocalPortTest, FolderOfSomebodyElseIsRefused)
 
 TEST_F(LocalPortTest, FolderIsMadeForThisUserAlone)
 {
-    const std::string nested = folder.path() + "/a/b";
+    const std::string nested = folder.path().string() + "/a/b";
     SocketMessagePorts made(nested);
     const auto local = made.createLocal(Name, keeping()).port;
     ASSERT_NE(local, nullptr);
@@ -390,7 +395,7 @@ TEST_F(LocalPortTest, EndlessFloodStarvesNeitherTimersNorOtherSenders)
         return std::nullopt;
     });
     ForkedPeer flooder([this](ForkedPeer&) {
-        const int socket = raw::connectTo(folder.path(), Name);
+        const int socket = raw::connectTo(folder.path().string(), Name);
         const auto message = raw::packet(1, 0, 0, "flood");
         while (raw::send(socket, message)) { }
         return 0;
@@ -413,7 +418,7 @@ TEST_F(LocalPortTest, FloodSlowsItsSenderAndNothingIsLost)
         return std::nullopt;
     });
     ForkedPeer sender([this](ForkedPeer& parent) {
-        const int socket = raw::connectTo(folder.path(), Name);
+        const int socket = raw::connectTo(folder.path().string(), Name);
         for (int i = 0; i < Count; ++i) {
             if (i == 10)
                 parent.signal();

@@ -3,7 +3,7 @@
 #include "Platform/Qt/QtRunLoop.h"
 #include "Platform/Sockets/SocketMessagePorts.h"
 #include "Tests/Fakes/LogRecorder.h"
-#include "Tests/Platform/TemporaryFolder.h"
+#include "Tests/Platform/ScratchFolder.h"
 
 #include <chrono>
 #include <gmock/gmock.h>
@@ -64,10 +64,10 @@ protected:
     }
 
     LogRecorder log;
-    TemporaryFolder folder;
+    ScratchFolder folder;
     QtRunLoop loop;
-    SocketMessagePorts ports{ folder.path() };
-    SocketMessagePorts elsewhere{ folder.path() }; // shares no table with `ports`, as another process's would
+    SocketMessagePorts ports{ folder.path().string() };
+    SocketMessagePorts elsewhere{ folder.path().string() }; // shares no table with `ports`, as another process's would
     std::vector<std::string> received;
 };
 

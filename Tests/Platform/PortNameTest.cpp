@@ -1,6 +1,6 @@
 #include "Platform/Sockets/PortName.h"
 #include "Tests/Fakes/LogRecorder.h"
-#include "Tests/Platform/TemporaryFolder.h"
+#include "Tests/Platform/ScratchFolder.h"
 
 #include <filesystem>
 #include <gmock/gmock.h>
@@ -38,15 +38,15 @@ TEST(PortNameTest, PathMayHave107BytesAndNoMore)
 
 TEST(PortNameTest, LockIsExclusiveUntilItEnds)
 {
-    const TemporaryFolder folder;
+    const ScratchFolder folder;
     {
-        const auto first = NameLock::take(folder.path(), "name");
+        const auto first = NameLock::take(folder.path().string(), "name");
         EXPECT_TRUE(first);
-        EXPECT_FALSE(NameLock::take(folder.path(), "name"));
-        EXPECT_TRUE(NameLock::take(folder.path(), "other"));
+        EXPECT_FALSE(NameLock::take(folder.path().string(), "name"));
+        EXPECT_TRUE(NameLock::take(folder.path().string(), "other"));
     }
-    EXPECT_TRUE(std::filesystem::is_empty(folder.path()));
-    EXPECT_TRUE(NameLock::take(folder.path(), "name"));
+    EXPECT_TRUE(std::filesystem::is_empty(folder.path().string()));
+    EXPECT_TRUE(NameLock::take(folder.path().string(), "name"));
 }
 
 TEST(PortNameTest, FolderThatIsNotThereYieldsNoLock)

@@ -1,6 +1,6 @@
 #include "Platform/Qt/QtPreferences.h"
 #include "Platform/Qt/QtRunLoop.h"
-#include "Tests/Platform/TemporaryFolder.h"
+#include "Tests/Platform/ScratchFolder.h"
 
 #include <QDBusConnection>
 #include <QDBusMessage>
@@ -22,16 +22,16 @@ protected:
     QtPreferencesTest()
     {
         ::unsetenv("DBUS_SESSION_BUS_ADDRESS");
-        ::setenv("XDG_RUNTIME_DIR", folder.path().c_str(), 1);
+        ::setenv("XDG_RUNTIME_DIR", folder.path().string().c_str(), 1);
     }
     std::string content(const std::string& domain) const
     {
-        std::ifstream file(folder.path() + "/" + domain + ".conf");
+        std::ifstream file(folder.path().string() + "/" + domain + ".conf");
         return { std::istreambuf_iterator<char>(file), {} };
     }
 
-    TemporaryFolder folder;
-    QtPreferences preferences{ folder.path() };
+    ScratchFolder folder;
+    QtPreferences preferences{ folder.path().string() };
 };
 
 TEST_F(QtPreferencesTest, ValueIsInTheDomainsFileAfterSynchronizing)
@@ -43,7 +43,7 @@ TEST_F(QtPreferencesTest, ValueIsInTheDomainsFileAfterSynchronizing)
 
 TEST_F(QtPreferencesTest, OtherKeysOfTheFileStay)
 {
-    std::ofstream(folder.path() + "/app.conf") << "[General]\nOther=7\n";
+    std::ofstream(folder.path().string() + "/app.conf") << "[General]\nOther=7\n";
     preferences.setBoolean("app", "Mine", true);
     EXPECT_TRUE(preferences.synchronize("app"));
     EXPECT_EQ(content("app"), "[General]\nMine=true\nOther=7\n");
@@ -103,7 +103,7 @@ private:
 TEST_F(QtPreferencesTest, ChangeIsAnnouncedOnTheSessionBus)
 {
     QtRunLoop loop;
-    const PrivateBus bus(folder.path());
+    const PrivateBus bus(folder.path().string());
     ASSERT_FALSE(bus.address().empty());
     ::setenv("DBUS_SESSION_BUS_ADDRESS", bus.address().c_str(), 1);
     const std::string command = "dbus-monitor --address " + bus.address()

@@ -18,12 +18,16 @@ sockaddr_un addressOf(const std::string& directory, std::string_view name)
     return address;
 }
 
-int makeSocket()
+int withSendBuffer(int number)
 {
-    const int number = ::socket(AF_UNIX, SOCK_SEQPACKET | SOCK_CLOEXEC, 0);
     const int size = 212'992;
     ::setsockopt(number, SOL_SOCKET, SO_SNDBUF, &size, sizeof size);
     return number;
+}
+
+int makeSocket()
+{
+    return withSendBuffer(::socket(AF_UNIX, SOCK_SEQPACKET | SOCK_CLOEXEC, 0));
 }
 
 } // namespace
@@ -50,7 +54,7 @@ int listenAt(const std::string& directory, std::string_view name)
 
 int accept(int listening)
 {
-    return ::accept4(listening, nullptr, nullptr, SOCK_CLOEXEC);
+    return withSendBuffer(::accept4(listening, nullptr, nullptr, SOCK_CLOEXEC)); // it inherits none
 }
 
 std::string packet(std::uint8_t kind, std::int32_t id, std::uint32_t sequence, std::string_view body)

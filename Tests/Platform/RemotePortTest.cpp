@@ -16,7 +16,7 @@ protected:
     std::unique_ptr<ForkedPeer> owner(const std::function<void(int socket, ForkedPeer& parent)>& talk)
     {
         auto peer = std::make_unique<ForkedPeer>([this, talk](ForkedPeer& parent) {
-            const int listening = raw::listenAt(folder.path(), Name);
+            const int listening = raw::listenAt(folder.path().string(), Name);
             parent.signal();
             talk(raw::accept(listening), parent);
             return 0;
@@ -175,11 +175,11 @@ TEST_F(RemotePortTest, ReplySentBeforeThePeersDeathStillCounts)
     EXPECT_EQ(text(*reply), "last words");
 }
 
-class ReplyGarbageTest : public RemotePortTest, public testing::WithParamInterface<std::string> { };
+class ReplyGarbageTest : public RemotePortTest, public testing::WithParamInterface<raw::NamedPacket> { };
 
 TEST_P(ReplyGarbageTest, IsATransportErrorAndEndsThePort)
 {
-    const auto peer = answering(GetParam());
+    const auto peer = answering(GetParam().bytes);
     const auto remote = ports.createRemote(Name);
     int invalidations = 0;
     remote->setInvalidationHandler([&] { ++invalidations; });
@@ -190,8 +190,10 @@ TEST_P(ReplyGarbageTest, IsATransportErrorAndEndsThePort)
 }
 
 INSTANTIATE_TEST_SUITE_P(Packets, ReplyGarbageTest,
-    testing::Values("garbage", raw::packet(1, 7, 1, "one-way"), raw::packet(2, 7, 1, "request"),
-        raw::packet(3, 7, 1, std::string(LargestMessage + 1, 'x'))));
+    testing::Values(raw::NamedPacket{ "text", "garbage" },
+        raw::NamedPacket{ "one-way message", raw::packet(1, 7, 1, "body") },
+        raw::NamedPacket{ "request", raw::packet(2, 7, 1, "body") },
+        raw::NamedPacket{ "one byte too many", raw::packet(3, 7, 1, std::string(LargestMessage + 1, 'x')) }));
 
 TEST_F(RemotePortTest, GarbageOutsideOfARequestEndsThePort)
 {
