@@ -120,9 +120,9 @@ class Place(unittest.TestCase):
         return line.decode() + "\n"
 
     def last_line(self, process):
-        """The last line of a process that has been told to end."""
-        *_, last = (self.gathered.get(process, b"").decode() + process.stdout.read()).splitlines()
-        return last
+        """The last line of a process that has been told to end; empty when no further one came."""
+        lines = (self.gathered.get(process, b"").decode() + process.stdout.read()).splitlines()
+        return lines[-1] if lines else ""
 
     def wait_until(self, condition, what):
         end = time.monotonic() + WAIT

@@ -6,6 +6,7 @@ import os
 import plistlib
 import signal
 import subprocess
+import sys
 import unittest
 
 from harness import Place, capture, record, serving_cell, sim_files
@@ -104,6 +105,45 @@ class Restart(Place):
         self.start_service("--simulate", "lte")
 
 
+class OtherServices(Place):
+    def start_example(self):
+        script = os.path.join(os.path.dirname(__file__), "..", "..", "docs", "telephony-service.py")
+        process = subprocess.Popen([sys.executable, script, self.path("ports")], env=self.environment)
+        self.processes.append(process)
+        self.wait_until(lambda: os.path.exists(self.path("ports", "org.spectrel.Telephony.LogChannel.1")),
+                        "the example service did not start")
+        return process
+
+    def test_example_of_the_manual_serves_a_session(self):
+        self.start_example()
+        done = self.run_spectrel("watch", "--format", "json", "--count", "2")
+        first, second = [json.loads(line)["Serving Cell Info"]["Physical Cell ID"] for line in done.stdout.splitlines()]
+        self.assertLess(int(first), int(second))
+
+    def test_service_that_answers_garbage_is_told(self):
+        script = self.write("garbage.py", GARBAGE_SERVICE.encode())
+        process = subprocess.Popen([sys.executable, script, self.path("ports")], stdout=subprocess.PIPE, text=True)
+        self.processes.append(process)
+        process.stdout.readline()
+        done = self.run_spectrel("watch", "--duration", "500ms")
+        self.assertEqual(done.returncode, 0)
+        self.assertIn("Connecting... (_RKServerConnectionNetworkMonitorCreateLogChannel returns error", done.stderr)
+
+
+GARBAGE_SERVICE = """
+import os, socket, sys
+os.makedirs(sys.argv[1], mode=0o700)
+port = socket.socket(socket.AF_UNIX, socket.SOCK_SEQPACKET)
+port.bind(os.path.join(sys.argv[1], "org.spectrel.Telephony"))
+port.listen()
+print("ready", flush=True)
+while True:
+    peer, _ = port.accept()
+    packet = peer.recv(300000)
+    peer.send(packet[:1] + b"\\3" + packet[2:12] + b"garbage")
+"""
+
+
 class Record(Place):
     def test_recording_decodes_to_what_was_watched(self):
         messages = [serving_cell(5), sim_files(ICCID="1"), serving_cell(7), record(0xB0C1, bytes(9)), b"\x01short"]
@@ -125,13 +165,13 @@ class Record(Place):
         self.wait_until(lambda: os.path.exists(self.path("r.pcap")), "the recording did not begin")
         watching = self.start_watch("--format", "json")
         for _ in range(3):
-            self.next_line(watching)
+            last = self.next_line(watching)
         service.kill()
         for process in (watching, recording):
             self.assertIn("Connecting...", process.stderr.readline())
             process.send_signal(signal.SIGINT)
         self.assertEqual(recording.wait(), 0)
-        shown = json.loads(self.last_line(watching))
+        shown = json.loads(self.last_line(watching) or last)
         decoded = json.loads(self.run_spectrel("decode", "--format", "json", self.path("r.pcap")).stdout)
         self.assertEqual(decoded, shown)
 
