@@ -303,6 +303,7 @@ TEST_F(PaneViewTest, NoWindowIsTooSmall)
         }
     }
     screen.resize(1, 1);
+    press(Key::Backspace);
     press(Key::Home);
     EXPECT_EQ(text(), "›\n");
 }
