@@ -1,0 +1,56 @@
+#pragma once
+
+#include "UI/Terminal/Grid.h"
+#include "UI/Terminal/KeyDecoder.h"
+#include "UI/Terminal/TerminalGuard.h"
+
+#include <functional>
+#include <memory>
+#include <string>
+
+namespace spectrel {
+
+/// The real terminal on standard input and output: shows a grid, changed cells only, and reads keys and the mouse.
+///
+/// Colours appear only where the terminal has them and never when NO_COLOR is set. On terminals without UTF-8 all
+/// else than ASCII shows as its nearest likeness or as '?'. Destroying it gives the terminal back.
+class CursesTerminal {
+public:
+    /// Takes the terminal; null, with `reason`, when there is none or it is of an unknown kind. Sets the locale's
+    /// character type from the environment, and nothing else of the locale.
+    static std::unique_ptr<CursesTerminal> open(std::string& reason);
+    ~CursesTerminal();
+    CursesTerminal(const CursesTerminal&) = delete;
+    CursesTerminal& operator=(const CursesTerminal&) = delete;
+
+    int width() const;
+    int height() const;
+    /// Takes on the terminal's present size.
+    void updateSize();
+    void show(const Grid& grid);
+    /// Shows every cell again at the next `show`, whatever the terminal was thought to hold.
+    void forgetShown();
+    /// Hands out what can be read now, without waiting; false when the terminal is gone.
+    bool read(const std::function<void(const InputEvent&)>& handler);
+    /// Leaves the terminal to others until `resume`.
+    void suspend();
+    void resume();
+
+private:
+    CursesTerminal() = default;
+    void startScreen();
+    void rememberLeavingSequence() const;
+    void showCell(int x, int y, const GridCell& cell) const;
+    void readMouse(const std::function<void(const InputEvent&)>& handler) const;
+
+    std::unique_ptr<TerminalGuard> _guard;
+    struct Screen;
+    std::unique_ptr<Screen> _screen;
+    Grid _shown;
+    bool _hasShown = false;
+    bool _hasColours = false;
+    bool _isUTF8 = false;
+    KeyDecoder _decoder;
+};
+
+} // namespace spectrel

@@ -1,0 +1,44 @@
+#pragma once
+
+#include <variant>
+
+namespace spectrel {
+
+enum class Key {
+    Character, // a printable one, in `character`
+    Up,
+    Down,
+    Left,
+    Right,
+    ShiftLeft,
+    ShiftRight,
+    PageUp,
+    PageDown,
+    Home,
+    End,
+    Enter,
+    Backspace,
+    Escape,
+    Tab,
+    BackTab,
+    ClearLine, // Control-U
+    Redraw, // Control-L
+};
+
+struct KeyEvent {
+    Key key = Key::Character;
+    char32_t character = 0;
+    friend bool operator==(const KeyEvent&, const KeyEvent&) = default;
+};
+
+struct MouseEvent {
+    enum class Action { Press, WheelUp, WheelDown };
+    Action action = Action::Press;
+    int x = 0; // column
+    int y = 0; // line
+    friend bool operator==(const MouseEvent&, const MouseEvent&) = default;
+};
+
+using InputEvent = std::variant<KeyEvent, MouseEvent>;
+
+} // namespace spectrel
