@@ -3,7 +3,6 @@
 #include "Monitor/SpectrelModel.h"
 #include "Platform/Qt/QtClock.h"
 #include "Platform/Qt/QtRunLoop.h"
-#include "Platform/Qt/TerminationSignals.h"
 #include "Platform/Sockets/SocketMessagePorts.h"
 #include "Platform/Sockets/SocketTelephonyServer.h"
 

@@ -35,13 +35,13 @@ struct TerminationSignals::Private {
         struct sigaction action = {};
         action.sa_handler = noteSignal;
         action.sa_flags = SA_RESTART;
-        ::sigaction(SIGINT, &action, &formerInterrupt);
-        ::sigaction(SIGTERM, &action, &formerTerminate);
+        for (Former& each : former)
+            ::sigaction(each.signal, &action, &each.action);
     }
     ~Private()
     {
-        ::sigaction(SIGINT, &formerInterrupt, nullptr);
-        ::sigaction(SIGTERM, &formerTerminate, nullptr);
+        for (const Former& each : former)
+            ::sigaction(each.signal, &each.action, nullptr);
         notifier.reset();
         writingEnd = -1;
         ::close(ends[0]);
@@ -59,8 +59,11 @@ struct TerminationSignals::Private {
     Handler handler;
     int ends[2] = { -1, -1 };
     std::unique_ptr<QSocketNotifier> notifier;
-    struct sigaction formerInterrupt = {};
-    struct sigaction formerTerminate = {};
+    struct Former {
+        int signal;
+        struct sigaction action;
+    };
+    Former former[3] = { { SIGINT, {} }, { SIGTERM, {} }, { SIGHUP, {} } };
 };
 
 TerminationSignals::TerminationSignals(Handler handler)

@@ -5,8 +5,8 @@
 
 namespace spectrel {
 
-/// Turns SIGINT and SIGTERM into a call on the main queue; the signals' former actions return with the object's end.
-/// At most one at a time; needs the application object.
+/// Turns SIGINT, SIGTERM and SIGHUP into a call on the main queue; the signals' former actions return with the object's
+/// end. At most one at a time; needs the application object.
 class TerminationSignals {
 public:
     using Handler = std::function<void(int signal)>;
