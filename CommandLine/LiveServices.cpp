@@ -9,7 +9,6 @@ namespace spectrel {
 LiveServices::LiveServices()
     : _ports(Places::portDirectory())
     , _telephony(_ports)
-    , _terminationSignals([this](int) { _runLoop.quit(); })
 {
     Clock::install(&_clock);
 }

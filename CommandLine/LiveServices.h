@@ -11,7 +11,7 @@
 namespace spectrel {
 
 /// What every program with a live session stands on: the run loop, the device's clock (installed), the message ports
-/// and the telephony service. The loop ends when the program is interrupted.
+/// and the telephony service.
 class LiveServices {
 public:
     LiveServices();
@@ -22,6 +22,10 @@ public:
     QtRunLoop& runLoop()
     {
         return _runLoop;
+    }
+    const Clock& clock() const
+    {
+        return _clock;
     }
     SpectrelModel::Services services()
     {
@@ -35,7 +39,6 @@ private:
     QtClock _clock;
     SocketMessagePorts _ports;
     SocketTelephonyServer _telephony;
-    TerminationSignals _terminationSignals;
 };
 
 } // namespace spectrel

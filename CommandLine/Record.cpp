@@ -2,6 +2,7 @@
 
 #include "CommandLine/LiveServices.h"
 #include "CommandLine/Report.h"
+#include "Platform/Qt/TerminationSignals.h"
 #include "Platform/Recording.h"
 
 #include <cerrno>
@@ -31,6 +32,7 @@ public:
             fail(_options.file + ": " + std::strerror(errno));
             return _status;
         }
+        const TerminationSignals terminationSignals([this](int) { _live.runLoop().quit(); });
         _live.runLoop().async([this] { _model.restartMonitor(); });
         if (_options.duration)
             _live.runLoop().after(*_options.duration, [this] { _live.runLoop().quit(); });

@@ -3,6 +3,7 @@
 #include "CommandLine/Ending.h"
 #include "CommandLine/LiveServices.h"
 #include "CommandLine/Report.h"
+#include "Platform/Qt/TerminationSignals.h"
 
 #include <cstdio>
 
@@ -26,6 +27,7 @@ public:
     int run()
     {
         Ending::install(_model, {});
+        const TerminationSignals terminationSignals([this](int) { _live.runLoop().quit(); });
         _live.runLoop().async([this] { _model.restartMonitor(); });
         if (_options.duration)
             _live.runLoop().after(*_options.duration, [this] { _live.runLoop().quit(); });
