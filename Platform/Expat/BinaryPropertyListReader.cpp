@@ -322,7 +322,7 @@ std::optional<Value> BinaryReader::read()
 {
     if (!readTrailer())
         return std::nullopt;
-    Value top =value(_top, 0);
+    Value top = value(_top, 0);
     return top.isAbsent() ? std::nullopt : std::optional(std::move(top));
 }
 
