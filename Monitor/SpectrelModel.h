@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LogGenerator/GeneratorSlot.h"
+#include "Monitor/MonitorModel.h"
 #include "Monitor/SpectrelModelNode.h"
 #include "Platform/Bytes.h"
 #include "Platform/Dictionary.h"
@@ -34,7 +35,7 @@ public:
 
 /// The monitor model: the log channel to the telephony service, the state that the generator fills, and the display
 /// tree built from it.
-class SpectrelModel {
+class SpectrelModel final : public MonitorModel {
 public:
     /// What the model needs of the platform; all outlive it.
     struct Services {
@@ -51,19 +52,19 @@ public:
 
     /// Opens nothing. The local port is named `portPrefix` + ".BasebandStateReport.LogChannel".
     SpectrelModel(Services services, SpectrelModelObserver& observer, std::string portPrefix);
-    ~SpectrelModel();
+    ~SpectrelModel() override;
     SpectrelModel(const SpectrelModel&) = delete;
     SpectrelModel& operator=(const SpectrelModel&) = delete;
 
     // The session.
-    bool isConnected() const;
+    bool isConnected() const override;
     bool createPorts();
     void destroyPorts();
     void configureGenerator();
     void startMonitor();
-    void restartMonitor();
+    void restartMonitor() override;
     /// Why there is no session, as the system log told it last, without its decoration; empty while there is one.
-    const std::string& lostReason() const
+    const std::string& lostReason() const override
     {
         return _lostReason;
     }
@@ -72,10 +73,10 @@ public:
     void updateWithData(ByteView data);
     void refresh();
     /// The root of the current tree, built at need; null without a generator.
-    NodeRef topLevelNodes();
-    NodeRef nodeAtPath(std::string_view path);
+    NodeRef topLevelNodes() override;
+    NodeRef nodeAtPath(std::string_view path) override;
     /// What a snapshot saves; null without a generator.
-    ListRef getSaveContents();
+    ListRef getSaveContents() override;
     /// The same for a program that is about to end: the messages since the last refresh are folded in first, and the
     /// message being applied, if one is.
     ListRef getLastContents();

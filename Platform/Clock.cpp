@@ -52,27 +52,28 @@ std::string defaultDateForm(Moment moment)
 
 bool parseDefaultDateForm(std::string_view text, Moment& moment)
 {
-    int year = 0;
-    unsigned month = 0;
-    unsigned day = 0;
-    int hour = 0;
-    int minute = 0;
-    int second = 0;
-    char sign = 0;
-    int zone = 0;
-    int length = 0;
-    const std::string copy(text);
-    if (std::sscanf(copy.c_str(), "%4d-%2u-%2u %2d:%2d:%2d %c%4d%n", &year, &month, &day, &hour, &minute, &second,
-            &sign, &zone, &length)
-            != 8
-        || static_cast<std::size_t>(length) != text.size() || (sign != '+' && sign != '-'))
+    constexpr std::string_view Form = "0000-00-00 00:00:00 +0000"; // 0: a digit
+    if (text.size() != Form.size())
         return false;
-    const std::chrono::year_month_day date{ std::chrono::year(year), std::chrono::month(month), std::chrono::day(day) };
-    if (!date.ok())
+    for (std::size_t i = 0; i < Form.size(); ++i) {
+        const bool isDigit = text[i] >= '0' && text[i] <= '9';
+        const bool isSign = Form[i] == '+' && text[i] == '-';
+        if (Form[i] == '0' ? !isDigit : text[i] != Form[i] && !isSign)
+            return false;
+    }
+    const auto field = [&](std::size_t place, std::size_t digits) {
+        int number = 0;
+        for (std::size_t i = place; i < place + digits; ++i)
+            number = number * 10 + (text[i] - '0');
+        return number;
+    };
+    const std::chrono::year_month_day date{ std::chrono::year(field(0, 4)),
+        std::chrono::month(static_cast<unsigned>(field(5, 2))), std::chrono::day(static_cast<unsigned>(field(8, 2))) };
+    if (!date.ok() || field(11, 2) > 23 || field(14, 2) > 59 || field(17, 2) > 59 || field(23, 2) > 59)
         return false;
-    const auto east = std::chrono::minutes((zone / 100 * 60 + zone % 100) * (sign == '-' ? -1 : 1));
-    moment = std::chrono::sys_days(date) + std::chrono::hours(hour) + std::chrono::minutes(minute)
-        + std::chrono::seconds(second) - east;
+    const auto east = std::chrono::minutes((field(21, 2) * 60 + field(23, 2)) * (text[20] == '-' ? -1 : 1));
+    moment = std::chrono::sys_days(date) + std::chrono::hours(field(11, 2)) + std::chrono::minutes(field(14, 2))
+        + std::chrono::seconds(field(17, 2)) - east;
     return true;
 }
 

@@ -103,7 +103,7 @@ std::int16_t Base::lookUpECNO(std::uint32_t ratio)
     return rung == EcnoLadder.end() ? std::int16_t(0) : rung->decibels;
 }
 
-void Base::store(std::string_view key, std::string_view text)
+void Base::storeText(std::string_view key, std::string_view text)
 {
     if (const auto& section = sectionRef.dictionary())
         section->setText(key, text);

@@ -54,7 +54,7 @@ protected:
     void enterInto(ClassDictionary& dict, CodeDictionary& codeDict);
 
     /// Keyed stores into the section's dictionary; silently lost while there is none.
-    void store(std::string_view key, std::string_view text);
+    void storeText(std::string_view key, std::string_view text);
     void store(std::string_view key, const Value& value);
     void removeKey(std::string_view key);
 

@@ -136,7 +136,7 @@ void LTEServingCellInfo::updateFromCellInformation(RecordView record)
     for (const CellInformationKey& key : CellInformationKeys) {
         buffer.clear();
         if (const auto number = (*cell)[key.monitorKey].int32())
-            store(key.displayKey, buffer.decimal(*number).view());
+            storeText(key.displayKey, buffer.decimal(*number).view());
         else
             SPECTREL_LOG(Priority::Error, "%s", key.missing);
     }

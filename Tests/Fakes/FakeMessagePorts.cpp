@@ -79,11 +79,15 @@ struct FakeMessagePorts::Remote final : RemoteMessagePort {
     {
         return valid;
     }
-    void setWritableHandler(std::function<void()>) override { }
+    void setWritableHandler(std::function<void()> newHandler) override
+    {
+        writable = std::move(newHandler);
+    }
 
     FakeMessagePorts& ports;
     std::string name_;
     InvalidationHandler invalidation;
+    std::function<void()> writable;
     bool valid = true;
 };
 
@@ -115,6 +119,20 @@ bool FakeMessagePorts::deliver(const std::string& name, std::int32_t id, ByteVie
         return false;
     port->handler(id, body);
     return true;
+}
+
+std::optional<Bytes> FakeMessagePorts::request(const std::string& name, std::int32_t id, ByteView body)
+{
+    const auto port = _locals[name].lock();
+    return port && port->isServed && port->isValid() ? port->handler(id, body) : std::nullopt;
+}
+
+void FakeMessagePorts::makeRoom()
+{
+    for (const auto& remote : _remotes) {
+        if (const auto port = remote.lock(); port && port->writable)
+            port->writable();
+    }
 }
 
 void FakeMessagePorts::invalidateLocal(const std::string& name)

@@ -33,6 +33,10 @@ public:
 
     /// Delivers a message to the local port of that name, as its peer would; false when there is none.
     bool deliver(const std::string& name, std::int32_t id, ByteView body);
+    /// The same, with the answer that the port's handler gives.
+    std::optional<Bytes> request(const std::string& name, std::int32_t id, ByteView body);
+    /// Tells every remote port that its peer has room again.
+    void makeRoom();
     /// Invalidates a local port from outside.
     void invalidateLocal(const std::string& name);
     /// Ends the peer of every remote port.

@@ -36,7 +36,7 @@ public:
     void updateWithData(RecordView, std::uint32_t logCode) override
     {
         _diary += _name + " " + std::to_string(logCode) + "\n";
-        store("Code", std::to_string(logCode));
+        storeText("Code", std::to_string(logCode));
         removeKey("Gone");
     }
 

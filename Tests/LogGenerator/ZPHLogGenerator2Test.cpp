@@ -29,8 +29,8 @@ public:
     }
     void updateWithData(RecordView record, std::uint32_t logCode) override
     {
-        store("Size", std::to_string(record.size()));
-        store("Code", std::to_string(logCode));
+        storeText("Size", std::to_string(record.size()));
+        storeText("Code", std::to_string(logCode));
     }
 };
 

@@ -168,7 +168,7 @@ TEST(DLFAddVersionReportTest, LargerBufferIsWrittenOnlyAtItsStart)
     EXPECT_EQ(buffer[15], 0x03);
     EXPECT_EQ(buffer[22], 0) << "the version text's NUL";
     EXPECT_EQ(buffer[38], 0) << "the executable name's NUL";
-    EXPECT_EQ(buffer[37], 't');
+    EXPECT_EQ(buffer[37], ' ');
     EXPECT_EQ(buffer[84], 0x89);
     EXPECT_EQ(buffer[85], 0xFF);
     EXPECT_EQ(buffer[87], 0x01);

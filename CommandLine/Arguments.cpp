@@ -1,0 +1,158 @@
+#include "CommandLine/Arguments.h"
+
+#include <CLI/CLI.hpp>
+#include <array>
+#include <charconv>
+#include <cmath>
+#include <cstdio>
+#include <iostream>
+
+namespace spectrel {
+
+namespace {
+
+constexpr const char* Description =
+    "Live radio diagnostics: which cell am I on, how well do I hear it, what else is there?\n"
+    "Without a command it opens the screens; where there is no terminal and no display it prints as 'watch' does.";
+
+constexpr const char* Environment =
+    "Environment:\n"
+    "  SPECTREL_PORT_DIR       where the telephony service is met (default: $XDG_RUNTIME_DIR/spectrel)\n"
+    "  SPECTREL_CRASH_LOG_DIR  where snapshots go (default: $XDG_STATE_HOME/spectrel/CrashReporter)\n"
+    "  SPECTREL_DEVICE_ROOT    prefix of the device's absolute paths (default: /)\n"
+    "  NO_COLOR                no colours in the terminal screens\n"
+    "Exit status: 0 done, 1 something could not be done, 2 wrong usage.";
+
+const CLI::Validator IsFormat(
+    [](std::string& name) {
+        return outputFormatNamed(name) ? std::string() : "'" + name + "' is not one of tree, json, changes, csv, none";
+    },
+    "tree|json|changes|csv|none");
+
+const CLI::Validator IsTechnology(
+    [](std::string& name) {
+        return technologyNamed(name) ? std::string() : "'" + name + "' is not one of ifx, gsm, cdma, lte, utran";
+    },
+    "ifx|gsm|cdma|lte|utran");
+
+const CLI::Validator IsDuration(
+    [](std::string& text) {
+        return parseDuration(text) ? std::string() : "'" + text + "' is no time such as 30s, 5m, 2h or 500ms";
+    },
+    "TIME");
+
+template <typename Set> void addFormat(CLI::App* command, Set set)
+{
+    command
+        ->add_option_function<std::string>(
+            "--format", [set](const std::string& name) { set(*outputFormatNamed(name)); },
+            "How the display is printed (default: tree)")
+        ->check(IsFormat);
+}
+
+void addLimits(CLI::App* command, std::optional<std::uint64_t>& count, const char* what,
+    std::optional<std::chrono::milliseconds>& duration)
+{
+    command->add_option("--count", count, what)->check(CLI::PositiveNumber);
+    command
+        ->add_option_function<std::string>(
+            "--duration", [&duration](const std::string& text) { duration = parseDuration(text); },
+            "End after this time")
+        ->check(IsDuration);
+}
+
+void addCommon(CLI::App& command, Arguments& arguments)
+{
+    command.add_option("--resources", arguments.resources, "Take the display templates from this folder")
+        ->check(CLI::ExistingDirectory)
+        ->type_name("DIR");
+    command.add_option("--log", arguments.logFile, "Write every system-log line to this file: <PRIORITY>TEXT")
+        ->type_name("FILE");
+}
+
+void addWatch(CLI::App& program, Arguments& arguments)
+{
+    CLI::App* command = program.add_subcommand("watch", "Print the live session, once at each refresh");
+    command->callback([&arguments] { arguments.job = Job::Watch; });
+    addCommon(*command, arguments);
+    addFormat(command, [&arguments](OutputFormat format) { arguments.watch.format = format; });
+    addLimits(command, arguments.watch.count, "End after this many refreshes", arguments.watch.duration);
+}
+
+void addDecode(CLI::App& program, Arguments& arguments)
+{
+    DecodeOptions& decode = arguments.decode;
+    CLI::App* command = program.add_subcommand(
+        "decode", "Decode recordings (captures, snapshots, DLF files) offline and print the display");
+    command->callback([&arguments] { arguments.job = Job::Decode; });
+    addCommon(*command, arguments);
+    command->add_option("FILE", decode.files, "The recordings, decoded one after the other")->required();
+    addFormat(command, [&decode](OutputFormat format) { decode.format = format; });
+    command->add_flag("--each", decode.each, "With --format json: one line for each message");
+    command
+        ->add_option_function<std::string>(
+            "--technology", [&decode](const std::string& name) { decode.technology = technologyNamed(name); },
+            "The technology, where the file does not tell")
+        ->check(IsTechnology);
+    command->add_option("--snapshot", decode.snapshotDirectory, "Write a snapshot file into this folder at the end")
+        ->type_name("DIR");
+    command->add_flag("--keep-going", decode.keepGoing, "Go on after a message that would end the program");
+}
+
+void addRecord(CLI::App& program, Arguments& arguments)
+{
+    CLI::App* command = program.add_subcommand("record", "Record the live session into a capture file (pcap)");
+    command->callback([&arguments] { arguments.job = Job::Record; });
+    addCommon(*command, arguments);
+    command->add_option("FILE", arguments.record.file, "The capture file; an existing one is overwritten")->required();
+    addLimits(command, arguments.record.count, "End after this many messages", arguments.record.duration);
+}
+
+} // namespace
+
+std::optional<std::chrono::milliseconds> parseDuration(std::string_view text)
+{
+    static constexpr std::array<std::pair<std::string_view, double>, 5> Units{ { { "ms", 1.0 }, { "s", 1e3 },
+        { "m", 60e3 }, { "h", 3600e3 }, { "", 1e3 } } };
+    const std::size_t digits = std::min(text.find_first_not_of("0123456789."), text.size());
+    double number = 0;
+    const auto result = std::from_chars(text.data(), text.data() + digits, number);
+    if (digits == 0 || result.ec != std::errc() || result.ptr != text.data() + digits)
+        return std::nullopt;
+    for (const auto& [unit, milliseconds] : Units) {
+        if (text.substr(digits) == unit && number * milliseconds >= 1 && number * milliseconds < 1e12)
+            return std::chrono::milliseconds(std::llround(number * milliseconds));
+    }
+    return std::nullopt;
+}
+
+std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
+{
+    CLI::App program(Description, "spectrel");
+    program.footer(Environment);
+    program.set_version_flag("--version", "spectrel " SPECTREL_VERSION);
+    program.require_subcommand(0, 1);
+    addCommon(program, arguments);
+    auto* graphical = program.add_flag_callback(
+        "--gui", [&arguments] { arguments.screens = ScreenChoice::Graphical; }, "Open the graphical screens");
+    program
+        .add_flag_callback(
+            "--terminal", [&arguments] { arguments.screens = ScreenChoice::Terminal; }, "Open the terminal screens")
+        ->excludes(graphical);
+    addWatch(program, arguments);
+    addDecode(program, arguments);
+    addRecord(program, arguments);
+    try {
+        program.parse(argc, argv);
+        if (arguments.decode.each && arguments.decode.format != OutputFormat::Json)
+            throw CLI::ValidationError("--each", "goes with --format json only");
+    } catch (const CLI::Success& answered) {
+        return program.exit(answered); // --help and --version, on standard output
+    } catch (const CLI::ParseError& error) {
+        std::cerr << "spectrel: " << error.what() << " (see spectrel --help)\n";
+        return ExitStatus::WrongUsage;
+    }
+    return std::nullopt;
+}
+
+} // namespace spectrel

@@ -1,0 +1,45 @@
+#pragma once
+
+#include "CommandLine/Decode.h"
+#include "CommandLine/Record.h"
+#include "CommandLine/Watch.h"
+
+#include <chrono>
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace spectrel {
+
+enum class Job : std::uint8_t { Application, Watch, Decode, Record };
+
+/// Which screens the application was told to open; by default it finds out by itself.
+enum class ScreenChoice : std::uint8_t { Automatic, Graphical, Terminal };
+
+/// The command line of `spectrel`, read.
+struct Arguments {
+    Job job = Job::Application;
+    ScreenChoice screens = ScreenChoice::Automatic;
+    std::optional<std::string> resources; // the templates' folder
+    std::optional<std::string> logFile;
+    DecodeOptions decode;
+    WatchOptions watch;
+    RecordOptions record;
+};
+
+/// Exit statuses of every program.
+namespace ExitStatus {
+inline constexpr int Done = 0;
+inline constexpr int Failed = 1;
+inline constexpr int WrongUsage = 2;
+} // namespace ExitStatus
+
+/// Reads the command line. An exit status when the program is done with that: after --help, --version or wrong usage,
+/// each told on the stream where it belongs.
+std::optional<int> readArguments(int argc, char** argv, Arguments& arguments);
+
+/// "30", "30s", "1.5m", "2h", "500ms"; none for anything else.
+std::optional<std::chrono::milliseconds> parseDuration(std::string_view text);
+
+} // namespace spectrel

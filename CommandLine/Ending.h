@@ -1,0 +1,24 @@
+#pragma once
+
+#include <functional>
+
+namespace spectrel {
+
+class SpectrelModel;
+
+/// What a live program does when an exception that nothing catches ends it: gives the screen back, says why on standard
+/// error and in the system log with the record in hexadecimal, and leaves the messages received since the last refresh
+/// and the history in a snapshot file in the crash-log directory. Then the process aborts.
+class Ending {
+public:
+    /// `restoreScreen` may be empty. The model must live until `remove`.
+    static void install(SpectrelModel& model, std::function<void()> restoreScreen);
+    static void remove();
+
+private:
+    [[noreturn]] static void terminate() noexcept;
+    static void tell();
+    static void saveWhatIsLeft();
+};
+
+} // namespace spectrel

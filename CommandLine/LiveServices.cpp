@@ -1,0 +1,27 @@
+#include "CommandLine/LiveServices.h"
+
+#include "Platform/Environment.h"
+
+#include <unistd.h>
+
+namespace spectrel {
+
+LiveServices::LiveServices()
+    : _ports(Places::portDirectory())
+    , _telephony(_ports)
+    , _terminationSignals([this](int) { _runLoop.quit(); })
+{
+    Clock::install(&_clock);
+}
+
+LiveServices::~LiveServices()
+{
+    Clock::install(nullptr);
+}
+
+std::string LiveServices::portPrefixFor(const std::string& job)
+{
+    return "org.spectrel." + job + "." + std::to_string(::getpid());
+}
+
+} // namespace spectrel

@@ -1,0 +1,31 @@
+// One inbound message body, as the message port delivers it, applied to an LTE display; then a refresh.
+
+#include "LogGenerator/Template/ArrayOutOfBoundsException.h"
+#include "LogGenerator/Template/PropertyListReaders.h"
+#include "Monitor/SpectrelModelNode.h"
+#include "Platform/Resources.h"
+#include "Sections/LTE/LTELogGenerator.h"
+
+#include <cstddef>
+#include <cstdint>
+
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t size)
+{
+    using namespace spectrel;
+    static const DirectoryResources resources(SPECTREL_SOURCE_DIR "/Resources");
+    Resources::install(&resources);
+
+    const auto generator = LTELogGenerator::generator();
+    Dictionary state;
+    try {
+        generator->updateState(state, {bytes, size});
+    } catch (const ArrayOutOfBoundsException&) {
+        // An index beyond its own count raises this by design; whatever else escapes is a finding.
+    } catch (const LogCode_0xFF0000::UnknownDataException&) {
+        // So does a SIM record that is no property list.
+    }
+    PathIndex paths;
+    SpectrelModelNode::makeTreeFromObject(generator->generateLogUsingState(state), paths);
+    generator->getSaveContentsFromState(state);
+    return 0;
+}

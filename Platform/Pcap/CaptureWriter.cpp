@@ -1,0 +1,119 @@
+#include "Platform/MessagePort.h"
+#include "Platform/Pcap/LinkTypes.h"
+#include "Platform/Recording.h"
+
+#include <algorithm>
+#include <cerrno>
+#include <cstdio>
+#include <cstring>
+#include <limits>
+#include <pcap/pcap.h>
+#include <unistd.h>
+
+namespace spectrel {
+
+namespace {
+
+static_assert(LargestMessage == 262144, "the largest packet that libpcap reads back");
+
+struct CaptureCloser {
+    void operator()(pcap_t* capture) const
+    {
+        pcap_close(capture);
+    }
+    void operator()(pcap_dumper_t* dumper) const
+    {
+        pcap_dump_close(dumper);
+    }
+};
+using Capture = std::unique_ptr<pcap_t, CaptureCloser>;
+using Dumper = std::unique_ptr<pcap_dumper_t, CaptureCloser>;
+
+class CaptureWriter final : public RecordingWriter {
+public:
+    explicit CaptureWriter(Dumper dumper)
+        : _dumper(std::move(dumper))
+    {
+    }
+    bool write(Moment time, ByteView body) override;
+    bool flush() override;
+    const std::string& error() const override
+    {
+        return _error;
+    }
+
+private:
+    bool failed(std::string why)
+    {
+        _error = std::move(why);
+        return false;
+    }
+
+    Dumper _dumper;
+    bool _isBroken = false; // the file holds a part of a packet, perhaps; nothing may follow
+    std::string _error;
+};
+
+bool CaptureWriter::write(Moment time, ByteView body)
+{
+    if (_isBroken)
+        return false;
+    if (body.empty() || body.size() > LargestMessage)
+        return failed("a message has 1 to " + std::to_string(LargestMessage) + " bytes, this one has "
+            + std::to_string(body.size()));
+    const auto second = std::chrono::floor<std::chrono::seconds>(time);
+    const std::int64_t seconds = second.time_since_epoch().count();
+    if (seconds < 0 || seconds > std::numeric_limits<std::uint32_t>::max())
+        return failed("the time " + defaultDateForm(time) + " is outside what a capture can tell");
+    pcap_pkthdr header{};
+    header.ts.tv_sec = seconds;
+    header.ts.tv_usec = (time - second).count();
+    header.caplen = static_cast<std::uint32_t>(body.size());
+    header.len = header.caplen;
+    errno = 0;
+    pcap_dump(reinterpret_cast<std::uint8_t*>(_dumper.get()), &header, body.data());
+    _isBroken = std::ferror(pcap_dump_file(_dumper.get())) != 0;
+    return !_isBroken || failed(std::strerror(errno));
+}
+
+bool CaptureWriter::flush()
+{
+    if (_isBroken)
+        return false;
+    _isBroken = pcap_dump_flush(_dumper.get()) != 0;
+    return !_isBroken || failed(std::strerror(errno));
+}
+
+std::FILE* openForWriting(const std::string& path)
+{
+    if (path != "-")
+        return std::fopen(path.c_str(), "wbe");
+    const int output = ::dup(STDOUT_FILENO);
+    return output < 0 ? nullptr : ::fdopen(output, "wb");
+}
+
+} // namespace
+
+std::unique_ptr<RecordingWriter> createRecording(const std::string& path, Technology technology, std::string& reason)
+{
+    std::FILE* file = openForWriting(path);
+    if (!file) {
+        reason = std::strerror(errno);
+        return nullptr;
+    }
+    const auto link = std::ranges::find(LinkTypes, technology, &LinkType::technology);
+    const Capture capture(pcap_open_dead(link->number, LargestMessage));
+    Dumper dumper(pcap_dump_fopen(capture.get(), file)); // closes the file when it fails
+    if (!dumper) {
+        reason = pcap_geterr(capture.get());
+        return nullptr;
+    }
+    auto writer = std::make_unique<CaptureWriter>(std::move(dumper));
+    if (!writer->flush()) { // the head stands in the file from the start
+        reason = writer->error();
+        return nullptr;
+    }
+    return writer;
+}
+
+} // namespace spectrel

@@ -1,0 +1,86 @@
+#include "Platform/Sockets/SocketMessagePorts.h"
+
+#include "Platform/Environment.h"
+#include "Platform/Sockets/SocketLocalPort.h"
+#include "Platform/Sockets/SocketRemotePort.h"
+#include "Platform/Sockets/Wire.h"
+#include "Platform/SystemLog.h"
+
+#include <cerrno>
+#include <cstring>
+#include <sys/socket.h>
+#include <unistd.h>
+#include <utility>
+
+namespace spectrel {
+
+namespace {
+
+constexpr int Backlog = 64; // senders that wait to be accepted
+
+FileDescriptor makeSocket()
+{
+    FileDescriptor socket(::socket(AF_UNIX, SOCK_SEQPACKET | SOCK_CLOEXEC | SOCK_NONBLOCK, 0));
+    if (socket)
+        ::setsockopt(socket.number(), SOL_SOCKET, SO_SNDBUF, &wire::SendBuffer, sizeof wire::SendBuffer);
+    return socket;
+}
+
+/// A socket listening at the address. A file that is there is a dead process's: the caller holds the name's lock.
+FileDescriptor listenAt(const sockaddr_un& address)
+{
+    FileDescriptor socket = makeSocket();
+    ::unlink(address.sun_path);
+    if (socket && ::bind(socket.number(), reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0
+        && ::listen(socket.number(), Backlog) == 0)
+        return socket;
+    SPECTREL_LOG(Priority::Error, "Message port %s: %s", address.sun_path, std::strerror(errno));
+    return {};
+}
+
+} // namespace
+
+SocketMessagePorts::SocketMessagePorts(std::string directory)
+    : _directory(std::move(directory))
+{
+}
+
+MessagePorts::LocalResult SocketMessagePorts::createLocal(
+    std::string_view name, LocalMessagePort::MessageHandler handler)
+{
+    std::erase_if(_locals, [](const auto& held) { return held.second.expired(); });
+    if (const auto held = _locals.find(name); held != _locals.end()) {
+        if (auto existing = held->second.lock(); existing && existing->isValid())
+            return { std::move(existing), true };
+    }
+    const auto address = portAddress(_directory, name);
+    std::string reason;
+    if (address && !makePrivateDirectory(_directory, reason))
+        SPECTREL_LOG(Priority::Error, "Message ports: %s", reason.c_str());
+    if (!address || !reason.empty())
+        return {};
+    auto lock = NameLock::take(_directory, name);
+    if (!lock)
+        return {};
+    FileDescriptor socket = listenAt(*address);
+    if (!socket)
+        return {};
+    auto port = std::make_shared<SocketLocalPort>(
+        std::string(name), address->sun_path, std::move(*lock), std::move(socket), std::move(handler));
+    _locals.insert_or_assign(std::string(name), port);
+    return { std::move(port), false };
+}
+
+std::shared_ptr<RemoteMessagePort> SocketMessagePorts::createRemote(std::string_view name)
+{
+    const auto address = portAddress(_directory, name);
+    if (!address)
+        return nullptr;
+    FileDescriptor socket = makeSocket();
+    if (!socket || ::connect(socket.number(), reinterpret_cast<const sockaddr*>(&*address), sizeof *address) != 0
+        || !wire::isPeerOfThisUser(socket.number()))
+        return nullptr;
+    return std::make_shared<SocketRemotePort>(std::string(name), std::move(socket));
+}
+
+} // namespace spectrel

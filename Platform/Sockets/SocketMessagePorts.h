@@ -1,0 +1,29 @@
+#pragma once
+
+#include "Platform/MessagePort.h"
+
+#include <map>
+#include <memory>
+#include <string>
+#include <string_view>
+
+namespace spectrel {
+
+/// Message ports as Unix sockets of sequential packets in one private folder, a file a name; docs/message-ports.md
+/// tells the whole transport. Ports need the run loop's application object before they are made.
+class SocketMessagePorts final : public MessagePorts {
+public:
+    /// Nothing is made or checked yet.
+    explicit SocketMessagePorts(std::string directory);
+
+    /// Makes the folder at need. Null and logged when it belongs to somebody else or the name cannot be used.
+    LocalResult createLocal(std::string_view name, LocalMessagePort::MessageHandler handler) override;
+    /// Null when nobody, or another user, serves the name.
+    std::shared_ptr<RemoteMessagePort> createRemote(std::string_view name) override;
+
+private:
+    std::string _directory;
+    std::map<std::string, std::weak_ptr<LocalMessagePort>, std::less<>> _locals; // of this process
+};
+
+} // namespace spectrel

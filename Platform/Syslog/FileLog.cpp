@@ -1,0 +1,79 @@
+#include "Platform/Syslog/FileLog.h"
+
+#include <cerrno>
+#include <cstring>
+
+namespace spectrel {
+
+namespace {
+
+/// The letter after the backslash; 0 for a character that has none.
+char escapeLetter(char character)
+{
+    switch (character) {
+    case '\n':
+        return 'n';
+    case '\t':
+        return 't';
+    case '\r':
+        return 'r';
+    case '\a':
+        return 'a';
+    case '\b':
+        return 'b';
+    case '\f':
+        return 'f';
+    case '\v':
+        return 'v';
+    case '\\':
+        return '\\';
+    default:
+        return 0;
+    }
+}
+
+void appendEscaped(std::string& line, char character)
+{
+    const auto code = static_cast<unsigned char>(character);
+    if (const char letter = escapeLetter(character)) {
+        line += '\\';
+        line += letter;
+    } else if (code < 0x20 || code == 0x7F) {
+        line += '\\';
+        line += static_cast<char>('0' + (code >> 6));
+        line += static_cast<char>('0' + (code >> 3 & 7));
+        line += static_cast<char>('0' + (code & 7));
+    } else {
+        line += character;
+    }
+}
+
+} // namespace
+
+std::unique_ptr<FileLog> FileLog::create(const std::string& path, Writing writing, std::string& reason)
+{
+    if (std::FILE* const file = std::fopen(path.c_str(), "we"))
+        return std::unique_ptr<FileLog>(new FileLog(file, writing));
+    reason = path + ": " + std::strerror(errno);
+    return nullptr;
+}
+
+void FileLog::write(int priority, std::string_view text)
+{
+    _line = '<';
+    _line += std::to_string(priority);
+    _line += '>';
+    for (const char character : text)
+        appendEscaped(_line, character);
+    _line += '\n';
+    std::fwrite(_line.data(), 1, _line.size(), _file.get());
+    if (_writing == Writing::EachLine)
+        std::fflush(_file.get());
+}
+
+bool FileLog::flush()
+{
+    return std::fflush(_file.get()) == 0 && std::ferror(_file.get()) == 0;
+}
+
+} // namespace spectrel

@@ -1,0 +1,40 @@
+#pragma once
+
+#include <cstdint>
+#include <string_view>
+
+/// What programs and the telephony service say to each other over message ports; every body is a property list.
+namespace spectrel::TelephonyProtocol {
+
+/// The service's well-known port.
+inline constexpr std::string_view ServicePort = "org.spectrel.Telephony";
+
+/// A wish for a log channel: {"CreateLogChannel": <local port name>} with this message id, answered by
+/// {"Domain": integer, "Error": integer, "PortName": text}. The port name is the channel's, for requests of id 0.
+inline constexpr std::int32_t CreateLogChannelId = 1;
+inline constexpr std::string_view CreateLogChannelKey = "CreateLogChannel";
+inline constexpr std::string_view DomainKey = "Domain";
+inline constexpr std::string_view ErrorKey = "Error";
+inline constexpr std::string_view PortNameKey = "PortName";
+
+/// Values under "Error".
+enum class ChannelError : std::int32_t {
+    None = 0,
+    MalformedRequest = 22, // no dictionary with a local port name
+    NoSuchPort = 2, // nobody serves the local port
+    TooManyChannels = 24,
+    MalformedReply = 74, // told by the program itself: the service answered nothing, or not a dictionary
+};
+
+/// Requests on a log channel, and every log message from it, have this id.
+inline constexpr std::int32_t LogChannelId = 0;
+/// {"GetTechnology": "GetTechnology"}, answered by {"GetTechnology": <technology constant>}.
+inline constexpr std::string_view GetTechnologyKey = "GetTechnology";
+/// The start command: {"SetState": "Streaming"} with the wanted codes of the two streams, not answered.
+inline constexpr std::string_view SetStateKey = "SetState";
+inline constexpr std::string_view StreamingState = "Streaming";
+inline constexpr std::string_view OrdinaryCodesKey = "SetZephyrLogCodes";
+inline constexpr std::string_view ExtraCodesKey = "SetRkExtraCodes";
+/// A request that cannot be understood is answered by {"Error": text} where an answer is wanted.
+
+} // namespace spectrel::TelephonyProtocol

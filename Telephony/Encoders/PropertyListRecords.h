@@ -1,0 +1,25 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+#include "Platform/Clock.h"
+#include "Platform/Value.h"
+
+#include <cstdint>
+
+namespace spectrel {
+
+class LTEWorld;
+
+/// A record of the extra stream whose payload is the property list, in its XML form.
+Bytes propertyListRecord(std::uint32_t code, const Value& payload, Moment time);
+
+/// 0xFF0000: the SIM's elementary files. A test card's: MCC 001, MNC 01.
+Bytes simFilesRecord(Moment time);
+
+/// 0xFF0001: the serving cell and its strongest neighbours.
+Bytes lteCellInformationRecord(const LTEWorld& world, Moment time);
+
+/// 0xFF0002: the packet data contexts, with what they have transferred.
+Bytes contextsRecord(std::uint64_t bytesReceived, std::uint64_t bytesSent, Moment time);
+
+} // namespace spectrel

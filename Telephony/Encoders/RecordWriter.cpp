@@ -1,0 +1,81 @@
+#include "Telephony/Encoders/RecordWriter.h"
+
+#include <utility>
+
+namespace spectrel {
+
+namespace {
+constexpr std::uint8_t OrdinaryType = 0x01;
+constexpr std::uint8_t ExtraType = 0xFF;
+constexpr std::uint8_t WrapperMark = 0x81;
+constexpr std::size_t HeaderSize = 13;
+} // namespace
+
+std::uint64_t itemTimestamp(Moment time)
+{
+    constexpr Moment Origin = std::chrono::sys_days(std::chrono::year(1980) / 1 / 6);
+    const auto microseconds = (time - Origin).count();
+    return microseconds < 0 ? 0 : static_cast<std::uint64_t>(microseconds / 1250) << 16;
+}
+
+RecordWriter::RecordWriter(std::uint32_t code, Moment time)
+{
+    _record.reserve(64);
+    const std::uint64_t timestamp = itemTimestamp(time);
+    u8(code >= ExtraStreamOffset ? ExtraType : OrdinaryType);
+    u16(0); // the item length, once it is known
+    u16(code);
+    u32(static_cast<std::uint32_t>(timestamp));
+    u32(static_cast<std::uint32_t>(timestamp >> 32));
+}
+
+RecordWriter& RecordWriter::u8(std::uint32_t value)
+{
+    _record.push_back(static_cast<std::uint8_t>(value));
+    return *this;
+}
+
+RecordWriter& RecordWriter::u16(std::uint32_t value)
+{
+    return u8(value).u8(value >> 8);
+}
+
+RecordWriter& RecordWriter::u32(std::uint32_t value)
+{
+    return u16(value).u16(value >> 16);
+}
+
+RecordWriter& RecordWriter::zeros(std::size_t count)
+{
+    _record.insert(_record.end(), count, 0);
+    return *this;
+}
+
+RecordWriter& RecordWriter::bytes(ByteView bytes)
+{
+    _record.insert(_record.end(), bytes.begin(), bytes.end());
+    return *this;
+}
+
+Bytes RecordWriter::take()
+{
+    const std::size_t itemLength = _record.size() - 1;
+    _record[1] = static_cast<std::uint8_t>(itemLength);
+    _record[2] = static_cast<std::uint8_t>(itemLength >> 8);
+    return std::move(_record);
+}
+
+bool routedCode(ByteView message, std::uint32_t& code)
+{
+    if (message.size() < HeaderSize)
+        return false;
+    const ByteView record = message[0] == WrapperMark ? message.subspan(2) : message;
+    if (record[0] != OrdinaryType && record[0] != ExtraType)
+        return false;
+    code = record[3] | static_cast<std::uint32_t>(record[4]) << 8;
+    if (record[0] == ExtraType)
+        code |= ExtraStreamOffset;
+    return true;
+}
+
+} // namespace spectrel

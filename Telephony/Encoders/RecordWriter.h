@@ -1,0 +1,40 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+#include "Platform/Clock.h"
+
+#include <cstdint>
+
+namespace spectrel {
+
+/// Added to the 16-bit code of a record of the extra stream.
+constexpr std::uint32_t ExtraStreamOffset = 0xFF0000;
+
+/// Writes one log record as a baseband frames it: type byte (0x01, or 0xFF for the extra stream), 16-bit item length
+/// counted from itself, 16-bit log code, 8-byte timestamp, payload; little-endian throughout.
+class RecordWriter {
+public:
+    /// A code from 0xFF0000 on belongs to the extra stream.
+    RecordWriter(std::uint32_t code, Moment time);
+
+    RecordWriter& u8(std::uint32_t value);
+    RecordWriter& u16(std::uint32_t value);
+    RecordWriter& u32(std::uint32_t value);
+    RecordWriter& zeros(std::size_t count);
+    RecordWriter& bytes(ByteView bytes);
+
+    /// The finished record; its item length is set. Longer than 65535 bytes the length field keeps its low 16 bits.
+    Bytes take();
+
+private:
+    Bytes _record;
+};
+
+/// The timestamp of a log item: 1/800 s since 1980-01-06 00:00 UTC in the upper 48 bits (3GPP2 C.S0002 system time).
+std::uint64_t itemTimestamp(Moment time);
+
+/// The code by which a message is routed (extra stream: code + 0xFF0000), its wrapper aside; false when it is too short
+/// or of an unknown type.
+bool routedCode(ByteView message, std::uint32_t& code);
+
+} // namespace spectrel

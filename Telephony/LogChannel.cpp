@@ -1,0 +1,168 @@
+#include "Telephony/LogChannel.h"
+
+#include "Platform/Dictionary.h"
+#include "Platform/List.h"
+#include "Platform/PropertyList.h"
+#include "Platform/TelephonyProtocol.h"
+#include "Telephony/Encoders/RecordWriter.h"
+
+#include <cstdio>
+#include <utility>
+
+namespace spectrel {
+
+namespace {
+
+namespace Protocol = TelephonyProtocol;
+
+void tell(const std::string& line)
+{
+    std::fprintf(stderr, "spectrel-telephonyd: %s\n", line.c_str());
+}
+
+Bytes serialised(const Value& value)
+{
+    const std::string text = serialisePropertyList(value).value_or(std::string());
+    return { text.begin(), text.end() };
+}
+
+Bytes errorAnswer(const char* text)
+{
+    return serialised(Dictionary::make({ { std::string(Protocol::ErrorKey), text } }));
+}
+
+/// Adds a list of 16-bit codes; false when there is a value that is no such list.
+bool addCodes(const Value& list, std::uint32_t offset, std::unordered_set<std::uint32_t>& codes)
+{
+    if (list.isAbsent())
+        return true;
+    if (!list.list())
+        return false;
+    for (const Value& element : list.list()->elements()) {
+        const auto code = element.int32();
+        if (!code || *code < 0 || *code > 0xFFFF)
+            return false;
+        codes.insert(static_cast<std::uint32_t>(*code) | offset);
+    }
+    return true;
+}
+
+} // namespace
+
+std::optional<Subscription> Subscription::fromStartCommand(const Value& command)
+{
+    const auto& dictionary = command.dictionary();
+    if (!dictionary || (*dictionary)[Protocol::SetStateKey] != Value(Protocol::StreamingState))
+        return std::nullopt;
+    Subscription subscription;
+    const Value& ordinary = (*dictionary)[Protocol::OrdinaryCodesKey];
+    const Value& extra = (*dictionary)[Protocol::ExtraCodesKey];
+    subscription._wantsEverything = ordinary.isAbsent() && extra.isAbsent();
+    if (!addCodes(ordinary, 0, subscription._codes) || !addCodes(extra, ExtraStreamOffset, subscription._codes))
+        return std::nullopt;
+    return subscription;
+}
+
+bool Subscription::wants(ByteView message) const
+{
+    std::uint32_t code = 0;
+    return _wantsEverything || !routedCode(message, code) || _codes.contains(code);
+}
+
+LogChannel::LogChannel(RunLoop& runLoop, LogSource& source, std::string name, std::function<void()> onEnd)
+    : _runLoop(runLoop)
+    , _source(source)
+    , _name(std::move(name))
+    , _onEnd(std::move(onEnd))
+    , _alive(std::make_shared<bool>(true))
+{
+}
+
+std::unique_ptr<LogChannel> LogChannel::open(RunLoop& runLoop, MessagePorts& ports, LogSource& source,
+    const std::string& name, const std::string& clientPort, std::function<void()> onEnd)
+{
+    std::unique_ptr<LogChannel> channel(new LogChannel(runLoop, source, name, std::move(onEnd)));
+    LogChannel* self = channel.get();
+    channel->_client = ports.createRemote(clientPort);
+    if (!channel->_client)
+        return nullptr;
+    channel->_requests =
+        ports.createLocal(name, [self](std::int32_t id, ByteView body) { return self->handleRequest(id, body); }).port;
+    if (!channel->_requests)
+        return nullptr;
+    channel->_requests->serve();
+    channel->_client->setInvalidationHandler([self] { self->end(); });
+    channel->_client->setWritableHandler([self] {
+        if (self->_stream)
+            self->_stream->resume();
+    });
+    tell(name + " opened for " + clientPort);
+    return channel;
+}
+
+LogChannel::~LogChannel()
+{
+    _stream.reset();
+    if (_client) {
+        _client->setInvalidationHandler({});
+        _client->setWritableHandler({});
+        _client->invalidate();
+    }
+    if (_requests)
+        _requests->invalidate();
+}
+
+std::optional<Bytes> LogChannel::handleRequest(std::int32_t id, ByteView body)
+{
+    if (id != Protocol::LogChannelId) {
+        tell(_name + ": a request of unknown id " + std::to_string(id));
+        return errorAnswer("unknown message id");
+    }
+    const auto request = parsePropertyList(body);
+    if (request && request->dictionary() && request->dictionary()->contains(Protocol::GetTechnologyKey)) {
+        return serialised(Dictionary::make(
+            { { std::string(Protocol::GetTechnologyKey), technologyConstant(_source.technology()) } }));
+    }
+    auto subscription = request ? Subscription::fromStartCommand(*request) : std::nullopt;
+    if (!subscription) {
+        tell(_name + ": a request that cannot be understood");
+        return errorAnswer("the request cannot be understood");
+    }
+    startStreaming(std::move(*subscription));
+    return std::nullopt;
+}
+
+void LogChannel::startStreaming(Subscription subscription)
+{
+    tell(_name + ": streaming "
+        + (subscription.wantsEverything() ? std::string("everything")
+                                          : std::to_string(subscription.count()) + " codes"));
+    _stream.reset();
+    _subscription = std::move(subscription);
+    _stream = _source.start(*this);
+}
+
+bool LogChannel::deliver(ByteView message)
+{
+    if (!_subscription || !_subscription->wants(message))
+        return true;
+    const SendStatus status = _client->sendRequest(Protocol::LogChannelId, message, std::chrono::nanoseconds::zero(),
+        std::chrono::nanoseconds::zero(), ReplyMode::None, nullptr);
+    if (status == SendStatus::TransportError)
+        tell(_name + ": a message of " + std::to_string(message.size()) + " bytes cannot be sent");
+    return status != SendStatus::SendTimeout;
+}
+
+/// The client is gone. Its end may be noticed in the middle of a delivery, so it is dealt with from the queue.
+void LogChannel::end()
+{
+    _runLoop.async([this, alive = std::weak_ptr(_alive)] {
+        if (alive.expired())
+            return;
+        tell(_name + " closed");
+        const auto onEnd = std::move(_onEnd);
+        onEnd(); // destroys this channel
+    });
+}
+
+} // namespace spectrel

@@ -1,0 +1,36 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+#include "Platform/Recording.h"
+
+#include <memory>
+
+namespace spectrel {
+
+/// Where a stream's messages go: one channel.
+class MessageSink {
+public:
+    virtual ~MessageSink() = default;
+    /// Delivers one message, or lets it go when the client did not ask for its code. False when the client has no room
+    /// now: nothing was delivered, and `LogStream::resume` is called once there is room.
+    virtual bool deliver(ByteView message) = 0;
+};
+
+/// One channel's stream; it ends with its destruction.
+class LogStream {
+public:
+    virtual ~LogStream() = default;
+    /// There is room again after `deliver` had refused a message.
+    virtual void resume() = 0;
+};
+
+/// A baseband: real, recorded or simulated.
+class LogSource {
+public:
+    virtual ~LogSource() = default;
+    virtual Technology technology() const = 0;
+    /// Starts streaming to one channel; the sink outlives the stream.
+    virtual std::unique_ptr<LogStream> start(MessageSink& sink) = 0;
+};
+
+} // namespace spectrel

@@ -1,0 +1,71 @@
+#include "Telephony/TelephonyService.h"
+
+#include "Platform/Dictionary.h"
+#include "Platform/PropertyList.h"
+#include "Platform/TelephonyProtocol.h"
+
+namespace spectrel {
+
+namespace {
+
+namespace Protocol = TelephonyProtocol;
+using Protocol::ChannelError;
+
+Bytes answer(ChannelError error, const std::string& portName = {})
+{
+    const auto text = serialisePropertyList(Dictionary::make({
+        { std::string(Protocol::DomainKey), Value::integer(error == ChannelError::None ? 0 : 1) },
+        { std::string(Protocol::ErrorKey), Value::integer(static_cast<std::int32_t>(error)) },
+        { std::string(Protocol::PortNameKey), portName },
+    }));
+    return { text->begin(), text->end() };
+}
+
+} // namespace
+
+TelephonyService::TelephonyService(RunLoop& runLoop, MessagePorts& ports, LogSource& source)
+    : _runLoop(runLoop)
+    , _ports(ports)
+    , _source(source)
+{
+}
+
+TelephonyService::~TelephonyService()
+{
+    _channels.clear();
+    if (_port)
+        _port->invalidate();
+}
+
+bool TelephonyService::start()
+{
+    const auto [port, existed] = _ports.createLocal(
+        Protocol::ServicePort, [this](std::int32_t id, ByteView body) { return handleRequest(id, body); });
+    if (!port || existed)
+        return false;
+    _port = port;
+    _port->serve();
+    return true;
+}
+
+Bytes TelephonyService::handleRequest(std::int32_t id, ByteView body)
+{
+    const auto request = parsePropertyList(body);
+    const std::string* clientPort = id == Protocol::CreateLogChannelId && request && request->dictionary()
+        ? (*request->dictionary())[Protocol::CreateLogChannelKey].string()
+        : nullptr;
+    if (!clientPort || clientPort->empty())
+        return answer(ChannelError::MalformedRequest);
+    if (_channels.size() >= MostChannels)
+        return answer(ChannelError::TooManyChannels);
+    const unsigned number = ++_lastChannel;
+    const std::string name = std::string(Protocol::ServicePort) + ".LogChannel." + std::to_string(number);
+    auto channel =
+        LogChannel::open(_runLoop, _ports, _source, name, *clientPort, [this, number] { _channels.erase(number); });
+    if (!channel)
+        return answer(ChannelError::NoSuchPort);
+    _channels.emplace(number, std::move(channel));
+    return answer(ChannelError::None, name);
+}
+
+} // namespace spectrel

@@ -1,0 +1,89 @@
+#include "CommandLine/DisplayChanges.h"
+
+#include "Platform/Dictionary.h"
+#include "Platform/List.h"
+
+#include <gtest/gtest.h>
+
+namespace spectrel {
+namespace {
+
+class DisplayChangesTest : public testing::Test {
+protected:
+    std::string update(const Value& display)
+    {
+        std::string text;
+        changes.update(display, [&text](const std::string& path, const std::string* value) {
+            text += path + (value ? "=" + *value : " gone") + "\n";
+        });
+        return text;
+    }
+    DisplayChanges changes;
+};
+
+TEST_F(DisplayChangesTest, FirstDisplayIsAllNew)
+{
+    EXPECT_EQ(update(Dictionary::make({ { "A", "1" }, { "B", List::make({ "x", Dictionary::make({ { "k", "v" } }) }) } })),
+        "/A=1\n/B/0=x\n/B/1/k=v\n");
+}
+
+TEST_F(DisplayChangesTest, SameDisplayChangesNothing)
+{
+    const auto display = Dictionary::make({ { "A", "1" }, { "B", List::make({ "x" }) } });
+    update(display);
+    EXPECT_EQ(update(display), "");
+}
+
+TEST_F(DisplayChangesTest, OnlyTheChangedLeafIsTold)
+{
+    const auto display = Dictionary::make({ { "A", "1" }, { "B", "2" }, { "C", "3" } });
+    update(display);
+    display->setText("B", "9");
+    EXPECT_EQ(update(display), "/B=9\n");
+}
+
+TEST_F(DisplayChangesTest, RemovedAndAppendedKeyIsToldOnce)
+{
+    const auto display = Dictionary::make({ { "A", "1" }, { "B", "2" }, { "C", "3" } });
+    update(display);
+    display->remove("A");
+    EXPECT_EQ(update(display), "/A gone\n");
+    display->setText("A", "1");
+    EXPECT_EQ(update(display), "/A=1\n");
+}
+
+TEST_F(DisplayChangesTest, OrderAloneIsNoChange)
+{
+    update(Dictionary::make({ { "A", "1" }, { "B", "2" }, { "C", "3" } }));
+    EXPECT_EQ(update(Dictionary::make({ { "C", "3" }, { "A", "1" }, { "B", "2" } })), "");
+}
+
+TEST_F(DisplayChangesTest, ShorterListLosesItsLastElements)
+{
+    update(List::make({ Dictionary::make({ { "k", "1" } }), Dictionary::make({ { "k", "2" }, { "l", "3" } }) }));
+    EXPECT_EQ(update(List::make({ Dictionary::make({ { "k", "1" } }) })), "/1/k gone\n/1/l gone\n");
+}
+
+TEST_F(DisplayChangesTest, LeafThatBecomesAContainerGoesAndComesAgain)
+{
+    update(Dictionary::make({ { "A", "1" } }));
+    EXPECT_EQ(update(Dictionary::make({ { "A", List::make({ "x" }) } })), "/A gone\n/A/0=x\n");
+    EXPECT_EQ(update(Dictionary::make({ { "A", "1" } })), "/A/0 gone\n/A=1\n");
+}
+
+TEST_F(DisplayChangesTest, DisplayThatGoesTakesItsLeavesAlong)
+{
+    EXPECT_EQ(update({}), "");
+    update(Dictionary::make({ { "A", "1" } }));
+    EXPECT_EQ(update({}), "/A gone\n");
+    EXPECT_EQ(update(Dictionary::make({ { "A", "1" } })), "/A=1\n");
+}
+
+TEST_F(DisplayChangesTest, DisplayThatIsATextIsTheRootLeaf)
+{
+    EXPECT_EQ(update("text"), "/=text\n");
+    EXPECT_EQ(update("other"), "/=other\n");
+}
+
+} // namespace
+} // namespace spectrel

@@ -1,0 +1,16 @@
+spectrel_library(spectrel_port_fixtures
+    SOURCES
+        ForkedPeer.cpp ForkedPeer.h
+        RawPeer.cpp RawPeer.h)
+
+spectrel_test(test_qt_platform
+    SOURCES FileLogTest.cpp QtClockTest.cpp QtPreferencesTest.cpp QtRunLoopTest.cpp TerminationSignalsTest.cpp
+    USES spectrel_qt spectrel_syslog spectrel_port_fixtures Qt6::DBus)
+
+spectrel_test(test_message_ports
+    SOURCES AllocationTest.cpp LocalPortTest.cpp PortNameTest.cpp RemotePortTest.cpp WireTest.cpp
+    USES spectrel_qt spectrel_ports spectrel_fakes spectrel_port_fixtures)
+
+spectrel_test(test_telephony_server
+    SOURCES SocketTelephonyServerTest.cpp
+    USES spectrel_ports spectrel_expat spectrel_fakes)

@@ -1,0 +1,130 @@
+#include "Platform/Qt/QtPreferences.h"
+#include "Platform/Qt/QtRunLoop.h"
+#include "Tests/Platform/ScratchFolder.h"
+
+#include <QDBusConnection>
+#include <QDBusMessage>
+#include <QObject>
+
+#include <csignal>
+#include <cstdio>
+#include <cstdlib>
+#include <fstream>
+#include <gtest/gtest.h>
+#include <iterator>
+#include <string>
+
+namespace spectrel {
+namespace {
+
+class QtPreferencesTest : public testing::Test {
+protected:
+    QtPreferencesTest()
+    {
+        ::unsetenv("DBUS_SESSION_BUS_ADDRESS");
+        ::setenv("XDG_RUNTIME_DIR", folder.path().string().c_str(), 1);
+    }
+    std::string content(const std::string& domain) const
+    {
+        std::ifstream file(folder.path().string() + "/" + domain + ".conf");
+        return { std::istreambuf_iterator<char>(file), {} };
+    }
+
+    ScratchFolder folder;
+    QtPreferences preferences{ folder.path().string() };
+};
+
+TEST_F(QtPreferencesTest, ValueIsInTheDomainsFileAfterSynchronizing)
+{
+    preferences.setBoolean("org.spectrel.Home", "THShowGSMRSSI", false);
+    EXPECT_TRUE(preferences.synchronize("org.spectrel.Home"));
+    EXPECT_EQ(content("org.spectrel.Home"), "[General]\nTHShowGSMRSSI=false\n");
+}
+
+TEST_F(QtPreferencesTest, OtherKeysOfTheFileStay)
+{
+    std::ofstream(folder.path().string() + "/app.conf") << "[General]\nOther=7\n";
+    preferences.setBoolean("app", "Mine", true);
+    EXPECT_TRUE(preferences.synchronize("app"));
+    EXPECT_EQ(content("app"), "[General]\nMine=true\nOther=7\n");
+}
+
+TEST_F(QtPreferencesTest, FileThatCannotBeWrittenIsReported)
+{
+    QtPreferences nowhere("/proc/nowhere");
+    nowhere.setBoolean("app", "key", true);
+    EXPECT_FALSE(nowhere.synchronize("app"));
+}
+
+TEST_F(QtPreferencesTest, DomainThatIsNoFileNameIsRefused)
+{
+    preferences.setBoolean("../app", "key", true);
+    EXPECT_FALSE(preferences.synchronize("../app"));
+    EXPECT_FALSE(preferences.synchronize(""));
+}
+
+TEST_F(QtPreferencesTest, WithoutASessionBusNobodyIsTold)
+{
+    QtRunLoop loop;
+    preferences.postChanged("app", "key");
+    EXPECT_FALSE(QDBusConnection("spectrel-preferences").isConnected());
+}
+
+/// A message bus of the test's own.
+class PrivateBus {
+public:
+    explicit PrivateBus(const std::string& folder)
+    {
+        const std::string command =
+            "dbus-daemon --session --fork --print-address=1 --print-pid=1 --address=unix:path=" + folder + "/bus";
+        std::FILE* const output = ::popen(command.c_str(), "r");
+        char line[512] = "";
+        if (std::fgets(line, sizeof line, output))
+            _address = std::string(line, std::char_traits<char>::length(line) - 1);
+        if (std::fgets(line, sizeof line, output))
+            _process = std::atoi(line);
+        ::pclose(output);
+    }
+    ~PrivateBus()
+    {
+        if (_process > 0)
+            ::kill(_process, SIGTERM);
+    }
+    const std::string& address() const
+    {
+        return _address;
+    }
+
+private:
+    std::string _address;
+    pid_t _process = 0;
+};
+
+TEST_F(QtPreferencesTest, ChangeIsAnnouncedOnTheSessionBus)
+{
+    QtRunLoop loop;
+    const PrivateBus bus(folder.path().string());
+    ASSERT_FALSE(bus.address().empty());
+    ::setenv("DBUS_SESSION_BUS_ADDRESS", bus.address().c_str(), 1);
+    const std::string command = "dbus-monitor --address " + bus.address()
+        + " \"type='signal',interface='org.spectrel.Preferences'\" & echo $!; wait";
+    std::FILE* const monitor = ::popen(("exec 2>&1; " + command).c_str(), "r");
+    char line[512] = "";
+    ASSERT_TRUE(std::fgets(line, sizeof line, monitor));
+    const pid_t process = std::atoi(line);
+    // The monitor writes about its own coming on the bus first: from then on it listens.
+    ASSERT_TRUE(std::fgets(line, sizeof line, monitor));
+    preferences.postChanged("org.spectrel.Home", "THShowGSMRSSI");
+    std::string told;
+    while (told.find("THShowGSMRSSI") == std::string::npos && std::fgets(line, sizeof line, monitor))
+        told += line;
+    ::kill(process, SIGTERM);
+    ::pclose(monitor);
+    EXPECT_NE(told.find("path=/org/spectrel/Preferences; interface=org.spectrel.Preferences; member=Changed"),
+        std::string::npos);
+    EXPECT_NE(told.find("string \"org.spectrel.Home\"\n   string \"THShowGSMRSSI\""), std::string::npos) << told;
+    ::unsetenv("DBUS_SESSION_BUS_ADDRESS");
+}
+
+} // namespace
+} // namespace spectrel

@@ -1,0 +1,412 @@
+#include "Telephony/TelephonyService.h"
+
+#include "Platform/Dictionary.h"
+#include "Platform/List.h"
+#include "Platform/PropertyList.h"
+#include "Platform/TelephonyConstants.h"
+#include "Platform/TelephonyProtocol.h"
+#include "Telephony/ReplaySource.h"
+#include "Telephony/Simulator/SimulatorSource.h"
+#include "Tests/Fakes/DisplayText.h"
+#include "Tests/Fakes/FakeMessagePorts.h"
+#include "Tests/Fakes/FakeRunLoop.h"
+#include "Tests/Fakes/RecordBuilder.h"
+
+#include <algorithm>
+#include <cstdlib>
+#include <filesystem>
+#include <gtest/gtest.h>
+
+namespace spectrel {
+namespace {
+
+using namespace std::chrono_literals;
+
+/// Hands its messages over at once and remembers who listens.
+class ListSource final : public LogSource {
+public:
+    class Stream final : public LogStream {
+    public:
+        Stream(ListSource& source, MessageSink& sink)
+            : _source(source)
+            , _sink(sink)
+        {
+            ++_source.streams;
+            resume();
+        }
+        ~Stream() override
+        {
+            --_source.streams;
+        }
+        void resume() override
+        {
+            while (_next < _source.messages.size() && _sink.deliver(_source.messages[_next]))
+                ++_next;
+        }
+
+    private:
+        ListSource& _source;
+        MessageSink& _sink;
+        std::size_t _next = 0;
+    };
+
+    Technology technology() const override
+    {
+        return Technology::GSM;
+    }
+    std::unique_ptr<LogStream> start(MessageSink& sink) override
+    {
+        return std::make_unique<Stream>(*this, sink);
+    }
+    std::vector<Bytes> messages;
+    int streams = 0;
+};
+
+class TelephonyServiceTest : public testing::Test {
+protected:
+    TelephonyServiceTest()
+    {
+        EXPECT_TRUE(service.start());
+        for (const std::uint32_t code : { 0xB0C2u, 0xB0C1u, 0xFF0001u })
+            source.messages.push_back(RecordBuilder(code, 13).bytes());
+    }
+
+    Value ask(const std::string& port, std::int32_t id, const Value& request)
+    {
+        const auto text = serialisePropertyList(request);
+        const auto reply = ports.request(port, id, Bytes(text->begin(), text->end()));
+        const auto value = reply ? parsePropertyList(*reply) : std::nullopt;
+        return value.value_or(Value());
+    }
+    std::string openChannel(const std::string& client = "client")
+    {
+        const Value reply = ask("org.spectrel.Telephony", 1, Dictionary::make({ { "CreateLogChannel", client } }));
+        return *(*reply.dictionary())["PortName"].string();
+    }
+    void start(const std::string& channel, ListRef ordinary, ListRef extra)
+    {
+        auto command = Dictionary::make({ { "SetState", "Streaming" } });
+        command->set("SetZephyrLogCodes", ordinary);
+        command->set("SetRkExtraCodes", extra);
+        ports.sent.clear();
+        EXPECT_TRUE(ask(channel, 0, command).isAbsent()) << "a start command is not answered";
+    }
+    static ListRef codes(std::initializer_list<int> numbers)
+    {
+        auto list = List::make();
+        for (const int number : numbers)
+            list->append(Value::integer(number));
+        return list;
+    }
+
+    FakeRunLoop loop;
+    FakeMessagePorts ports;
+    ListSource source;
+    TelephonyService service{ loop, ports, source };
+};
+
+TEST_F(TelephonyServiceTest, ChannelIsOpenedWithAPortOfItsOwn)
+{
+    EXPECT_EQ(displayText(ask("org.spectrel.Telephony", 1, Dictionary::make({ { "CreateLogChannel", "client" } }))),
+        "{\"Domain\": int 0, \"Error\": int 0, \"PortName\": \"org.spectrel.Telephony.LogChannel.1\"}");
+    EXPECT_NE(openChannel("other"), openChannel("third"));
+    EXPECT_EQ(service.channels(), 3u);
+}
+
+TEST_F(TelephonyServiceTest, MalformedWishGetsAnErrorAndNoChannel)
+{
+    const Value wishes[] = { Dictionary::make(), Dictionary::make({ { "CreateLogChannel", "" } }),
+        Dictionary::make({ { "CreateLogChannel", Value::integer(1) } }), List::make() };
+    for (const Value& wish : wishes)
+        EXPECT_EQ((*ask("org.spectrel.Telephony", 1, wish).dictionary())["Error"].int32(), 22) << displayText(wish);
+    EXPECT_EQ((*ask("org.spectrel.Telephony", 9, wishes[0]).dictionary())["Error"].int32(), 22);
+    const Bytes garbage{ 1, 2 };
+    EXPECT_TRUE(ports.request("org.spectrel.Telephony", 1, garbage));
+    EXPECT_EQ(service.channels(), 0u);
+}
+
+TEST_F(TelephonyServiceTest, ClientWithoutAPortGetsAnError)
+{
+    ports.refuseRemote = true;
+    EXPECT_EQ(
+        (*ask("org.spectrel.Telephony", 1, Dictionary::make({ { "CreateLogChannel", "gone" } })).dictionary())["Error"]
+            .int32(),
+        2);
+}
+
+TEST_F(TelephonyServiceTest, ChannelsAreBounded)
+{
+    for (std::size_t count = 0; count < TelephonyService::MostChannels; ++count)
+        openChannel();
+    EXPECT_EQ(
+        (*ask("org.spectrel.Telephony", 1, Dictionary::make({ { "CreateLogChannel", "one" } })).dictionary())["Error"]
+            .int32(),
+        24);
+}
+
+TEST_F(TelephonyServiceTest, TechnologyIsTheSources)
+{
+    EXPECT_EQ(displayText(ask(openChannel(), 0, Dictionary::make({ { "GetTechnology", "GetTechnology" } }))),
+        "{\"GetTechnology\": \"kRKLogChannelTechnology_Zephyr_GSM\"}");
+}
+
+TEST_F(TelephonyServiceTest, OnlyTheRequestedCodesAreStreamed)
+{
+    const std::string channel = openChannel();
+    start(channel, codes({ 0xB0C2 }), codes({ 1 }));
+    ASSERT_EQ(ports.sent.size(), 2u);
+    EXPECT_EQ(ports.sent[0].id, 0);
+    EXPECT_EQ(ports.sent[0].body[4], '\xB0');
+    EXPECT_EQ(ports.sent[1].body[0], '\xFF');
+    start(channel, codes({}), codes({}));
+    EXPECT_TRUE(ports.sent.empty());
+    start(channel, codes({ 0xB0C2, 0xB0C1 }), nullptr);
+    EXPECT_EQ(ports.sent.size(), 2u) << "an absent list wants nothing of its stream";
+    EXPECT_EQ(source.streams, 1) << "a further start command replaces the stream";
+}
+
+TEST_F(TelephonyServiceTest, StartWithoutAnyCodeListStreamsEverything)
+{
+    start(openChannel(), nullptr, nullptr);
+    EXPECT_EQ(ports.sent.size(), 3u);
+}
+
+TEST_F(TelephonyServiceTest, MalformedRequestsGetAnErrorAnswer)
+{
+    const std::string channel = openChannel();
+    const Value requests[] = { Dictionary::make({ { "SetState", "Idle" } }), List::make(), "Streaming",
+        Dictionary::make({ { "SetState", "Streaming" }, { "SetZephyrLogCodes", "all" } }),
+        Dictionary::make({ { "SetState", "Streaming" }, { "SetZephyrLogCodes", codes({ 65536 }) } }),
+        Dictionary::make({ { "SetState", "Streaming" }, { "SetRkExtraCodes", codes({ -1 }) } }) };
+    for (const Value& request : requests)
+        EXPECT_TRUE((*ask(channel, 0, request).dictionary())["Error"].string()) << displayText(request);
+    EXPECT_TRUE((*ask(channel, 7, requests[0]).dictionary())["Error"].string());
+    EXPECT_EQ(source.streams, 0);
+}
+
+TEST_F(TelephonyServiceTest, DeathOfAClientFreesItsChannelAndNoOther)
+{
+    start(openChannel("first"), codes({ 0xB0C2 }), nullptr);
+    EXPECT_EQ(source.streams, 1);
+    ports.killPeers();
+    start(openChannel("second"), codes({ 0xB0C2 }), nullptr);
+    loop.runQueued();
+    EXPECT_EQ(service.channels(), 1u);
+    EXPECT_EQ(source.streams, 1);
+    EXPECT_EQ(ports.localPorts(), 2u) << "the service's and the second channel's";
+}
+
+TEST_F(TelephonyServiceTest, FullClientStopsTheStreamUntilThereIsRoom)
+{
+    bool isFull = true;
+    ports.answer = [&isFull](const auto&) {
+        return FakeMessagePorts::Answer{ isFull ? SendStatus::SendTimeout : SendStatus::Success, {} };
+    };
+    start(openChannel(), nullptr, nullptr);
+    EXPECT_EQ(ports.sent.size(), 1u) << "one attempt";
+    isFull = false;
+    ports.makeRoom();
+    EXPECT_EQ(ports.sent.size(), 4u);
+}
+
+TEST_F(TelephonyServiceTest, SecondServiceIsRefused)
+{
+    TelephonyService second(loop, ports, source);
+    EXPECT_FALSE(second.start());
+}
+
+/// Collects what a stream delivers.
+class Collector final : public MessageSink {
+public:
+    bool deliver(ByteView message) override
+    {
+        if (isFull)
+            return false;
+        messages.emplace_back(message.begin(), message.end());
+        return true;
+    }
+    std::size_t count(std::uint8_t type, std::uint8_t lowCode) const
+    {
+        return static_cast<std::size_t>(std::count_if(messages.begin(), messages.end(),
+            [&](const Bytes& message) { return message[0] == type && message[3] == lowCode; }));
+    }
+    std::vector<Bytes> messages;
+    bool isFull = false;
+};
+
+class SimulatorSourceTest : public testing::Test {
+protected:
+    FakeRunLoop loop;
+    SimulatorSource source{ loop, loop, 1, 1 };
+    Collector collector;
+};
+
+TEST_F(SimulatorSourceTest, NewChannelGetsTheSlowRecordsAtOnce)
+{
+    const auto stream = source.start(collector);
+    EXPECT_EQ(collector.count(0xFF, 0), 1u);
+    EXPECT_EQ(collector.count(0xFF, 1), 1u);
+    EXPECT_EQ(collector.count(0xFF, 2), 1u);
+}
+
+TEST_F(SimulatorSourceTest, RecordsComeSteadily)
+{
+    const auto stream = source.start(collector);
+    collector.messages.clear();
+    loop.advance(20s);
+    EXPECT_EQ(collector.count(0x01, 0xC2), 50u);
+    EXPECT_EQ(collector.count(0x01, 0xC1), 25u);
+    EXPECT_EQ(collector.count(0xFF, 1), 10u);
+    EXPECT_EQ(collector.count(0xFF, 0), 2u);
+}
+
+TEST_F(SimulatorSourceTest, ItMovesOnlyWhileSomebodyListens)
+{
+    EXPECT_EQ(loop.timers(), 0u);
+    auto stream = source.start(collector);
+    EXPECT_EQ(loop.timers(), 1u);
+    stream.reset();
+    EXPECT_EQ(loop.timers(), 0u);
+}
+
+TEST_F(SimulatorSourceTest, TwoChannelsSeeTheSamePhone)
+{
+    Collector other;
+    const auto first = source.start(collector);
+    const auto second = source.start(other);
+    loop.advance(30s);
+    EXPECT_EQ(collector.messages, other.messages);
+}
+
+TEST_F(SimulatorSourceTest, BusyClientLosesNothingOnceItTakesAgain)
+{
+    Collector other;
+    const auto first = source.start(collector);
+    const auto second = source.start(other);
+    other.isFull = true;
+    loop.advance(10s);
+    EXPECT_LT(other.messages.size(), collector.messages.size());
+    other.isFull = false;
+    second->resume();
+    EXPECT_EQ(collector.messages, other.messages);
+}
+
+class ReplaySourceTest : public testing::Test {
+protected:
+    ReplaySourceTest()
+    {
+        std::string pattern = testing::TempDir() + "replay-XXXXXX";
+        folder = ::mkdtemp(pattern.data());
+    }
+    ~ReplaySourceTest() override
+    {
+        std::filesystem::remove_all(folder);
+    }
+    std::string recordingOf(int count, Technology technology = Technology::LTE)
+    {
+        std::string path = folder + "/" + std::to_string(++_files) + ".pcap";
+        const auto writer = createRecording(path, technology, reason);
+        for (int number = 0; number < count; ++number)
+            writer->write(Moment(std::chrono::seconds(1000 + number)),
+                RecordBuilder(0xB0C2, 13).u8(12, static_cast<std::uint32_t>(number)));
+        writer->flush();
+        return path;
+    }
+    std::unique_ptr<ReplaySource> open(ReplayOptions options)
+    {
+        return ReplaySource::open(loop, loop, std::move(options), reason);
+    }
+
+    FakeRunLoop loop;
+    Collector collector;
+    std::string folder;
+    std::string reason;
+
+private:
+    int _files = 0;
+};
+
+TEST_F(ReplaySourceTest, MessagesKeepTheirDistances)
+{
+    const auto source = open({ { recordingOf(5) }, 1, false, {} });
+    EXPECT_EQ(source->technology(), Technology::LTE);
+    const auto stream = source->start(collector);
+    loop.runQueued();
+    EXPECT_EQ(collector.messages.size(), 1u);
+    loop.advance(2s);
+    EXPECT_EQ(collector.messages.size(), 3u);
+    loop.advance(60s);
+    EXPECT_EQ(collector.messages.size(), 5u);
+}
+
+TEST_F(ReplaySourceTest, SpeedShortensThem)
+{
+    const auto source = open({ { recordingOf(5) }, 10, false, {} });
+    const auto stream = source->start(collector);
+    loop.advance(400ms);
+    EXPECT_EQ(collector.messages.size(), 5u);
+}
+
+TEST_F(ReplaySourceTest, SpeedZeroIsAsFastAsTheClientTakesThem)
+{
+    const auto source = open({ { recordingOf(500), recordingOf(3) }, 0, false, {} });
+    const auto stream = source->start(collector);
+    loop.runQueued();
+    EXPECT_EQ(collector.messages.size(), 503u);
+}
+
+TEST_F(ReplaySourceTest, EachChannelHearsItFromTheStart)
+{
+    const auto source = open({ { recordingOf(3) }, 0, false, {} });
+    const auto first = source->start(collector);
+    loop.runQueued();
+    Collector late;
+    const auto second = source->start(late);
+    loop.runQueued();
+    EXPECT_EQ(collector.messages, late.messages);
+}
+
+TEST_F(ReplaySourceTest, LoopBeginsAnew)
+{
+    const auto source = open({ { recordingOf(2) }, 1, true, {} });
+    const auto stream = source->start(collector);
+    loop.advance(10s);
+    EXPECT_GT(collector.messages.size(), 10u);
+}
+
+TEST_F(ReplaySourceTest, LoopOverNothingEnds)
+{
+    const auto source = open({ { recordingOf(0) }, 0, true, {} });
+    const auto stream = source->start(collector);
+    loop.advance(10s);
+    EXPECT_TRUE(collector.messages.empty());
+}
+
+TEST_F(ReplaySourceTest, SlowClientLosesNothing)
+{
+    const auto source = open({ { recordingOf(5) }, 0, false, {} });
+    collector.isFull = true;
+    const auto stream = source->start(collector);
+    loop.advance(10s);
+    collector.isFull = false;
+    stream->resume();
+    loop.runQueued();
+    ASSERT_EQ(collector.messages.size(), 5u);
+    for (std::size_t number = 0; number < 5; ++number)
+        EXPECT_EQ(collector.messages[number][12], number);
+}
+
+TEST_F(ReplaySourceTest, FilesOfTwoTechnologiesAreRefused)
+{
+    EXPECT_EQ(open({ { recordingOf(1), recordingOf(1, Technology::GSM) }, 1, false, {} }), nullptr);
+    EXPECT_NE(reason.find("2.pcap: is of technology gsm"), std::string::npos) << reason;
+}
+
+TEST_F(ReplaySourceTest, MissingFileIsNamed)
+{
+    EXPECT_EQ(open({ { folder + "/nowhere.pcap" }, 1, false, {} }), nullptr);
+    EXPECT_NE(reason.find("nowhere.pcap: "), std::string::npos) << reason;
+}
+
+} // namespace
+} // namespace spectrel
