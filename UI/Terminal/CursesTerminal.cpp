@@ -125,7 +125,9 @@ void CursesTerminal::rememberLeavingSequence() const
     std::string sequence;
     if (::has_mouse())
         sequence += "\033[?1006l\033[?1003l\033[?1002l\033[?1000l";
-    for (const char* name : { "sgr0", "op", "rmkx", "rmcup", "cnorm" })
+    if (_hasColours)
+        sequence += capability("op");
+    for (const char* name : { "sgr0", "rmkx", "rmcup", "cnorm" })
         sequence += capability(name);
     TerminalGuard::setLeavingSequence(sequence);
 }
