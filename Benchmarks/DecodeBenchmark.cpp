@@ -45,7 +45,7 @@ public:
 private:
     Bytes servingCell(int number)
     {
-        Bytes record{ 0x01, 39, 0, 0xC2, 0xB0 };
+        Bytes record {0x01, 39, 0, 0xC2, 0xB0};
         record.resize(40);
         const auto put = [&record](std::size_t offset, unsigned value, std::size_t width) {
             for (std::size_t byte = 0; byte < width; ++byte)

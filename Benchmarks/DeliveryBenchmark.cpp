@@ -22,7 +22,7 @@ constexpr std::size_t MessageSize = 200;
 /// The same bytes through a bare pair of sequential-packet sockets, a batch written, a batch read.
 void deliverRaw(const std::array<int, 2>& sockets)
 {
-    std::array<std::uint8_t, MessageSize> message{ 1 };
+    std::array<std::uint8_t, MessageSize> message {1};
     std::array<std::uint8_t, 2 * MessageSize> received;
     for (int sent = 0; sent < Messages; sent += Batch) {
         for (int count = 0; count < Batch; ++count)
@@ -78,7 +78,7 @@ void DeliverMessages(benchmark::State& run)
     std::string folder = "/tmp/spectrel-benchmark-XXXXXX";
     if (!::mkdtemp(folder.data()))
         return run.SkipWithError("no folder");
-    std::array<int, 2> sockets{};
+    std::array<int, 2> sockets {};
     if (::socketpair(AF_UNIX, SOCK_SEQPACKET, 0, sockets.data()) != 0)
         return run.SkipWithError("no sockets");
     {

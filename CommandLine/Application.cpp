@@ -67,9 +67,9 @@ public:
             report("cannot open the terminal screens: " + reason);
             return ExitStatus::Failed;
         }
-        SpectrelApp application({ _live.runLoop(), _live.clock(), _preferences, _frontEnd.toolkit(),
+        SpectrelApp application({_live.runLoop(), _live.clock(), _preferences, _frontEnd.toolkit(),
             [this](SpectrelModelObserver& observer) { return makeModel(observer); }, writeSnapshot,
-            Places::crashLogDirectory() });
+            Places::crashLogDirectory()});
         application.applicationDidFinishLaunching();
         _live.runLoop().run();
         Ending::remove();

@@ -112,8 +112,8 @@ void addRecord(CLI::App& program, Arguments& arguments)
 
 std::optional<std::chrono::milliseconds> parseDuration(std::string_view text)
 {
-    static constexpr std::array<std::pair<std::string_view, double>, 5> Units{ { { "ms", 1.0 }, { "s", 1e3 },
-        { "m", 60e3 }, { "h", 3600e3 }, { "", 1e3 } } };
+    static constexpr std::array<std::pair<std::string_view, double>, 5> Units {
+        {{"ms", 1.0}, {"s", 1e3}, {"m", 60e3}, {"h", 3600e3}, {"", 1e3}}};
     const std::size_t digits = std::min(text.find_first_not_of("0123456789."), text.size());
     double number = 0;
     const auto result = std::from_chars(text.data(), text.data() + digits, number);

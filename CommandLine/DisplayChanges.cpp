@@ -58,7 +58,7 @@ void DisplayChanges::updateChildren(Shadow& shadow, const Value& value, const Re
         char name[24];
         for (const Value& element : value.list()->elements()) {
             const auto end = std::to_chars(name, name + sizeof name, position).ptr;
-            visit({ name, static_cast<std::size_t>(end - name) }, element);
+            visit({name, static_cast<std::size_t>(end - name)}, element);
         }
     }
     for (std::size_t gone = position; gone < shadow.children.size(); ++gone) {
@@ -78,7 +78,7 @@ DisplayChanges::Shadow& DisplayChanges::shadowOf(
     const auto found = std::find_if(place, children.end(), [name](const Shadow& child) { return child.name == name; });
     if (found == children.end()) {
         isNew = true;
-        return *children.insert(place, Shadow{ std::string(name), {}, false, {} });
+        return *children.insert(place, Shadow {std::string(name), {}, false, {}});
     }
     std::rotate(place, found, found + 1);
     return *place;

@@ -29,7 +29,7 @@ public:
     }
     SpectrelModel::Services services()
     {
-        return { _runLoop, _ports, _telephony };
+        return {_runLoop, _ports, _telephony};
     }
     /// A port prefix for a program that runs beside the application: the job's name and the process's number in it.
     static std::string portPrefixFor(const std::string& job);

@@ -41,8 +41,8 @@ private:
     std::uint64_t _messages = 0;
     std::size_t _rawBytes = 0; // kept by the generator since it last let go of them
     bool _updated = false; // since the last refresh
-    Moment _first{};
-    Moment _last{};
+    Moment _first {};
+    Moment _last {};
 };
 
 } // namespace spectrel

@@ -41,13 +41,13 @@ void appendCsvField(std::string_view field, std::string& out)
 
 std::optional<OutputFormat> outputFormatNamed(std::string_view name)
 {
-    static constexpr std::array<std::pair<std::string_view, OutputFormat>, 5> Formats{ {
-        { "tree", OutputFormat::Tree },
-        { "json", OutputFormat::Json },
-        { "changes", OutputFormat::Changes },
-        { "csv", OutputFormat::Csv },
-        { "none", OutputFormat::None },
-    } };
+    static constexpr std::array<std::pair<std::string_view, OutputFormat>, 5> Formats {{
+        {"tree", OutputFormat::Tree},
+        {"json", OutputFormat::Json},
+        {"changes", OutputFormat::Changes},
+        {"csv", OutputFormat::Csv},
+        {"none", OutputFormat::None},
+    }};
     for (const auto& [known, format] : Formats) {
         if (known == name)
             return format;

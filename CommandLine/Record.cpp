@@ -15,7 +15,7 @@ namespace spectrel {
 namespace {
 
 /// Messages reach the file at the latest this long after they came.
-constexpr std::chrono::milliseconds FlushDelay{ 500 };
+constexpr std::chrono::milliseconds FlushDelay {500};
 
 class Recorder final : public SpectrelModelObserver {
 public:

@@ -24,7 +24,7 @@ public:
     std::string formatted(Moment moment, std::string_view pattern) const override;
 
 private:
-    Moment _now{};
+    Moment _now {};
 };
 
 } // namespace spectrel

@@ -44,7 +44,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t siz
     const OneTemplate resources({bytes, size});
     const auto generator = LTELogGenerator::generator();
     Dictionary state;
-    std::array<std::uint8_t, 40> servingCell{0x01, 39, 0, 0xC2, 0xB0};
+    std::array<std::uint8_t, 40> servingCell {0x01, 39, 0, 0xC2, 0xB0};
     generator->updateState(state, servingCell);
     generator->updateState(state, servingCell);
     PathIndex paths;

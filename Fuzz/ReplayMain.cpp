@@ -13,7 +13,7 @@ namespace {
 void replay(const std::filesystem::path& path)
 {
     std::ifstream file(path, std::ios::binary);
-    const std::string input{ std::istreambuf_iterator<char>(file), {} };
+    const std::string input {std::istreambuf_iterator<char>(file), {}};
     LLVMFuzzerTestOneInput(reinterpret_cast<const std::uint8_t*>(input.data()), input.size());
 }
 

@@ -12,7 +12,7 @@ void GeneratorSlot::replace(std::unique_ptr<LogGenerator> successor, Dictionary&
     if (goesOn) {
         successor->takeOver(_generator.get(), state);
     } else if (successor) {
-        for (const std::string_view key : { StateKey::Template, StateKey::Display, StateKey::Lookup })
+        for (const std::string_view key : {StateKey::Template, StateKey::Display, StateKey::Lookup})
             state.remove(key);
     }
     if (successor)

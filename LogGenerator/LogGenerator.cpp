@@ -17,7 +17,7 @@ DictionaryRef makeHistoryEntry(const Dictionary& state)
     if (displayState.isAbsent())
         return entry;
     entry->set(StateKey::DisplayState, copyTopLevel(displayState));
-    for (const std::string_view key : { StateKey::Display, StateKey::ExtraInfo }) {
+    for (const std::string_view key : {StateKey::Display, StateKey::ExtraInfo}) {
         const Value& value = state[key];
         if (value.isAbsent())
             return entry;

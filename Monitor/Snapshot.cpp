@@ -10,7 +10,7 @@ namespace spectrel {
 
 DictionaryRef makeSnapshot(Moment openedAt, ListRef saveContents, const std::optional<std::string>& description)
 {
-    auto snapshot = Dictionary::make({ { "Timestamp", defaultDateForm(openedAt) } });
+    auto snapshot = Dictionary::make({{"Timestamp", defaultDateForm(openedAt)}});
     // The first absent value ends the dictionary.
     if (!saveContents)
         return snapshot;

@@ -16,7 +16,7 @@ constexpr std::int32_t LogMessageId = 0;
 
 ByteView bytesOf(const std::string& text)
 {
-    return { reinterpret_cast<const std::uint8_t*>(text.data()), text.size() };
+    return {reinterpret_cast<const std::uint8_t*>(text.data()), text.size()};
 }
 
 /// A log line as a person would read it: without the stars and blanks around it.
@@ -121,7 +121,7 @@ bool SpectrelModel::openLogChannel(const std::string& localName, std::string& se
 
 void SpectrelModel::configureGenerator()
 {
-    const auto request = serialisePropertyList(Dictionary::make({ { "GetTechnology", "GetTechnology" } }));
+    const auto request = serialisePropertyList(Dictionary::make({{"GetTechnology", "GetTechnology"}}));
     if (!request) {
         fail(" Could not generate GetTechnology command; cannot configure");
         return;

@@ -44,9 +44,9 @@ public:
         TelephonyServer& telephony;
     };
 
-    static constexpr std::chrono::milliseconds RefreshInterval{ 2000 };
-    static constexpr std::chrono::seconds RetryDelay{ 5 };
-    static constexpr std::chrono::seconds RequestTimeout{ 1 };
+    static constexpr std::chrono::milliseconds RefreshInterval {2000};
+    static constexpr std::chrono::seconds RetryDelay {5};
+    static constexpr std::chrono::seconds RequestTimeout {1};
     /// The application's name on the message ports; other programs take one of their own in its place.
     static constexpr std::string_view ApplicationPrefix = "org.spectrel.Spectrel";
 

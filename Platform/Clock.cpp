@@ -67,8 +67,8 @@ bool parseDefaultDateForm(std::string_view text, Moment& moment)
             number = number * 10 + (text[i] - '0');
         return number;
     };
-    const std::chrono::year_month_day date{ std::chrono::year(field(0, 4)),
-        std::chrono::month(static_cast<unsigned>(field(5, 2))), std::chrono::day(static_cast<unsigned>(field(8, 2))) };
+    const std::chrono::year_month_day date {std::chrono::year(field(0, 4)),
+        std::chrono::month(static_cast<unsigned>(field(5, 2))), std::chrono::day(static_cast<unsigned>(field(8, 2)))};
     if (!date.ok() || field(11, 2) > 23 || field(14, 2) > 59 || field(17, 2) > 59 || field(23, 2) > 59)
         return false;
     const auto east = std::chrono::minutes((field(21, 2) * 60 + field(23, 2)) * (text[20] == '-' ? -1 : 1));

@@ -61,7 +61,7 @@ std::size_t Dictionary::positionOf(std::string_view key) const
         return _next++;
     if (count > LargestWalked) {
         if (!_index) {
-            _index = std::make_unique<Index>(ByKey{ &_entries });
+            _index = std::make_unique<Index>(ByKey {&_entries});
             for (std::size_t position = 0; position < count; ++position)
                 _index->insert(position);
         }
@@ -82,7 +82,7 @@ std::size_t Dictionary::positionOf(std::string_view key) const
 
 std::size_t Dictionary::append(std::string_view key, Value value)
 {
-    _entries.push_back({ std::string(key), std::move(value) });
+    _entries.push_back({std::string(key), std::move(value)});
     const std::size_t position = _entries.size() - 1;
     if (_index)
         _index->insert(position);

@@ -66,7 +66,7 @@ std::string Places::resourcesDirectory()
 {
     std::error_code error;
     const fs::path program = fs::read_symlink("/proc/self/exe", error).parent_path();
-    for (const fs::path& candidate : { program / "Resources", program.parent_path() / "Resources" }) {
+    for (const fs::path& candidate : {program / "Resources", program.parent_path() / "Resources"}) {
         if (!error && fs::is_directory(candidate, error))
             return candidate.string();
     }

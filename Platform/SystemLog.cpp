@@ -27,7 +27,7 @@ void writeLogLine(int priority, const char* format, ...)
     const int length = std::vsnprintf(line, sizeof line, format, arguments);
     va_end(arguments);
     if (length >= 0 && static_cast<std::size_t>(length) < sizeof line) {
-        SystemLog::installed()->write(priority, { line, static_cast<std::size_t>(length) });
+        SystemLog::installed()->write(priority, {line, static_cast<std::size_t>(length)});
     } else if (length >= 0) {
         std::string text(static_cast<std::size_t>(length) + 1, '\0');
         std::vsnprintf(text.data(), text.size(), format, again);

@@ -24,7 +24,7 @@ TextBuffer& TextBuffer::fixed2(double number)
     const auto length = static_cast<std::size_t>(result.ptr - digits);
     if (length < 4) // only "inf"
         text(" ");
-    return text({ digits, length });
+    return text({digits, length});
 }
 
 TextBuffer& TextBuffer::text(std::string_view text)

@@ -22,7 +22,7 @@ public:
     }
     std::string_view view() const
     {
-        return { _characters, _length };
+        return {_characters, _length};
     }
 
 private:

@@ -25,11 +25,11 @@ public:
     constexpr Integer() = default;
     static constexpr Integer fromSigned(std::int64_t value)
     {
-        return { static_cast<std::uint64_t>(value), value < 0 };
+        return {static_cast<std::uint64_t>(value), value < 0};
     }
     static constexpr Integer fromUnsigned(std::uint64_t value)
     {
-        return { value, false };
+        return {value, false};
     }
 
     constexpr bool isNegative() const

@@ -125,7 +125,7 @@ private:
     std::size_t _file = 0; // the next one to open
     std::optional<RecordedMessage> _message; // read, not delivered yet
     std::optional<Moment> _origin;
-    Moment _startedAt{};
+    Moment _startedAt {};
     bool _isStopped = false; // the client had no room
     bool _hasPlayed = false; // since the last rewind
 };

@@ -14,11 +14,11 @@ using Protocol::ChannelError;
 Bytes answer(ChannelError error, const std::string& portName = {})
 {
     const auto text = serialisePropertyList(Dictionary::make({
-        { std::string(Protocol::DomainKey), Value::integer(error == ChannelError::None ? 0 : 1) },
-        { std::string(Protocol::ErrorKey), Value::integer(static_cast<std::int32_t>(error)) },
-        { std::string(Protocol::PortNameKey), portName },
+        {std::string(Protocol::DomainKey), Value::integer(error == ChannelError::None ? 0 : 1)},
+        {std::string(Protocol::ErrorKey), Value::integer(static_cast<std::int32_t>(error))},
+        {std::string(Protocol::PortNameKey), portName},
     }));
-    return { text->begin(), text->end() };
+    return {text->begin(), text->end()};
 }
 
 } // namespace

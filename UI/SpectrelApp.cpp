@@ -42,7 +42,7 @@ void SpectrelApp::applicationDidFinishLaunching()
 {
     getSaveButtonPref();
     const Size screen = _services.toolkit.mainScreenSize();
-    _window = std::make_unique<Window>(Window{ { 0, 0, screen.width, screen.height } });
+    _window = std::make_unique<Window>(Window {{0, 0, screen.width, screen.height}});
     _model = _services.makeModel(*this);
     setUpdateMessage(ConnectingAgain);
     _dateFormatter = std::make_unique<DateFormatter>(_services.clock, UpdatedPattern);
@@ -96,8 +96,8 @@ void SpectrelApp::showSaveView()
     if (_saveViewController || !_model)
         return;
     setSaveViewController(std::make_unique<SpectrelSaveViewController>(
-        SpectrelSaveViewController::Services{ _services.toolkit, _services.runLoop, _services.clock,
-            _services.writeSnapshot, _services.snapshotDirectory },
+        SpectrelSaveViewController::Services {_services.toolkit, _services.runLoop, _services.clock,
+            _services.writeSnapshot, _services.snapshotDirectory},
         _model->getSaveContents()));
     _saveViewController->viewWillAppear();
     _services.toolkit.screenDidChange(ScreenPart::Modal, Animation::Animated);

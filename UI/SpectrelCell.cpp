@@ -5,8 +5,8 @@
 
 namespace spectrel {
 
-const Font SpectrelCell::KeyFont{ 15, FontWeight::Bold };
-const Font SpectrelCell::ValueFont{ 15, FontWeight::Regular };
+const Font SpectrelCell::KeyFont {15, FontWeight::Bold};
+const Font SpectrelCell::ValueFont {15, FontWeight::Regular};
 
 double ScrollView::scrollableWidth() const
 {
@@ -53,7 +53,7 @@ Size SpectrelCell::placeKey()
 {
     const Size size = _toolkit.sizeOfText(key.text, KeyFont);
     const Rect& content = contentBounds;
-    key.frame = { content.x + KeyInset, (content.height - size.height) * 0.5, size.width, size.height };
+    key.frame = {content.x + KeyInset, (content.height - size.height) * 0.5, size.width, size.height};
     return size;
 }
 
@@ -77,11 +77,11 @@ void SpectrelCell::setLayout()
     const double needed = keySize.width + KeyInset + MinimumGap + valueSize.width;
     const double x =
         needed < content.width ? content.width - valueSize.width : content.x + KeyInset + keySize.width + MinimumGap;
-    value->frame = { x, (content.height - valueSize.height) * 0.5, valueSize.width, valueSize.height };
+    value->frame = {x, (content.height - valueSize.height) * 0.5, valueSize.width, valueSize.height};
     const double contentWidth =
         needed > content.width ? content.width + keySize.width + valueSize.width : content.width;
-    view->contentSize = { contentWidth, ScrollViewHeight };
-    view->frame = { content.x, content.y, content.width, ScrollViewHeight };
+    view->contentSize = {contentWidth, ScrollViewHeight};
+    view->frame = {content.x, content.y, content.width, ScrollViewHeight};
     view->contentOffset = std::min(view->contentOffset, view->scrollableWidth());
 }
 

@@ -9,7 +9,7 @@
 
 namespace spectrel {
 
-const Font SpectrelPaneController::StatusFont{ 14 };
+const Font SpectrelPaneController::StatusFont {14};
 
 SpectrelPaneController::SpectrelPaneController(ScreenToolkit& toolkit, NodeRef node, std::string path)
     : _toolkit(toolkit)
@@ -39,16 +39,16 @@ void SpectrelPaneController::createToolbarItems()
     using Item = ToolbarItem::Kind;
     const SpectrelApp* app = SpectrelApp::sharedApplication();
     _toolbarItems.clear();
-    _toolbarItems.push_back({ .kind = Item::LoadingIndicator, .isSpinning = _isLoading });
-    _toolbarItems.push_back({ .kind = Item::Label, .text = _status, .font = StatusFont });
+    _toolbarItems.push_back({.kind = Item::LoadingIndicator, .isSpinning = _isLoading});
+    _toolbarItems.push_back({.kind = Item::Label, .text = _status, .font = StatusFont});
     if (app && !app->lostReason().empty())
-        _toolbarItems.push_back({ .kind = Item::Label, .text = app->lostReason(), .font = StatusFont });
-    _toolbarItems.push_back({ .kind = Item::FlexibleSpace });
+        _toolbarItems.push_back({.kind = Item::Label, .text = app->lostReason(), .font = StatusFont});
+    _toolbarItems.push_back({.kind = Item::FlexibleSpace});
     if (app && app->allowSaveButton()) {
-        _toolbarItems.push_back({ .kind = Item::SaveButton, .action = [] {
+        _toolbarItems.push_back({.kind = Item::SaveButton, .action = [] {
                                      if (SpectrelApp* current = SpectrelApp::sharedApplication())
                                          current->showSaveView();
-                                 } });
+                                 }});
     }
     _toolkit.screenDidChange(ScreenPart::Toolbar, Animation::Animated);
 }

@@ -9,7 +9,7 @@
 
 namespace spectrel {
 
-const Font SpectrelSaveViewController::CellFont{ 13, FontWeight::Regular, "Helvetica" };
+const Font SpectrelSaveViewController::CellFont {13, FontWeight::Regular, "Helvetica"};
 
 SpectrelSaveViewController::SpectrelSaveViewController(Services services, const ListRef& saveHistory)
     : _services(std::move(services))
@@ -30,7 +30,7 @@ void SpectrelSaveViewController::viewDidLoad()
 void SpectrelSaveViewController::viewWillAppear()
 {
     const Size screen = _services.toolkit.mainScreenSize();
-    _frame = { 0, 0, screen.width, screen.height };
+    _frame = {0, 0, screen.width, screen.height};
 }
 
 void SpectrelSaveViewController::savePressed()
@@ -40,7 +40,7 @@ void SpectrelSaveViewController::savePressed()
     std::string reason;
     if (!_services.writeSnapshot(snapshot, path, reason)) {
         SPECTREL_LOG(Priority::Error, "Unable to write snapshot to %s", path.c_str());
-        _services.toolkit.showAlert({ "File Error", "Unable to write file to disk", "Close" });
+        _services.toolkit.showAlert({"File Error", "Unable to write file to disk", "Close"});
     }
     closeLater();
 }

@@ -11,10 +11,6 @@ target_compile_options(spectrel_options INTERFACE
     $<$<CXX_COMPILER_ID:GNU>:-Wno-restrict>) # g++ 12 sees overlaps in "text" + std::string where there are none
 target_include_directories(spectrel_options INTERFACE ${CMAKE_SOURCE_DIR})
 target_compile_definitions(spectrel_options INTERFACE SPECTREL_VERSION="${PROJECT_VERSION}")
-if(CMAKE_CXX_COMPILER_ID STREQUAL "GNU")
-    # g++ 12 sees overlapping copies in std::string's own operator+ once it optimises.
-    target_compile_options(spectrel_options INTERFACE -Wno-restrict)
-endif()
 if(SPECTREL_SANITIZERS)
     target_compile_options(spectrel_options INTERFACE
         -fsanitize=${SPECTREL_SANITIZERS} -fno-sanitize-recover=all -fno-omit-frame-pointer -g)

@@ -87,8 +87,8 @@ ListRef ZPHLogGenerator::getSaveContentsFromState(const Dictionary& state)
     ListRef contents = history ? history->copy() : List::make();
     if (const DataRef dlf = generateDlfFromState(state)) {
         contents->append(Dictionary::make({
-            { "Description", "DLF binary (" + std::to_string(dlf->size()) + " bytes)" },
-            { "DLF", dlf },
+            {"Description", "DLF binary (" + std::to_string(dlf->size()) + " bytes)"},
+            {"DLF", dlf},
         }));
     }
     return contents;

@@ -144,9 +144,9 @@ DictionaryRef ZPHLogGenerator2::getStartCommand()
             ordinary->append(Value::integer(code));
     }
     return Dictionary::make({
-        { "SetState", "Streaming" },
-        { "SetZephyrLogCodes", ordinary },
-        { "SetRkExtraCodes", extra },
+        {"SetState", "Streaming"},
+        {"SetZephyrLogCodes", ordinary},
+        {"SetRkExtraCodes", extra},
     });
 }
 

@@ -15,11 +15,11 @@ constexpr std::uint8_t Padding = 0xFD;
 
 constexpr std::array<std::uint8_t, 256> makeSextets()
 {
-    std::array<std::uint8_t, 256> sextets{};
+    std::array<std::uint8_t, 256> sextets {};
     sextets.fill(Wrong);
     for (std::size_t i = 0; i < Alphabet.size(); ++i)
         sextets[static_cast<std::uint8_t>(Alphabet[i])] = static_cast<std::uint8_t>(i);
-    for (const char space : { ' ', '\t', '\n', '\r' })
+    for (const char space : {' ', '\t', '\n', '\r'})
         sextets[static_cast<std::uint8_t>(space)] = Space;
     sextets['='] = Padding;
     return sextets;

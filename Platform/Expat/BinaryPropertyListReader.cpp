@@ -229,7 +229,7 @@ Value BinaryReader::date(const Object& object) const
     if (object.marker != DateMarker || !holds(object.content, 1, 8))
         return {};
     const double seconds = std::bit_cast<double>(number(object.content, 8));
-    return std::isfinite(seconds) ? Value(Date{ seconds }) : Value();
+    return std::isfinite(seconds) ? Value(Date {seconds}) : Value();
 }
 
 Value BinaryReader::data(const Object& found)

@@ -82,8 +82,8 @@ std::optional<Date> parseDateText(std::string_view text)
     if (text.size() != 20 || text[4] != '-' || text[7] != '-' || text[10] != 'T' || text[13] != ':' || text[16] != ':'
         || text[19] != 'Z')
         return std::nullopt;
-    const int fields[] = { digitsAt(text, 0, 4), digitsAt(text, 5, 2), digitsAt(text, 8, 2), digitsAt(text, 11, 2),
-        digitsAt(text, 14, 2), digitsAt(text, 17, 2) };
+    const int fields[] = {digitsAt(text, 0, 4), digitsAt(text, 5, 2), digitsAt(text, 8, 2), digitsAt(text, 11, 2),
+        digitsAt(text, 14, 2), digitsAt(text, 17, 2)};
     for (const int field : fields) {
         if (field < 0)
             return std::nullopt;
@@ -93,7 +93,7 @@ std::optional<Date> parseDateText(std::string_view text)
     if (!day.ok() || fields[3] > 23 || fields[4] > 59 || fields[5] > 59)
         return std::nullopt;
     const sys_seconds moment = sys_days(day) + hours(fields[3]) + minutes(fields[4]) + seconds(fields[5]);
-    return Date{ static_cast<double>((moment - Origin).count()) };
+    return Date {static_cast<double>((moment - Origin).count())};
 }
 
 std::string integerText(Integer number)
@@ -108,7 +108,7 @@ std::string realText(double number)
         return "nan";
     char digits[32]; // the shortest form of a double has at most 24 characters
     const auto result = std::to_chars(digits, digits + sizeof digits, number);
-    return { digits, result.ptr };
+    return {digits, result.ptr};
 }
 
 std::optional<std::string> dateText(Date date)

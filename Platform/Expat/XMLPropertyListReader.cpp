@@ -25,19 +25,19 @@ struct NamedElement {
     Element element;
 };
 
-constexpr std::array<NamedElement, 11> Elements{ {
-    { "plist", Element::Plist },
-    { "dict", Element::Dict },
-    { "array", Element::Array },
-    { "key", Element::Key },
-    { "string", Element::String },
-    { "integer", Element::Integer },
-    { "real", Element::Real },
-    { "date", Element::Date },
-    { "data", Element::Data },
-    { "true", Element::True },
-    { "false", Element::False },
-} };
+constexpr std::array<NamedElement, 11> Elements {{
+    {"plist", Element::Plist},
+    {"dict", Element::Dict},
+    {"array", Element::Array},
+    {"key", Element::Key},
+    {"string", Element::String},
+    {"integer", Element::Integer},
+    {"real", Element::Real},
+    {"date", Element::Date},
+    {"data", Element::Data},
+    {"true", Element::True},
+    {"false", Element::False},
+}};
 
 Element elementNamed(std::string_view name)
 {
@@ -84,7 +84,7 @@ private:
     Value textValue();
     Value dataValue();
 
-    std::unique_ptr<std::remove_pointer_t<XML_Parser>, ParserDeleter> _parser{ XML_ParserCreate(nullptr) };
+    std::unique_ptr<std::remove_pointer_t<XML_Parser>, ParserDeleter> _parser {XML_ParserCreate(nullptr)};
     PropertyListBudget _budget;
     std::vector<Open> _open;
     Element _leaf = Element::None; // the element without children that is open
@@ -104,7 +104,7 @@ XMLReader::XMLReader()
         },
         [](void* self, const XML_Char* name) { static_cast<XMLReader*>(self)->end(elementNamed(name)); });
     XML_SetCharacterDataHandler(_parser.get(), [](void* self, const XML_Char* piece, int length) {
-        static_cast<XMLReader*>(self)->text({ piece, static_cast<std::size_t>(length) });
+        static_cast<XMLReader*>(self)->text({piece, static_cast<std::size_t>(length)});
     });
     // Declarations of the document's own (entities above all) have no place in a property list.
     XML_SetStartDoctypeDeclHandler(

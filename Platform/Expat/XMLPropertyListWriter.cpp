@@ -67,7 +67,7 @@ std::string_view escapeOf(char character)
 /// The characters that stand for themselves, by far the most: the others get a closer look.
 constexpr std::array<bool, 256> makePlain()
 {
-    std::array<bool, 256> plain{};
+    std::array<bool, 256> plain {};
     for (std::size_t character = ' '; character < 0x80; ++character)
         plain[character] = character != '&' && character != '<' && character != '>';
     return plain;

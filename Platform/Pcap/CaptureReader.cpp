@@ -12,7 +12,7 @@ namespace spectrel {
 namespace {
 
 constexpr std::uint32_t PcapngMagic = 0x0A0D0D0A; // the same in either byte order
-constexpr std::array<std::uint32_t, 5> Magics{ 0xA1B2C3D4, 0xD4C3B2A1, 0xA1B23C4D, 0x4D3CB2A1, PcapngMagic };
+constexpr std::array<std::uint32_t, 5> Magics {0xA1B2C3D4, 0xD4C3B2A1, 0xA1B23C4D, 0x4D3CB2A1, PcapngMagic};
 
 constexpr std::int64_t FileHeaderLength = 24;
 constexpr std::int64_t PacketHeaderLength = 16;
@@ -88,7 +88,7 @@ bool CaptureReader::next(RecordedMessage& message)
         return damaged(
             "only " + std::to_string(header->caplen) + " of " + std::to_string(header->len) + " bytes were captured");
     message.time = timeOf(*header);
-    message.body = { bytes, header->caplen };
+    message.body = {bytes, header->caplen};
     ++_count;
     _place = _isClassic ? _place + PacketHeaderLength + header->caplen : currentPlace();
     return true;

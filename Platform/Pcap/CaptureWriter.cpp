@@ -65,7 +65,7 @@ bool CaptureWriter::write(Moment time, ByteView body)
     const std::int64_t seconds = second.time_since_epoch().count();
     if (seconds < 0 || seconds > std::numeric_limits<std::uint32_t>::max())
         return failed("the time " + defaultDateForm(time) + " is outside what a capture can tell");
-    pcap_pkthdr header{};
+    pcap_pkthdr header {};
     header.ts.tv_sec = seconds;
     header.ts.tv_usec = (time - second).count();
     header.caplen = static_cast<std::uint32_t>(body.size());

@@ -13,12 +13,12 @@ struct LinkType {
     Technology technology;
 };
 
-constexpr std::array<LinkType, 5> LinkTypes{ {
-    { 147, Technology::IFX },
-    { 148, Technology::GSM },
-    { 149, Technology::CDMA },
-    { 150, Technology::LTE },
-    { 151, Technology::UTRAN },
-} };
+constexpr std::array<LinkType, 5> LinkTypes {{
+    {147, Technology::IFX},
+    {148, Technology::GSM},
+    {149, Technology::CDMA},
+    {150, Technology::LTE},
+    {151, Technology::UTRAN},
+}};
 
 } // namespace spectrel

@@ -51,7 +51,7 @@ MessageCutter::Candidate MessageCutter::message(std::size_t place) const
     const std::size_t type = place + (_bytes[place] == Wrapper ? 2 : 0);
     if (!isItem(type + 1))
         return {};
-    return { type + 1 + itemLength(type + 1) - place, isKnownType(type) ? MessageScore : UnknownTypeScore, {} };
+    return {type + 1 + itemLength(type + 1) - place, isKnownType(type) ? MessageScore : UnknownTypeScore, {}};
 }
 
 /// Calls `visit` with each message that may start at the place.
@@ -63,10 +63,10 @@ template <typename Visitor> void MessageCutter::visitCandidates(std::size_t plac
         return;
     if (isItem(place)) { // its type byte is missing: the code tells it
         const std::size_t code = _bytes[place + 2] | _bytes[place + 3] << 8;
-        visit({ itemLength(place), BeheadedScore, code < SmallestExtraFree ? ExtraType : OrdinaryType });
+        visit({itemLength(place), BeheadedScore, code < SmallestExtraFree ? ExtraType : OrdinaryType});
     }
     if (isKnownType(place + 1) && isItem(place + 2)) // the first byte of its wrapper is missing
-        visit({ 2 + itemLength(place + 2), BeheadedWrapperScore, Wrapper });
+        visit({2 + itemLength(place + 2), BeheadedWrapperScore, Wrapper});
 }
 
 /// The score of the best way on; beyond the plan nothing is known yet.
@@ -102,7 +102,7 @@ void MessageCutter::plan()
         std::int32_t score = 0;
         bestCandidate(place, score);
         const bool isSure = message(place).score == MessageScore; // is never skipped
-        _best[i - 1] = isSure ? score : std::max({ score, bestBehind + SkipScore, DamageScore });
+        _best[i - 1] = isSure ? score : std::max({score, bestBehind + SkipScore, DamageScore});
         bestBehind = std::max(bestBehind, score);
     }
 }
@@ -136,12 +136,12 @@ bool MessageCutter::next(Cut& cut)
     std::int32_t score = 0;
     const Candidate candidate = bestCandidate(_place, score);
     if (candidate.length != 0 && score == bestOf(_place)) {
-        cut = { _place, candidate.length, candidate.missingByte };
+        cut = {_place, candidate.length, candidate.missingByte};
     } else {
         const auto end = endOfPiece();
         if (!end || !isRefusedMessage(*end))
             return false;
-        cut = { _place, *end - _place, {} };
+        cut = {_place, *end - _place, {}};
     }
     _place += cut.length;
     return true;

@@ -120,7 +120,7 @@ bool SnapshotReader::takeReport(RecordedMessage& message)
         return damaged("", "the report holds what a message cannot carry");
     _report = std::move(*report);
     _displayState = Value();
-    message.body = { reinterpret_cast<const std::uint8_t*>(_report.data()), _report.size() };
+    message.body = {reinterpret_cast<const std::uint8_t*>(_report.data()), _report.size()};
     return true;
 }
 

@@ -13,13 +13,13 @@ struct TechnologyNames {
     std::string_view constant;
 };
 
-constexpr std::array<TechnologyNames, 5> Technologies{ {
-    { Technology::IFX, "ifx", kRKLogChannelTechnology_IFX },
-    { Technology::GSM, "gsm", kRKLogChannelTechnology_Zephyr_GSM },
-    { Technology::CDMA, "cdma", kRKLogChannelTechnology_Zephyr_CDMA },
-    { Technology::LTE, "lte", kRKLogChannelTechnology_Zephyr_LTE },
-    { Technology::UTRAN, "utran", kRKLogChannelTechnology_Zephyr_UTRAN2 },
-} };
+constexpr std::array<TechnologyNames, 5> Technologies {{
+    {Technology::IFX, "ifx", kRKLogChannelTechnology_IFX},
+    {Technology::GSM, "gsm", kRKLogChannelTechnology_Zephyr_GSM},
+    {Technology::CDMA, "cdma", kRKLogChannelTechnology_Zephyr_CDMA},
+    {Technology::LTE, "lte", kRKLogChannelTechnology_Zephyr_LTE},
+    {Technology::UTRAN, "utran", kRKLogChannelTechnology_Zephyr_UTRAN2},
+}};
 
 std::optional<Technology> technologyWith(std::string_view TechnologyNames::*member, std::string_view text)
 {

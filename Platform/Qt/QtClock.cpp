@@ -38,7 +38,7 @@ ZoneState QtClock::zoneAt(Moment moment) const
 {
     const QTimeZone zone = zoneNamed(_zone);
     const QDateTime date = dateIn(zone, moment);
-    return { date.offsetFromUtc(), zone.isDaylightTime(date) };
+    return {date.offsetFromUtc(), zone.isDaylightTime(date)};
 }
 
 std::string QtClock::formatted(Moment moment, std::string_view pattern) const

@@ -32,7 +32,7 @@ std::unique_ptr<QCoreApplication> makeApplication()
         return nullptr;
     static int count = 1;
     static char name[] = "spectrel";
-    static char* arguments[] = { name, nullptr };
+    static char* arguments[] = {name, nullptr};
     auto application = std::make_unique<QCoreApplication>(count, arguments);
     std::setlocale(LC_NUMERIC, "C"); // the application object has adopted the user's locale; our numbers have none
     return application;

@@ -57,13 +57,13 @@ struct TerminationSignals::Private {
     }
 
     Handler handler;
-    int ends[2] = { -1, -1 };
+    int ends[2] = {-1, -1};
     std::unique_ptr<QSocketNotifier> notifier;
     struct Former {
         int signal;
         struct sigaction action;
     };
-    Former former[3] = { { SIGINT, {} }, { SIGTERM, {} }, { SIGHUP, {} } };
+    Former former[3] = {{SIGINT, {}}, {SIGTERM, {}}, {SIGHUP, {}}};
 };
 
 TerminationSignals::TerminationSignals(Handler handler)

@@ -146,7 +146,7 @@ void SocketLocalPort::Core::add(FileDescriptor socket)
     ::setsockopt(number, SOL_SOCKET, SO_SNDBUF, &wire::SendBuffer, sizeof wire::SendBuffer);
     auto notifier = std::make_unique<QSocketNotifier>(number, QSocketNotifier::Read);
     QObject::connect(notifier.get(), &QSocketNotifier::activated, [this, number] { receiveFrom(number); });
-    _connections.push_back({ std::move(socket), std::move(notifier) });
+    _connections.push_back({std::move(socket), std::move(notifier)});
 }
 
 void SocketLocalPort::Core::receiveFrom(int socket)
@@ -191,7 +191,7 @@ bool SocketLocalPort::Core::answer(int socket, const wire::Header& request, cons
     else if (reply)
         SPECTREL_LOG(
             Priority::Error, "Message port %s: an answer of %zu bytes is too large", _name.c_str(), reply->size());
-    const wire::Header header{ wire::Kind::Reply, request.id, request.sequence };
+    const wire::Header header {wire::Kind::Reply, request.id, request.sequence};
     if (wire::send(socket, header, body) == wire::Outcome::Done)
         return true;
     drop(socket, "does not take its answer");

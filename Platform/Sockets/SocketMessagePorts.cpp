@@ -51,7 +51,7 @@ MessagePorts::LocalResult SocketMessagePorts::createLocal(
     std::erase_if(_locals, [](const auto& held) { return held.second.expired(); });
     if (const auto held = _locals.find(name); held != _locals.end()) {
         if (auto existing = held->second.lock(); existing && existing->isValid())
-            return { std::move(existing), true };
+            return {std::move(existing), true};
     }
     const auto address = portAddress(_directory, name);
     std::string reason;
@@ -68,7 +68,7 @@ MessagePorts::LocalResult SocketMessagePorts::createLocal(
     auto port = std::make_shared<SocketLocalPort>(
         std::string(name), address->sun_path, std::move(*lock), std::move(socket), std::move(handler));
     _locals.insert_or_assign(std::string(name), port);
-    return { std::move(port), false };
+    return {std::move(port), false};
 }
 
 std::shared_ptr<RemoteMessagePort> SocketMessagePorts::createRemote(std::string_view name)

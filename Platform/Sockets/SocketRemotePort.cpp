@@ -34,8 +34,8 @@ public:
         for (;;) {
             const auto left = std::max(std::chrono::nanoseconds(0), _end - SteadyClock::now());
             const auto seconds = std::chrono::floor<std::chrono::seconds>(left);
-            const timespec limit{ static_cast<time_t>(seconds.count()), static_cast<long>((left - seconds).count()) };
-            pollfd polled{ socket, events, 0 };
+            const timespec limit {static_cast<time_t>(seconds.count()), static_cast<long>((left - seconds).count())};
+            pollfd polled {socket, events, 0};
             const int ready = ::ppoll(&polled, 1, &limit, nullptr);
             if (ready > 0)
                 return true;
@@ -105,7 +105,7 @@ SendStatus SocketRemotePort::Core::send(
         return SendStatus::Invalid;
     if (body.empty() || body.size() > LargestMessage)
         return SendStatus::TransportError;
-    const wire::Header header{ kind, id, ++_sequence };
+    const wire::Header header {kind, id, ++_sequence};
     auto outcome = wire::send(_socket.number(), header, body);
     if (outcome == wire::Outcome::WouldBlock && timeout > timeout.zero()) {
         const Deadline deadline(timeout);
@@ -175,7 +175,7 @@ bool SocketRemotePort::Core::isPeerThere() const
 {
     if (!_socket)
         return false;
-    pollfd polled{ _socket.number(), 0, 0 };
+    pollfd polled {_socket.number(), 0, 0};
     return ::poll(&polled, 1, 0) == 0;
 }
 

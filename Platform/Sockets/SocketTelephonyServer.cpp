@@ -10,11 +10,11 @@ namespace spectrel {
 
 namespace {
 
-constexpr std::chrono::seconds Timeout{ 1 };
+constexpr std::chrono::seconds Timeout {1};
 
 LogChannelResult failure(std::int32_t error)
 {
-    return { SocketTelephonyServer::TransportDomain, error, std::nullopt };
+    return {SocketTelephonyServer::TransportDomain, error, std::nullopt};
 }
 
 LogChannelResult readAnswer(ByteView answer)
@@ -24,7 +24,7 @@ LogChannelResult readAnswer(ByteView answer)
     const auto error = dictionary ? (*dictionary)["Error"].int32() : std::nullopt;
     if (!error)
         return failure(SocketTelephonyServer::UnreadableAnswer);
-    LogChannelResult result{ (*dictionary)["Domain"].int32().value_or(0), *error, std::nullopt };
+    LogChannelResult result {(*dictionary)["Domain"].int32().value_or(0), *error, std::nullopt};
     if (const std::string* const name = (*dictionary)["PortName"].string())
         result.portName = *name;
     return result;
@@ -39,7 +39,7 @@ public:
 
     LogChannelResult RKServerConnectionNetworkMonitorCreateLogChannel(std::string_view localPortName) override
     {
-        const auto request = serialisePropertyList(Dictionary::make({ { "CreateLogChannel", localPortName } }));
+        const auto request = serialisePropertyList(Dictionary::make({{"CreateLogChannel", localPortName}}));
         if (!request)
             return failure(static_cast<std::int32_t>(SendStatus::TransportError));
         const ByteView body(reinterpret_cast<const std::uint8_t*>(request->data()), request->size());

@@ -58,8 +58,8 @@ std::optional<Packet> decode(ByteView bytes)
     const auto kind = static_cast<Kind>(bytes[1]);
     if (kind != Kind::Reply && bytes.size() == HeaderLength)
         return std::nullopt;
-    const Header header{ kind, static_cast<std::int32_t>(u32(&bytes[4])), u32(&bytes[8]) };
-    return Packet{ header, bytes.subspan(HeaderLength) };
+    const Header header {kind, static_cast<std::int32_t>(u32(&bytes[4])), u32(&bytes[8])};
+    return Packet {header, bytes.subspan(HeaderLength)};
 }
 
 std::uint8_t* Buffer::bytes()
@@ -73,7 +73,7 @@ Outcome send(int socket, const Header& header, ByteView body)
 {
     std::array<std::uint8_t, HeaderLength> head;
     encode(header, head);
-    iovec parts[] = { { head.data(), head.size() }, { const_cast<std::uint8_t*>(body.data()), body.size() } };
+    iovec parts[] = {{head.data(), head.size()}, {const_cast<std::uint8_t*>(body.data()), body.size()}};
     msghdr message = {};
     message.msg_iov = parts;
     message.msg_iovlen = 2;
@@ -92,7 +92,7 @@ Outcome receive(int socket, Buffer& buffer, ByteView& packet, std::size_t& lengt
         const ssize_t count = ::recv(socket, buffer.bytes(), LargestPacket, MSG_DONTWAIT | MSG_TRUNC);
         if (count > 0) {
             length = static_cast<std::size_t>(count);
-            packet = { buffer.bytes(), std::min(length, LargestPacket) };
+            packet = {buffer.bytes(), std::min(length, LargestPacket)};
             return Outcome::Done;
         }
         if (count == 0)

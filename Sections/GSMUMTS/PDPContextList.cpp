@@ -17,7 +17,7 @@ std::string_view PDPContextList::getSectionName() const
 
 std::vector<std::uint32_t> PDPContextList::getLogCodeArray() const
 {
-    return { ContextArrayReader::Code };
+    return {ContextArrayReader::Code};
 }
 
 void PDPContextList::updateWithData(RecordView record, std::uint32_t)

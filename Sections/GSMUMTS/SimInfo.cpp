@@ -14,22 +14,22 @@ struct SimFile {
     std::string_view displayKey;
 };
 
-constexpr std::array<SimFile, 14> SimFiles{ {
-    { "kSimFile_ICCID", "EF-ICCID" },
-    { "kSimFile_MSISDN", "EF-MSISDN" },
-    { "kSimFile_MBDN", "EF-3GPP MAIL BOX DIALING NUMBER" },
-    { "kSimFile_HPPLMN", "EF-HPPLMN SEARCH PERIOD" },
-    { "kSimFile_LOCI", "EF-LOCI" },
-    { "kSimFile_PSLOCI", "EF-GPRS/PS-LOCI" },
-    { "kSimFile_ACC", "EF-ACCESS CONTROL CLASS" },
-    { "kSimFile_AD", "EF-ADMINISTRATIVE DATA" },
-    { "kSimFile_FPLMN", "EF-FPLMN" },
-    { "kSimFile_AHPLMN", "EF-ACTING HPLMN" },
-    { "kSimFile_RATMODE", "EF-RAT MODE" },
-    { "kSimFile_PNN", "EF-PLMN NETWORK NAME" },
-    { "kSimFile_OPL", "EF-OPERATOR PLMN LIST" },
-    { "kSimFile_OPLMNAcT", "EF-OPLMNAcT" },
-} };
+constexpr std::array<SimFile, 14> SimFiles {{
+    {"kSimFile_ICCID", "EF-ICCID"},
+    {"kSimFile_MSISDN", "EF-MSISDN"},
+    {"kSimFile_MBDN", "EF-3GPP MAIL BOX DIALING NUMBER"},
+    {"kSimFile_HPPLMN", "EF-HPPLMN SEARCH PERIOD"},
+    {"kSimFile_LOCI", "EF-LOCI"},
+    {"kSimFile_PSLOCI", "EF-GPRS/PS-LOCI"},
+    {"kSimFile_ACC", "EF-ACCESS CONTROL CLASS"},
+    {"kSimFile_AD", "EF-ADMINISTRATIVE DATA"},
+    {"kSimFile_FPLMN", "EF-FPLMN"},
+    {"kSimFile_AHPLMN", "EF-ACTING HPLMN"},
+    {"kSimFile_RATMODE", "EF-RAT MODE"},
+    {"kSimFile_PNN", "EF-PLMN NETWORK NAME"},
+    {"kSimFile_OPL", "EF-OPERATOR PLMN LIST"},
+    {"kSimFile_OPLMNAcT", "EF-OPLMNAcT"},
+}};
 
 } // namespace
 
@@ -45,7 +45,7 @@ std::string_view SimInfo::getSectionName() const
 
 std::vector<std::uint32_t> SimInfo::getLogCodeArray() const
 {
-    return { LogCode_0xFF0000::Code };
+    return {LogCode_0xFF0000::Code};
 }
 
 void SimInfo::updateWithData(RecordView record, std::uint32_t logCode)

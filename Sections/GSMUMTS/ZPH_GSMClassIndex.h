@@ -12,8 +12,8 @@ public:
     ~ZPH_GSMClassIndex() override;
 
 private:
-    PDPContextList objPDPContextList{ classDict, codeDictionary };
-    SimInfo objSimInfo{ classDict, codeDictionary };
+    PDPContextList objPDPContextList {classDict, codeDictionary};
+    SimInfo objSimInfo {classDict, codeDictionary};
 };
 
 } // namespace spectrel

@@ -13,9 +13,9 @@ public:
     ~LTEClassIndex() override;
 
 private:
-    LTEServingCellInfo objLTEServingCellInfo{ classDict, codeDictionary };
-    SimInfo objSimInfo{ classDict, codeDictionary };
-    PDPContextList objPDPContextList{ classDict, codeDictionary };
+    LTEServingCellInfo objLTEServingCellInfo {classDict, codeDictionary};
+    SimInfo objSimInfo {classDict, codeDictionary};
+    PDPContextList objPDPContextList {classDict, codeDictionary};
 };
 
 } // namespace spectrel

@@ -41,21 +41,21 @@ std::string_view bandwidth(std::uint32_t resourceBlocks, TextBuffer&)
 }
 
 /// Serving cell, code 0xB0C2, in writing order.
-constexpr std::array<Field, 8> ServingCellFields{ {
-    { 14, Width::U16, "Physical Cell ID", decimal },
-    { 16, Width::U16, "Download Frequency", decimal }, // E-ARFCN as received, not MHz
-    { 18, Width::U16, "Upload Frequency", decimal },
-    { 20, Width::U8, "Download Bandwidth", bandwidth },
-    { 21, Width::U8, "Upload Bandwidth", bandwidth },
-    { 22, Width::U32, "Cell Identity", decimal },
-    { 26, Width::U16, "Tracking Area Code", decimal },
-    { 28, Width::U32, "Freq Band Indicator", decimal },
-} };
+constexpr std::array<Field, 8> ServingCellFields {{
+    {14, Width::U16, "Physical Cell ID", decimal},
+    {16, Width::U16, "Download Frequency", decimal}, // E-ARFCN as received, not MHz
+    {18, Width::U16, "Upload Frequency", decimal},
+    {20, Width::U8, "Download Bandwidth", bandwidth},
+    {21, Width::U8, "Upload Bandwidth", bandwidth},
+    {22, Width::U32, "Cell Identity", decimal},
+    {26, Width::U16, "Tracking Area Code", decimal},
+    {28, Width::U32, "Freq Band Indicator", decimal},
+}};
 
 /// Antennas, code 0xB0C1.
-constexpr std::array<Field, 1> AntennaFields{ {
-    { 20, Width::U8, "Num Tx Antennas", decimal },
-} };
+constexpr std::array<Field, 1> AntennaFields {{
+    {20, Width::U8, "Num Tx Antennas", decimal},
+}};
 
 struct CellInformationKey {
     std::string_view monitorKey;
@@ -64,13 +64,13 @@ struct CellInformationKey {
 };
 
 /// Cell information, code 0xFF0001, in writing order.
-constexpr std::array<CellInformationKey, 5> CellInformationKeys{ {
-    { kRKCellMonitorTAC, "Tracking Area Code", "Serving Cell Info: Failed to retrieve TAC\n" },
-    { kRKCellMonitorCellId, "Cell Identity", "Serving Cell Info: Failed to retrieve Cell ID\n" },
-    { kRKCellMonitorPID, "Physical Cell ID", "Serving Cell Info: Failed to retrieve Physical Cell ID\n" },
-    { kRKCellMonitorBandInfo, "Freq Band Indicator", "Serving Cell Info: Failed to retrieve Freq Band Indicator\n" },
-    { kRKCellMonitorUARFCN, "UARFCN", "Serving Cell Info: Failed to retrieve UARFCN\n" },
-} };
+constexpr std::array<CellInformationKey, 5> CellInformationKeys {{
+    {kRKCellMonitorTAC, "Tracking Area Code", "Serving Cell Info: Failed to retrieve TAC\n"},
+    {kRKCellMonitorCellId, "Cell Identity", "Serving Cell Info: Failed to retrieve Cell ID\n"},
+    {kRKCellMonitorPID, "Physical Cell ID", "Serving Cell Info: Failed to retrieve Physical Cell ID\n"},
+    {kRKCellMonitorBandInfo, "Freq Band Indicator", "Serving Cell Info: Failed to retrieve Freq Band Indicator\n"},
+    {kRKCellMonitorUARFCN, "UARFCN", "Serving Cell Info: Failed to retrieve UARFCN\n"},
+}};
 
 } // namespace
 
@@ -86,7 +86,7 @@ std::string_view LTEServingCellInfo::getSectionName() const
 
 std::vector<std::uint32_t> LTEServingCellInfo::getLogCodeArray() const
 {
-    return { ServingCellCode, AntennasCode, CellInfoArrayReader::Code };
+    return {ServingCellCode, AntennasCode, CellInfoArrayReader::Code};
 }
 
 void LTEServingCellInfo::updateWithData(RecordView record, std::uint32_t logCode)

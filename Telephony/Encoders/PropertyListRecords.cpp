@@ -35,34 +35,34 @@ DictionaryRef cellDictionary(const LTECell& cell, std::string_view type)
 Bytes propertyListRecord(std::uint32_t code, const Value& payload, Moment time)
 {
     const std::string text = serialisePropertyList(payload).value_or(std::string());
-    return RecordWriter(code, time).bytes({ reinterpret_cast<const std::uint8_t*>(text.data()), text.size() }).take();
+    return RecordWriter(code, time).bytes({reinterpret_cast<const std::uint8_t*>(text.data()), text.size()}).take();
 }
 
 Bytes simFilesRecord(Moment time)
 {
     return propertyListRecord(0xFF0000,
         Dictionary::make({
-            { "kSimFile_ICCID", "8900101000000000017" },
-            { "kSimFile_MSISDN", "+10015550100" },
-            { "kSimFile_MBDN", "+10015550199" },
-            { "kSimFile_HPPLMN", "60 min" },
-            { "kSimFile_LOCI", "00F110 04B1 FE" },
-            { "kSimFile_PSLOCI", "00F110 04B1 01" },
-            { "kSimFile_ACC", "0001" },
-            { "kSimFile_AD", "80 00 00 02" },
-            { "kSimFile_FPLMN", "001-02, 001-03" },
-            { "kSimFile_AHPLMN", "001-01" },
-            { "kSimFile_RATMODE", "LTE preferred" },
-            { "kSimFile_PNN", "Test Network" },
-            { "kSimFile_OPL", "001-01 0000-FFFE" },
-            { "kSimFile_OPLMNAcT", "001-01 E-UTRAN, 001-01 UTRAN, 001-01 GSM" },
+            {"kSimFile_ICCID", "8900101000000000017"},
+            {"kSimFile_MSISDN", "+10015550100"},
+            {"kSimFile_MBDN", "+10015550199"},
+            {"kSimFile_HPPLMN", "60 min"},
+            {"kSimFile_LOCI", "00F110 04B1 FE"},
+            {"kSimFile_PSLOCI", "00F110 04B1 01"},
+            {"kSimFile_ACC", "0001"},
+            {"kSimFile_AD", "80 00 00 02"},
+            {"kSimFile_FPLMN", "001-02, 001-03"},
+            {"kSimFile_AHPLMN", "001-01"},
+            {"kSimFile_RATMODE", "LTE preferred"},
+            {"kSimFile_PNN", "Test Network"},
+            {"kSimFile_OPL", "001-01 0000-FFFE"},
+            {"kSimFile_OPLMNAcT", "001-01 E-UTRAN, 001-01 UTRAN, 001-01 GSM"},
         }),
         time);
 }
 
 Bytes lteCellInformationRecord(const LTEWorld& world, Moment time)
 {
-    auto cells = List::make({ cellDictionary(world.servingCell(), kRKCellMonitorCellTypeServing) });
+    auto cells = List::make({cellDictionary(world.servingCell(), kRKCellMonitorCellTypeServing)});
     for (const LTECell* neighbour : world.neighbours(NeighboursTold))
         cells->append(cellDictionary(*neighbour, kRKCellMonitorCellTypeNeighbor));
     return propertyListRecord(0xFF0001, cells, time);
@@ -73,25 +73,25 @@ Bytes contextsRecord(std::uint64_t bytesReceived, std::uint64_t bytesSent, Momen
     return propertyListRecord(0xFF0002,
         List::make({
             Dictionary::make({
-                { "Context ID", "5" },
-                { "APN", "internet.test" },
-                { "Type", "IPv4v6" },
-                { "Address", "192.0.2.17" },
-                { "IPv6 Address", "2001:db8:1::17" },
-                { "QCI", "9" },
-                { "State", "Active" },
-                { "Bytes Received", std::to_string(bytesReceived) },
-                { "Bytes Sent", std::to_string(bytesSent) },
+                {"Context ID", "5"},
+                {"APN", "internet.test"},
+                {"Type", "IPv4v6"},
+                {"Address", "192.0.2.17"},
+                {"IPv6 Address", "2001:db8:1::17"},
+                {"QCI", "9"},
+                {"State", "Active"},
+                {"Bytes Received", std::to_string(bytesReceived)},
+                {"Bytes Sent", std::to_string(bytesSent)},
             }),
             Dictionary::make({
-                { "Context ID", "6" },
-                { "APN", "ims.test" },
-                { "Type", "IPv6" },
-                { "IPv6 Address", "2001:db8:2::17" },
-                { "QCI", "5" },
-                { "State", "Active" },
-                { "Bytes Received", std::to_string(bytesReceived / 4096) },
-                { "Bytes Sent", std::to_string(bytesSent / 1024) },
+                {"Context ID", "6"},
+                {"APN", "ims.test"},
+                {"Type", "IPv6"},
+                {"IPv6 Address", "2001:db8:2::17"},
+                {"QCI", "5"},
+                {"State", "Active"},
+                {"Bytes Received", std::to_string(bytesReceived / 4096)},
+                {"Bytes Sent", std::to_string(bytesSent / 1024)},
             }),
         }),
         time);

@@ -11,7 +11,7 @@ namespace {
 constexpr double RoadLength = 6000; // metres, a ring
 constexpr double SiteDistance = 500;
 constexpr double Hysteresis = 3; // dB by which a cell must be better...
-constexpr std::chrono::milliseconds TimeToTrigger{ 640 }; // ... for this long (3GPP TS 36.331, TimeToTrigger)
+constexpr std::chrono::milliseconds TimeToTrigger {640}; // ... for this long (3GPP TS 36.331, TimeToTrigger)
 
 struct Layer {
     std::uint8_t band;
@@ -21,7 +21,7 @@ struct Layer {
 };
 
 /// Carriers of one network; each site has the first and some have another.
-constexpr std::array<Layer, 3> Layers{ { { 3, 1300, 100, 18 }, { 20, 6300, 50, 19 }, { 7, 3350, 75, 15 } } };
+constexpr std::array<Layer, 3> Layers {{{3, 1300, 100, 18}, {20, 6300, 50, 19}, {7, 3350, 75, 15}}};
 
 /// Distance on the ring.
 double alongRing(double from, double to)

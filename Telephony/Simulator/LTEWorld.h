@@ -58,7 +58,7 @@ private:
     std::vector<double> _shadowing; // dB, one for each cell, wandering slowly
     std::size_t _serving = 0;
     std::size_t _candidate = 0; // better than the serving cell
-    std::chrono::milliseconds _candidateFor{ 0 };
+    std::chrono::milliseconds _candidateFor {0};
     double _position = 0; // metres along the road, which is a ring
     double _speed = 14; // metres a second
     double _received = 0;

@@ -11,7 +11,7 @@ namespace spectrel {
 
 namespace {
 
-constexpr std::chrono::milliseconds Step{ 100 };
+constexpr std::chrono::milliseconds Step {100};
 
 /// Live messages wait for a client that is busy; beyond this many the oldest go, and the loss is told.
 constexpr std::size_t LongestQueue = 4096;
@@ -62,17 +62,16 @@ private:
 const std::vector<SimulatorSource::Cadence>& SimulatorSource::cadences()
 {
     using namespace std::chrono_literals;
-    static const std::vector<Cadence> All{
-        { 10s, true, [](const LTEWorld&, Moment time) { return simFilesRecord(time); } },
-        { 2s, true, [](const LTEWorld& world, Moment time) { return lteCellInformationRecord(world, time); } },
-        { 1s, true,
+    static const std::vector<Cadence> All {
+        {10s, true, [](const LTEWorld&, Moment time) { return simFilesRecord(time); }},
+        {2s, true, [](const LTEWorld& world, Moment time) { return lteCellInformationRecord(world, time); }},
+        {1s, true,
             [](const LTEWorld& world, Moment time) {
                 return contextsRecord(world.bytesReceived(), world.bytesSent(), time);
-            } },
-        { 400ms, false,
-            [](const LTEWorld& world, Moment time) { return lteServingCellRecord(world.servingCell(), time); } },
-        { 800ms, false,
-            [](const LTEWorld& world, Moment time) { return lteAntennasRecord(world.servingCell(), time); } },
+            }},
+        {400ms, false,
+            [](const LTEWorld& world, Moment time) { return lteServingCellRecord(world.servingCell(), time); }},
+        {800ms, false, [](const LTEWorld& world, Moment time) { return lteAntennasRecord(world.servingCell(), time); }},
     };
     return All;
 }

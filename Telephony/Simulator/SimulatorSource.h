@@ -46,7 +46,7 @@ private:
     const Clock& _clock;
     double _rate;
     LTEWorld _world;
-    std::chrono::milliseconds _elapsed{ 0 }; // simulated, in whole steps
+    std::chrono::milliseconds _elapsed {0}; // simulated, in whole steps
     double _owed = 0; // simulated milliseconds not stepped through yet
     std::vector<Stream*> _streams;
     std::unique_ptr<Timer> _timer; // only while somebody listens

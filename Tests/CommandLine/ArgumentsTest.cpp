@@ -17,7 +17,7 @@ TEST(ParseDurationTest, UnitsAreMillisecondsSecondsMinutesAndHours)
 
 TEST(ParseDurationTest, AnythingElseIsNone)
 {
-    for (const char* text : { "", "s", "-1", "1 s", "1d", "1.2.3s", "0", "1e3", "99999999999999999999h" })
+    for (const char* text : {"", "s", "-1", "1 s", "1d", "1.2.3s", "0", "1e3", "99999999999999999999h"})
         EXPECT_FALSE(parseDuration(text)) << text;
 }
 
@@ -38,12 +38,12 @@ TEST(ReadArgumentsTest, WithoutACommandItIsTheApplication)
 TEST(ReadArgumentsTest, DecodeTakesItsOptions)
 {
     Arguments arguments;
-    EXPECT_EQ(read({ "decode", "--format", "json", "--each", "--keep-going", "--technology", "utran", "--snapshot", "out",
-                       "a.pcap", "b.dlf" },
+    EXPECT_EQ(read({"decode", "--format", "json", "--each", "--keep-going", "--technology", "utran", "--snapshot",
+                       "out", "a.pcap", "b.dlf"},
                   arguments),
         std::nullopt);
     EXPECT_EQ(arguments.job, Job::Decode);
-    EXPECT_EQ(arguments.decode.files, (std::vector<std::string>{ "a.pcap", "b.dlf" }));
+    EXPECT_EQ(arguments.decode.files, (std::vector<std::string> {"a.pcap", "b.dlf"}));
     EXPECT_EQ(arguments.decode.format, OutputFormat::Json);
     EXPECT_TRUE(arguments.decode.each);
     EXPECT_TRUE(arguments.decode.keepGoing);
@@ -54,7 +54,7 @@ TEST(ReadArgumentsTest, DecodeTakesItsOptions)
 TEST(ReadArgumentsTest, WatchEndsAfterACountOrATime)
 {
     Arguments arguments;
-    EXPECT_EQ(read({ "watch", "--format", "changes", "--count", "3", "--duration", "2m" }, arguments), std::nullopt);
+    EXPECT_EQ(read({"watch", "--format", "changes", "--count", "3", "--duration", "2m"}, arguments), std::nullopt);
     EXPECT_EQ(arguments.job, Job::Watch);
     EXPECT_EQ(arguments.watch.format, OutputFormat::Changes);
     EXPECT_EQ(arguments.watch.count, 3u);
@@ -63,9 +63,8 @@ TEST(ReadArgumentsTest, WatchEndsAfterACountOrATime)
 
 TEST(ReadArgumentsTest, WrongUsageIsStatus2)
 {
-    for (const std::vector<const char*>& words :
-        std::vector<std::vector<const char*>>{ { "--gui", "--terminal" }, { "play" }, { "watch", "--count", "0" },
-            { "watch", "--duration", "soon" }, { "record" }, { "decode" } }) {
+    for (const std::vector<const char*>& words : std::vector<std::vector<const char*>> {{"--gui", "--terminal"},
+             {"play"}, {"watch", "--count", "0"}, {"watch", "--duration", "soon"}, {"record"}, {"decode"}}) {
         Arguments arguments;
         EXPECT_EQ(read(words, arguments), ExitStatus::WrongUsage) << words.front();
     }

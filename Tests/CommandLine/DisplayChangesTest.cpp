@@ -23,20 +23,20 @@ protected:
 
 TEST_F(DisplayChangesTest, FirstDisplayIsAllNew)
 {
-    EXPECT_EQ(update(Dictionary::make({ { "A", "1" }, { "B", List::make({ "x", Dictionary::make({ { "k", "v" } }) }) } })),
+    EXPECT_EQ(update(Dictionary::make({{"A", "1"}, {"B", List::make({"x", Dictionary::make({{"k", "v"}})})}})),
         "/A=1\n/B/0=x\n/B/1/k=v\n");
 }
 
 TEST_F(DisplayChangesTest, SameDisplayChangesNothing)
 {
-    const auto display = Dictionary::make({ { "A", "1" }, { "B", List::make({ "x" }) } });
+    const auto display = Dictionary::make({{"A", "1"}, {"B", List::make({"x"})}});
     update(display);
     EXPECT_EQ(update(display), "");
 }
 
 TEST_F(DisplayChangesTest, OnlyTheChangedLeafIsTold)
 {
-    const auto display = Dictionary::make({ { "A", "1" }, { "B", "2" }, { "C", "3" } });
+    const auto display = Dictionary::make({{"A", "1"}, {"B", "2"}, {"C", "3"}});
     update(display);
     display->setText("B", "9");
     EXPECT_EQ(update(display), "/B=9\n");
@@ -44,7 +44,7 @@ TEST_F(DisplayChangesTest, OnlyTheChangedLeafIsTold)
 
 TEST_F(DisplayChangesTest, RemovedAndAppendedKeyIsToldOnce)
 {
-    const auto display = Dictionary::make({ { "A", "1" }, { "B", "2" }, { "C", "3" } });
+    const auto display = Dictionary::make({{"A", "1"}, {"B", "2"}, {"C", "3"}});
     update(display);
     display->remove("A");
     EXPECT_EQ(update(display), "/A gone\n");
@@ -54,29 +54,29 @@ TEST_F(DisplayChangesTest, RemovedAndAppendedKeyIsToldOnce)
 
 TEST_F(DisplayChangesTest, OrderAloneIsNoChange)
 {
-    update(Dictionary::make({ { "A", "1" }, { "B", "2" }, { "C", "3" } }));
-    EXPECT_EQ(update(Dictionary::make({ { "C", "3" }, { "A", "1" }, { "B", "2" } })), "");
+    update(Dictionary::make({{"A", "1"}, {"B", "2"}, {"C", "3"}}));
+    EXPECT_EQ(update(Dictionary::make({{"C", "3"}, {"A", "1"}, {"B", "2"}})), "");
 }
 
 TEST_F(DisplayChangesTest, ShorterListLosesItsLastElements)
 {
-    update(List::make({ Dictionary::make({ { "k", "1" } }), Dictionary::make({ { "k", "2" }, { "l", "3" } }) }));
-    EXPECT_EQ(update(List::make({ Dictionary::make({ { "k", "1" } }) })), "/1/k gone\n/1/l gone\n");
+    update(List::make({Dictionary::make({{"k", "1"}}), Dictionary::make({{"k", "2"}, {"l", "3"}})}));
+    EXPECT_EQ(update(List::make({Dictionary::make({{"k", "1"}})})), "/1/k gone\n/1/l gone\n");
 }
 
 TEST_F(DisplayChangesTest, LeafThatBecomesAContainerGoesAndComesAgain)
 {
-    update(Dictionary::make({ { "A", "1" } }));
-    EXPECT_EQ(update(Dictionary::make({ { "A", List::make({ "x" }) } })), "/A gone\n/A/0=x\n");
-    EXPECT_EQ(update(Dictionary::make({ { "A", "1" } })), "/A/0 gone\n/A=1\n");
+    update(Dictionary::make({{"A", "1"}}));
+    EXPECT_EQ(update(Dictionary::make({{"A", List::make({"x"})}})), "/A gone\n/A/0=x\n");
+    EXPECT_EQ(update(Dictionary::make({{"A", "1"}})), "/A/0 gone\n/A=1\n");
 }
 
 TEST_F(DisplayChangesTest, DisplayThatGoesTakesItsLeavesAlong)
 {
     EXPECT_EQ(update({}), "");
-    update(Dictionary::make({ { "A", "1" } }));
+    update(Dictionary::make({{"A", "1"}}));
     EXPECT_EQ(update({}), "/A gone\n");
-    EXPECT_EQ(update(Dictionary::make({ { "A", "1" } })), "/A=1\n");
+    EXPECT_EQ(update(Dictionary::make({{"A", "1"}})), "/A=1\n");
 }
 
 TEST_F(DisplayChangesTest, DisplayThatIsATextIsTheRootLeaf)

@@ -22,7 +22,7 @@ std::string json(const Value& display)
     return text;
 }
 
-const Value Sorted = Dictionary::make({ { "2;Down", "a" }, { "_sorted", "" }, { "1;Up", List::make({ "b", "c" }) } });
+const Value Sorted = Dictionary::make({{"2;Down", "a"}, {"_sorted", ""}, {"1;Up", List::make({"b", "c"})}});
 
 TEST(DisplayPrinterTest, TreeIsIndentedInDisplayOrder)
 {
@@ -48,7 +48,7 @@ TEST(DisplayPrinterTest, AnythingElseIsUnknown)
 
 TEST(DisplayPrinterTest, ControlCharactersNeverReachTheTerminal)
 {
-    EXPECT_EQ(tree(Dictionary::make({ { "a\tb", "line\nbreak\x1b[31m" } })), "a\\x09b: line\\x0abreak\\x1b[31m\n");
+    EXPECT_EQ(tree(Dictionary::make({{"a\tb", "line\nbreak\x1b[31m"}})), "a\\x09b: line\\x0abreak\\x1b[31m\n");
 }
 
 TEST(DisplayPrinterTest, JsonEscapesWhatItMust)

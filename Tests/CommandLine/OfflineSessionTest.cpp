@@ -20,7 +20,7 @@ protected:
     {
         std::string pattern = testing::TempDir() + "offline-XXXXXX";
         folder = ::mkdtemp(pattern.data());
-        resources.lists["LTE"] = Dictionary::make({ { "Serving Cell Info", Dictionary::make() } });
+        resources.lists["LTE"] = Dictionary::make({{"Serving Cell Info", Dictionary::make()}});
         session.useTechnology(Technology::LTE);
     }
     ~OfflineSessionTest() override
@@ -29,7 +29,7 @@ protected:
     }
     void applyAt(std::chrono::milliseconds offset)
     {
-        session.apply({ Start + offset, record });
+        session.apply({Start + offset, record});
     }
     /// How many messages each history entry of the saved snapshot holds, and when it was made.
     std::string history()
@@ -49,17 +49,17 @@ protected:
         return text;
     }
 
-    static constexpr Moment Start{ std::chrono::seconds(1'700'000'000 - 1'700'000'000 % 60) };
+    static constexpr Moment Start {std::chrono::seconds(1'700'000'000 - 1'700'000'000 % 60)};
     const Bytes record = RecordBuilder(0xB0C2, 38).bytes();
     LogRecorder log;
     FakeResources resources;
     std::string folder;
-    OfflineSession session{ true };
+    OfflineSession session {true};
 };
 
 TEST_F(OfflineSessionTest, MessageAtTheVeryTimeOfATickComesBeforeIt)
 {
-    for (const auto offset : { 0ms, 1999ms, 2000ms, 2001ms })
+    for (const auto offset : {0ms, 1999ms, 2000ms, 2001ms})
         applyAt(offset);
     EXPECT_EQ(history(), "3@02 1@02 ");
 }
@@ -89,7 +89,7 @@ TEST_F(OfflineSessionTest, TimeThatRunsBackwardsStandsStill)
 TEST_F(OfflineSessionTest, RecordingOfAnotherTechnologyReplacesTheDisplayAndKeepsTheHistory)
 {
     applyAt(0ms);
-    resources.lists["ZPH_GSM"] = Dictionary::make({ { "SIM Info", Dictionary::make() } });
+    resources.lists["ZPH_GSM"] = Dictionary::make({{"SIM Info", Dictionary::make()}});
     session.useTechnology(Technology::GSM);
     EXPECT_TRUE(session.display().isAbsent());
     applyAt(1s);

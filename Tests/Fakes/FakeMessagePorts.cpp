@@ -56,7 +56,7 @@ struct FakeMessagePorts::Remote final : RemoteMessagePort {
     {
         if (!valid)
             return SendStatus::Invalid;
-        ports.sent.push_back({ id, std::string(body.begin(), body.end()), sendTimeout, receiveTimeout, replyMode });
+        ports.sent.push_back({id, std::string(body.begin(), body.end()), sendTimeout, receiveTimeout, replyMode});
         if (!ports.answer)
             return SendStatus::Success;
         Answer given = ports.answer(Sent(ports.sent.back()));
@@ -97,10 +97,10 @@ MessagePorts::LocalResult FakeMessagePorts::createLocal(std::string_view name, L
         return {};
     auto& held = _locals[std::string(name)];
     if (auto existing = held.lock(); existing && existing->isValid())
-        return { existing, true };
+        return {existing, true};
     auto port = std::make_shared<Local>(std::string(name), std::move(handler));
     held = port;
-    return { port, existingLocal };
+    return {port, existingLocal};
 }
 
 std::shared_ptr<RemoteMessagePort> FakeMessagePorts::createRemote(std::string_view name)

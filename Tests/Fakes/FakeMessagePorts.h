@@ -18,8 +18,8 @@ public:
     struct Sent {
         std::int32_t id = 0;
         std::string body;
-        std::chrono::nanoseconds sendTimeout{ 0 };
-        std::chrono::nanoseconds receiveTimeout{ 0 };
+        std::chrono::nanoseconds sendTimeout {0};
+        std::chrono::nanoseconds receiveTimeout {0};
         ReplyMode replyMode = ReplyMode::None;
     };
     /// What a request is met with.
@@ -61,7 +61,7 @@ public:
     std::unique_ptr<TelephonyServerConnection> RKServerConnectionCreate(NotificationHandler handler) override;
 
     bool isRunning = true;
-    LogChannelResult result{ 0, 0, "channel" };
+    LogChannelResult result {0, 0, "channel"};
     std::vector<std::string> channelsFor; // the local port names that asked
     NotificationHandler notification; // of the last connection
 };

@@ -14,7 +14,7 @@ namespace spectrel {
 /// Virtual time: a clock and a run loop that move only when told. Installs itself as the clock.
 class FakeRunLoop final : public RunLoop, public Clock {
 public:
-    static constexpr Moment Start{ std::chrono::microseconds(1'709'647'651'000'000) }; // 2024-03-05 14:07:31 +0000
+    static constexpr Moment Start {std::chrono::microseconds(1'709'647'651'000'000)}; // 2024-03-05 14:07:31 +0000
 
     FakeRunLoop();
     ~FakeRunLoop() override;
@@ -52,7 +52,7 @@ private:
     void tick(const std::shared_ptr<bool>& alive, std::chrono::nanoseconds when, std::chrono::nanoseconds interval,
         const std::shared_ptr<Job>& action);
 
-    std::chrono::nanoseconds _elapsed{ 0 };
+    std::chrono::nanoseconds _elapsed {0};
     ZoneState _zone;
     std::deque<Job> _queue;
     std::map<std::pair<std::chrono::nanoseconds, std::uint64_t>, Job> _waiting; // by due time, then by order

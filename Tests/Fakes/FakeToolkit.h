@@ -16,15 +16,15 @@ public:
     {
         measuredFonts.push_back(font);
         const auto found = sizes.find(text);
-        return found == sizes.end() ? Size{ 10.0 * static_cast<double>(text.size()), 18 } : found->second;
+        return found == sizes.end() ? Size {10.0 * static_cast<double>(text.size()), 18} : found->second;
     }
     Size mainScreenSize() const override
     {
-        return { 320, 480 };
+        return {320, 480};
     }
     void screenDidChange(ScreenPart part, Animation animation) override
     {
-        changes.push_back({ part, animation });
+        changes.push_back({part, animation});
     }
     void showAlert(const Alert& alert) override
     {

@@ -26,7 +26,7 @@ RecordBuilder RecordBuilder::withPropertyList(std::uint32_t code, const Value& p
     const auto text = serialisePropertyList(payload);
     if (!text)
         throw std::invalid_argument("not a property list");
-    return withPayload(code, { reinterpret_cast<const std::uint8_t*>(text->data()), text->size() });
+    return withPayload(code, {reinterpret_cast<const std::uint8_t*>(text->data()), text->size()});
 }
 
 RecordBuilder RecordBuilder::withPayload(std::uint32_t code, ByteView payload)
@@ -60,7 +60,7 @@ RecordBuilder& RecordBuilder::shrink(std::size_t size)
 
 RecordBuilder& RecordBuilder::wrap()
 {
-    _bytes.insert(_bytes.begin(), { 0x81, 0x00 });
+    _bytes.insert(_bytes.begin(), {0x81, 0x00});
     return *this;
 }
 

@@ -49,8 +49,8 @@ private:
 class ScribeIndex final : public ClassIndex {
 public:
     explicit ScribeIndex(std::string& diary)
-        : first(classDict, codeDictionary, "First", { 20984, 0xFF0C00 }, diary)
-        , second(classDict, codeDictionary, "Second", { 20984, 5, 5 }, diary)
+        : first(classDict, codeDictionary, "First", {20984, 0xFF0C00}, diary)
+        , second(classDict, codeDictionary, "Second", {20984, 5, 5}, diary)
     {
     }
     Scribe first;
@@ -68,7 +68,7 @@ protected:
     }
     LogRecorder log;
     std::string diary;
-    ScribeIndex index{ diary };
+    ScribeIndex index {diary};
 };
 
 TEST_F(SectionObjectsTest, SectionsOfOneCodeAreCalledInTheOrderOfTheirCreation)
@@ -90,7 +90,7 @@ TEST_F(SectionObjectsTest, CodeThatNobodyRegisteredHasNoSubscribers)
 
 TEST_F(SectionObjectsTest, KeysAreTheCodesDecimalTexts)
 {
-    EXPECT_EQ(index.getAllLogCodes(), (std::vector<std::string>{ "20984", "16714752", "5" }));
+    EXPECT_EQ(index.getAllLogCodes(), (std::vector<std::string> {"20984", "16714752", "5"}));
 }
 
 TEST_F(SectionObjectsTest, IndexWithoutSectionsHasNoCodes)
@@ -119,7 +119,7 @@ TEST_F(SectionObjectsTest, BindingLogsTheSectionName)
 TEST_F(SectionObjectsTest, WritesWithoutANodeAreLost)
 {
     deliver(20984);
-    auto node = Dictionary::make({ { "Gone", "x" } });
+    auto node = Dictionary::make({{"Gone", "x"}});
     index.first.updateSectionRef(node);
     EXPECT_EQ(displayText(node), "{\"Gone\": \"x\"}");
     deliver(20984);
@@ -160,9 +160,9 @@ TEST(LookUpECNOTest, LadderHoldsAtItsEdges)
 
 TEST(LookUpECNOTest, EveryRungIsExceededOneAboveIt)
 {
-    constexpr std::uint32_t Rungs[] = { 417647, 331808, 263624, 209463, 166441, 132268, 105123, 83562, 66435, 52830,
+    constexpr std::uint32_t Rungs[] = {417647, 331808, 263624, 209463, 166441, 132268, 105123, 83562, 66435, 52830,
         42023, 33440, 26621, 21205, 16903, 13486, 10771, 8615, 6902, 5542, 4461, 3603, 2921, 2240, 1949, 1607, 1336,
-        1120, 949, 813, 756 };
+        1120, 949, 813, 756};
     int decibels = -1;
     for (const std::uint32_t rung : Rungs)
         EXPECT_EQ(Base::lookUpECNO(rung + 1), decibels--) << rung;
@@ -170,8 +170,8 @@ TEST(LookUpECNOTest, EveryRungIsExceededOneAboveIt)
 
 TEST(ArrayOperationsTest, ReplacingAndClearingKeepTheListItself)
 {
-    const auto shown = List::make({ "a", "b" });
-    const auto fresh = List::make({ "c" });
+    const auto shown = List::make({"a", "b"});
+    const auto fresh = List::make({"c"});
     Base::replaceArray(*shown, *fresh);
     EXPECT_EQ(displayText(shown), "[\"c\"]");
     Base::clearElementsInArray(*shown);
@@ -213,7 +213,7 @@ TEST(ArrayOutOfBoundsExceptionTest, SaysWhatTheStandardLibrarySays)
 
 TEST(RecordViewTest, ReadsLittleEndianAndZeroPastTheEnd)
 {
-    const Bytes bytes{ 0x01, 0x02, 0x03, 0x84, 0xFF };
+    const Bytes bytes {0x01, 0x02, 0x03, 0x84, 0xFF};
     const RecordView record(bytes);
     EXPECT_EQ(record.u8(4), 0xFF);
     EXPECT_EQ(record.u8(5), 0);
@@ -228,7 +228,7 @@ TEST(RecordViewTest, ReadsLittleEndianAndZeroPastTheEnd)
 
 TEST(RecordViewTest, BitsRunAcrossBytesFromTheLowest)
 {
-    const Bytes bytes{ 0b1010'0000, 0b0000'0011 };
+    const Bytes bytes {0b1010'0000, 0b0000'0011};
     const RecordView record(bytes);
     EXPECT_EQ(record.bits(0, 5, 3), 0b101u);
     EXPECT_EQ(record.bits(0, 7, 3), 0b111u);

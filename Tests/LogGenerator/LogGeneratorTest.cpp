@@ -17,7 +17,7 @@ class HistoryTest : public testing::Test {
 protected:
     void fillState()
     {
-        state.set(StateKey::DisplayState, DataRef(std::make_shared<Bytes>(Bytes{ 1, 2 })));
+        state.set(StateKey::DisplayState, DataRef(std::make_shared<Bytes>(Bytes {1, 2})));
         state.set(StateKey::Display, display);
         state.set(StateKey::ExtraInfo, Dictionary::make());
     }
@@ -25,7 +25,7 @@ protected:
     {
         auto entries = List::make();
         for (int number = 0; number < count; ++number)
-            entries->append(Dictionary::make({ { "Number", std::to_string(number) } }));
+            entries->append(Dictionary::make({{"Number", std::to_string(number)}}));
         state.set(StateKey::History, entries);
     }
     const List& history()
@@ -40,7 +40,7 @@ protected:
     FakeRunLoop time;
     LogRecorder log;
     Dictionary state;
-    DictionaryRef display = Dictionary::make({ { "Cell", "1" } });
+    DictionaryRef display = Dictionary::make({{"Cell", "1"}});
 };
 
 TEST_F(HistoryTest, StateWithoutHistoryGainsOneEntry)
@@ -108,7 +108,7 @@ TEST_F(HistoryTest, AbsentExtraInfoEndsTheEntryAfterDisplay)
 
 TEST_F(HistoryTest, OnlyTheTopLevelOfTheDisplayIsCopied)
 {
-    auto nested = Dictionary::make({ { "RSRP", "-90" } });
+    auto nested = Dictionary::make({{"RSRP", "-90"}});
     display->set("Nested", nested);
     fillState();
     LogGenerator::updateHistoryInState(state);
@@ -181,8 +181,8 @@ class GeneratorSlotTest : public testing::Test {
 protected:
     GeneratorSlotTest()
     {
-        resources.lists["LTE"] = Dictionary::make({ { "SIM Info", Dictionary::make({ { "EF-ICCID", "-" } }) } });
-        resources.lists["ZPH_GSM"] = Dictionary::make({ { "PDP Context Info", List::make() } });
+        resources.lists["LTE"] = Dictionary::make({{"SIM Info", Dictionary::make({{"EF-ICCID", "-"}})}});
+        resources.lists["ZPH_GSM"] = Dictionary::make({{"PDP Context Info", List::make()}});
     }
     void use(std::string_view technology, bool hasUnbuiltMessages = false)
     {

@@ -25,7 +25,7 @@ public:
     }
     std::vector<std::uint32_t> getLogCodeArray() const override
     {
-        return { 0xB0C2, 0xFF0000 + 0x0C00 };
+        return {0xB0C2, 0xFF0000 + 0x0C00};
     }
     void updateWithData(RecordView record, std::uint32_t logCode) override
     {
@@ -35,7 +35,7 @@ public:
 };
 
 class CounterIndex final : public ClassIndex {
-    Counter objCounter{ classDict, codeDictionary };
+    Counter objCounter {classDict, codeDictionary};
 };
 
 class CounterGenerator final : public ZPHLogGenerator2 {
@@ -55,8 +55,8 @@ protected:
     TemplateGeneratorTest()
     {
         resources.lists["Counters"] = Dictionary::make({
-            { "Counter", Dictionary::make({ { "Size", "-" }, { "Code", "-" } }) },
-            { "Plain", List::make({ "text", Dictionary::make({ { "Inner", "-" } }) }) },
+            {"Counter", Dictionary::make({{"Size", "-"}, {"Code", "-"}})},
+            {"Plain", List::make({"text", Dictionary::make({{"Inner", "-"}})})},
         });
         log.takeLog();
     }
@@ -169,14 +169,14 @@ TEST_F(TemplateGeneratorTest, MissingTemplateIsLoggedAndTriedAgainAtTheNextMessa
     receive(RecordBuilder(0xB0C2, 13));
     EXPECT_EQ(log.takeLog(), "<3>Cannot load template for display\n");
     EXPECT_FALSE(state.contains(StateKey::Display));
-    resources.lists["Counters"] = Dictionary::make({ { "Counter", Dictionary::make() } });
+    resources.lists["Counters"] = Dictionary::make({{"Counter", Dictionary::make()}});
     receive(RecordBuilder(0xB0C2, 13));
     EXPECT_EQ(counter(), "{\"Size\": \"13\", \"Code\": \"45250\"}");
 }
 
 TEST_F(TemplateGeneratorTest, TemplateThatIsNoDictionaryCannotBeLoaded)
 {
-    resources.lists["Counters"] = List::make({ "x" });
+    resources.lists["Counters"] = List::make({"x"});
     receive(RecordBuilder(0xB0C2, 13));
     EXPECT_EQ(log.takeLog(), "<3>Cannot load template for display\n");
 }
@@ -184,7 +184,7 @@ TEST_F(TemplateGeneratorTest, TemplateThatIsNoDictionaryCannotBeLoaded)
 TEST_F(TemplateGeneratorTest, OtherTypesInATemplateAreLoggedAndLeftOut)
 {
     resources.lists["Counters"] =
-        Dictionary::make({ { "Counter", Value::integer(5) }, { "List", List::make({ Value::real(0.5), "text" }) } });
+        Dictionary::make({{"Counter", Value::integer(5)}, {"List", List::make({Value::real(0.5), "text"})}});
     generator.getDisplayFromState(state);
     EXPECT_EQ(displayText(state[StateKey::Display]), "{\"List\": [\"text\"]}");
     constexpr const char* Pair = "<3>Received an object of unknown type\n<4>Processing the template\n";
@@ -195,14 +195,14 @@ TEST_F(TemplateGeneratorTest, OtherTypesInATemplateAreLoggedAndLeftOut)
 
 TEST_F(TemplateGeneratorTest, SectionWhoseNodeIsATextLosesItsWrites)
 {
-    resources.lists["Counters"] = Dictionary::make({ { "Counter", "text" } });
+    resources.lists["Counters"] = Dictionary::make({{"Counter", "text"}});
     receive(RecordBuilder(0xB0C2, 13));
     EXPECT_EQ(displayText(state[StateKey::Display]), "{\"Counter\": \"text\"}");
 }
 
 TEST_F(TemplateGeneratorTest, PrintDictLogsOnlyWhatItDoesNotKnow)
 {
-    ZPHLogGenerator2::printDict(Dictionary::make({ { "a", List::make({ "x", Value::integer(1) }) }, { "b", "y" } }));
+    ZPHLogGenerator2::printDict(Dictionary::make({{"a", List::make({"x", Value::integer(1)})}, {"b", "y"}}));
     EXPECT_EQ(log.takeLog(), "<3>Received an object of unknown type\n");
 }
 

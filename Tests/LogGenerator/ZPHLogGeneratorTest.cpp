@@ -36,11 +36,11 @@ protected:
     }
     void addEntry(Bytes raw)
     {
-        history->append(Dictionary::make({ { "DisplayState", DataRef(std::make_shared<Bytes>(std::move(raw))) } }));
+        history->append(Dictionary::make({{"DisplayState", DataRef(std::make_shared<Bytes>(std::move(raw)))}}));
     }
     std::string textAt(const Bytes& dlf, std::size_t offset, std::size_t width)
     {
-        return { reinterpret_cast<const char*>(dlf.data()) + offset, width };
+        return {reinterpret_cast<const char*>(dlf.data()) + offset, width};
     }
 
     FakeRunLoop time;
@@ -68,7 +68,7 @@ TEST_F(DLFTest, StateWithoutHistoryYieldsTheVersionReportAlone)
 
 TEST_F(DLFTest, SaveContentsAreTheHistoryThenTheDLF)
 {
-    addEntry({ 1, 2, 3 });
+    addEntry({1, 2, 3});
     const auto contents = generator.getSaveContentsFromState(state);
     ASSERT_EQ(contents->count(), 2u);
     EXPECT_EQ((*contents)[0].dictionary(), (*history)[0].dictionary());
@@ -77,14 +77,14 @@ TEST_F(DLFTest, SaveContentsAreTheHistoryThenTheDLF)
 
 TEST_F(DLFTest, EntryOfOneByteContributesNothing)
 {
-    addEntry({ 0x01 });
+    addEntry({0x01});
     addEntry({});
     EXPECT_EQ(ZPHLogGenerator::generateDlfFromState(state)->size(), 161u);
 }
 
 TEST_F(DLFTest, EntryContributesAllButItsFirstByte)
 {
-    Bytes raw{ 0x01 };
+    Bytes raw {0x01};
     for (std::uint8_t byte = 0; byte < 12; ++byte)
         raw.push_back(static_cast<std::uint8_t>(0xA0 + byte));
     addEntry(raw);
@@ -95,7 +95,7 @@ TEST_F(DLFTest, EntryContributesAllButItsFirstByte)
 
 TEST_F(DLFTest, TypeBytesOfLaterRecordsInAnEntryStay)
 {
-    addEntry({ 0x01, 0xAA, 0xFF, 0xBB });
+    addEntry({0x01, 0xAA, 0xFF, 0xBB});
     const auto dlf = ZPHLogGenerator::generateDlfFromState(state);
     EXPECT_EQ(textAt(*dlf, 161, 3), "\xAA\xFF\xBB");
 }
@@ -103,14 +103,14 @@ TEST_F(DLFTest, TypeBytesOfLaterRecordsInAnEntryStay)
 TEST_F(DLFTest, EntryWithoutRawMaterialIsSkipped)
 {
     history->append(Dictionary::make());
-    addEntry({ 1, 2 });
+    addEntry({1, 2});
     EXPECT_EQ(ZPHLogGenerator::generateDlfFromState(state)->size(), 162u);
 }
 
 TEST_F(DLFTest, RawMaterialOfAnotherKindAbortsTheDLFButNotTheSnapshot)
 {
-    addEntry({ 1, 2 });
-    history->append(Dictionary::make({ { "DisplayState", Dictionary::make() } }));
+    addEntry({1, 2});
+    history->append(Dictionary::make({{"DisplayState", Dictionary::make()}}));
     EXPECT_EQ(generator.getSaveContentsFromState(state)->count(), 2u);
     EXPECT_EQ(log.takeLog(), "<16>Got wrong class writing history to DLF; aborting writing the DLF file\n");
 }
@@ -129,7 +129,7 @@ TEST_F(DLFTest, DateFieldHoldsSeventeenCharactersAndANUL)
 
 TEST_F(DLFTest, VersionReportIsLaidOutByteForByte)
 {
-    time.setZone({ -(3 * 3600 + 1830), true });
+    time.setZone({-(3 * 3600 + 1830), true});
     const auto dlf = ZPHLogGenerator::generateDlfFromState(state);
     Bytes expected(161, 0);
     const auto put = [&expected](std::size_t offset, std::string_view bytes) {

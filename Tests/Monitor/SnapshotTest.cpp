@@ -12,7 +12,7 @@
 namespace spectrel {
 namespace {
 
-constexpr Moment Opened{ std::chrono::seconds(1'709'647'651) };
+constexpr Moment Opened {std::chrono::seconds(1'709'647'651)};
 
 class SnapshotTest : public testing::Test {
 protected:
@@ -31,7 +31,7 @@ protected:
 
 TEST_F(SnapshotTest, HoldsTimestampDataAndDescriptionInOrder)
 {
-    EXPECT_EQ(displayText(makeSnapshot(Opened, List::make({ "entry" }), "in the car park")),
+    EXPECT_EQ(displayText(makeSnapshot(Opened, List::make({"entry"}), "in the car park")),
         "{\"Timestamp\": \"2024-03-05 14:07:31 +0000\", \"Data\": [\"entry\"], \"Description\": \"in the car park\"}");
 }
 
@@ -51,7 +51,7 @@ TEST_F(SnapshotTest, PathTellsTheSecond)
 TEST_F(SnapshotTest, FileIsAPropertyListForItsOwnerAlone)
 {
     const std::string path = snapshotPath(folder + "/made/at/need", Opened);
-    ASSERT_TRUE(writeSnapshot(makeSnapshot(Opened, List::make({ "entry" }), ""), path, reason)) << reason;
+    ASSERT_TRUE(writeSnapshot(makeSnapshot(Opened, List::make({"entry"}), ""), path, reason)) << reason;
     EXPECT_EQ(displayText(*readPropertyListFile(path)),
         "{\"Timestamp\": \"2024-03-05 14:07:31 +0000\", \"Data\": [\"entry\"], \"Description\": \"\"}");
     EXPECT_EQ(std::filesystem::status(path).permissions(),

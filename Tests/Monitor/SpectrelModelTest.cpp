@@ -47,9 +47,9 @@ protected:
     SpectrelModelTest()
     {
         observer.model = &model;
-        resources.lists["LTE"] = Dictionary::make(
-            { { "Serving Cell Info", Dictionary::make({ { "UARFCN", "-" } }) }, { "List", List::make() } });
-        resources.lists["ZPH_GSM"] = Dictionary::make({ { "SIM Info", Dictionary::make() } });
+        resources.lists["LTE"] =
+            Dictionary::make({{"Serving Cell Info", Dictionary::make({{"UARFCN", "-"}})}, {"List", List::make()}});
+        resources.lists["ZPH_GSM"] = Dictionary::make({{"SIM Info", Dictionary::make()}});
         answerTechnology(kRKLogChannelTechnology_Zephyr_LTE);
         ports.answer = [this](const FakeMessagePorts::Sent& request) { return answer(request); };
     }
@@ -57,12 +57,12 @@ protected:
     FakeMessagePorts::Answer answer(const FakeMessagePorts::Sent& request)
     {
         if (request.replyMode == ReplyMode::Wait)
-            return { technologyStatus, technologyReply };
-        return { startStatus, std::nullopt };
+            return {technologyStatus, technologyReply};
+        return {startStatus, std::nullopt};
     }
     void answerTechnology(const Value& technology)
     {
-        answerWith(Dictionary::make({ { "GetTechnology", technology } }));
+        answerWith(Dictionary::make({{"GetTechnology", technology}}));
     }
     void answerWith(const Value& list)
     {
@@ -93,7 +93,7 @@ protected:
     FakeMessagePorts ports;
     FakeTelephonyServer telephony;
     Observer observer;
-    SpectrelModel model{ { loop, ports, telephony }, observer, "test" };
+    SpectrelModel model {{loop, ports, telephony}, observer, "test"};
     SendStatus technologyStatus = SendStatus::Success;
     SendStatus startStatus = SendStatus::Success;
     std::optional<Bytes> technologyReply;
@@ -113,7 +113,7 @@ TEST_F(SpectrelModelTest, StartAsksForTheTechnologyThenSendsTheStartCommand)
 {
     model.startMonitor();
     EXPECT_TRUE(model.isConnected());
-    EXPECT_EQ(telephony.channelsFor, std::vector<std::string>{ PortName });
+    EXPECT_EQ(telephony.channelsFor, std::vector<std::string> {PortName});
     ASSERT_EQ(ports.sent.size(), 2u);
 
     const auto& request = ports.sent[0];
@@ -195,7 +195,7 @@ TEST_F(SpectrelModelTest, PortThatCannotBeHadFails)
 
 TEST_F(SpectrelModelTest, NameThatCannotBeBuiltFailsWithoutAMessage)
 {
-    SpectrelModel nameless({ loop, ports, telephony }, observer, "");
+    SpectrelModel nameless({loop, ports, telephony}, observer, "");
     EXPECT_FALSE(nameless.createPorts());
     EXPECT_EQ(log.takeLog(), "");
 }
@@ -210,7 +210,7 @@ TEST_F(SpectrelModelTest, ServiceThatDoesNotRunFails)
 
 TEST_F(SpectrelModelTest, ErrorOfTheServiceIsLoggedWithItsCode)
 {
-    telephony.result = { 1, -42, "channel" };
+    telephony.result = {1, -42, "channel"};
     model.startMonitor();
     EXPECT_EQ(log.takeLog(),
         "<3>_RKServerConnectionNetworkMonitorCreateLogChannel returns error: -42!\n"
@@ -219,8 +219,8 @@ TEST_F(SpectrelModelTest, ErrorOfTheServiceIsLoggedWithItsCode)
 
 TEST_F(SpectrelModelTest, EmptyServicePortNameIsTreatedLikeAMissingOne)
 {
-    for (const std::optional<std::string>& name : { std::optional<std::string>(), std::optional<std::string>("") }) {
-        telephony.result = { 0, 0, name };
+    for (const std::optional<std::string>& name : {std::optional<std::string>(), std::optional<std::string>("")}) {
+        telephony.result = {0, 0, name};
         EXPECT_FALSE(model.createPorts());
         EXPECT_EQ(log.takeLog(), "<3>Could not create a log channel (RK returned null port)!\n");
         model.destroyPorts();
@@ -256,16 +256,15 @@ struct TechnologyFailure {
 TEST_F(SpectrelModelTest, EachFailureOfTheTechnologyRequestHasItsLine)
 {
     const TechnologyFailure failures[] = {
-        { "no answer", SendStatus::ReceiveTimeout, {},
-            "<3> ***** Could not send the GetTechnology command (got error=-2)\n" },
-        { "full", SendStatus::SendTimeout, "x", "<3> ***** Could not send the GetTechnology command (got error=-1)\n" },
-        { "empty", SendStatus::Success, {}, "<3> ***** No response to GetTechnology; cannot configure\n" },
-        { "garbage", SendStatus::Success, "gar",
-            "<3> ***** Could not parse reply to GetTechnology; cannot configure\n" },
-        { "a text", SendStatus::Success, "<plist version=\"1.0\"><string>x</string></plist>",
-            "<3> ***** Could not parse reply to GetTechnology; cannot configure\n" },
-        { "no key", SendStatus::Success, "<plist version=\"1.0\"><dict/></plist>",
-            "<3> ***** Reply to GetTechnology had no answer; cannot configure\n" },
+        {"no answer", SendStatus::ReceiveTimeout, {},
+            "<3> ***** Could not send the GetTechnology command (got error=-2)\n"},
+        {"full", SendStatus::SendTimeout, "x", "<3> ***** Could not send the GetTechnology command (got error=-1)\n"},
+        {"empty", SendStatus::Success, {}, "<3> ***** No response to GetTechnology; cannot configure\n"},
+        {"garbage", SendStatus::Success, "gar", "<3> ***** Could not parse reply to GetTechnology; cannot configure\n"},
+        {"a text", SendStatus::Success, "<plist version=\"1.0\"><string>x</string></plist>",
+            "<3> ***** Could not parse reply to GetTechnology; cannot configure\n"},
+        {"no key", SendStatus::Success, "<plist version=\"1.0\"><dict/></plist>",
+            "<3> ***** Reply to GetTechnology had no answer; cannot configure\n"},
     };
     for (const auto& failure : failures) {
         technologyStatus = failure.status;
@@ -302,7 +301,7 @@ TEST_F(SpectrelModelTest, RestartWithoutAnAnswerReusesTheGeneratorAndSendsItsSta
 TEST_F(SpectrelModelTest, MessageOfAnotherIdChangesNothing)
 {
     model.startMonitor();
-    for (const std::int32_t id : { 1, -1, 7 }) {
+    for (const std::int32_t id : {1, -1, 7}) {
         receive(servingCell(), id);
         EXPECT_EQ(observer.received, 0u);
     }
@@ -367,7 +366,7 @@ TEST_F(SpectrelModelTest, ServiceThatReturnsWithAnotherTechnologyGetsItsOwnDispl
     ports.killPeers();
     loop.advance(2s);
     EXPECT_EQ(model.technology(), kRKLogChannelTechnology_Zephyr_GSM);
-    receive(RecordBuilder::withPropertyList(0xFF0000, Dictionary::make({ { "kSimFile_ICCID", "1" } })));
+    receive(RecordBuilder::withPropertyList(0xFF0000, Dictionary::make({{"kSimFile_ICCID", "1"}})));
     loop.advance(2s);
     EXPECT_EQ(model.nodeAtPath("/Serving Cell Info"), nullptr);
     EXPECT_EQ(*model.nodeAtPath("/SIM Info/EF-ICCID")->value(), "1");
@@ -387,7 +386,7 @@ TEST_F(SpectrelModelTest, JobsThatOutliveTheModelDoNothing)
 {
     telephony.isRunning = false;
     {
-        SpectrelModel shortLived({ loop, ports, telephony }, observer, "brief");
+        SpectrelModel shortLived({loop, ports, telephony}, observer, "brief");
         observer.model = &shortLived;
         shortLived.startMonitor();
     }
@@ -492,7 +491,7 @@ TEST_F(SpectrelModelTest, LastContentsHoldWhatNoRefreshHasSeen)
 TEST_F(SpectrelModelTest, ExceptionOfARecordEndsTheProcess)
 {
     model.startMonitor();
-    const Bytes garbage{ 1, 2, 3 };
+    const Bytes garbage {1, 2, 3};
     EXPECT_DEATH(ports.deliver(PortName, 0, RecordBuilder::withPayload(0xFF0000, garbage)), "");
 }
 

@@ -25,7 +25,7 @@ std::string bigEndian(std::uint64_t number, std::size_t width)
 
 std::string parsed(std::string_view bytes)
 {
-    const auto value = parsePropertyList({ reinterpret_cast<const std::uint8_t*>(bytes.data()), bytes.size() });
+    const auto value = parsePropertyList({reinterpret_cast<const std::uint8_t*>(bytes.data()), bytes.size()});
     return value ? valueText(*value) : Refused;
 }
 
@@ -59,7 +59,7 @@ struct BinaryList {
 
 std::string single(const std::string& object)
 {
-    return BinaryList{ { object } }.parsed();
+    return BinaryList {{object}}.parsed();
 }
 
 /// A reference of two bytes.
@@ -82,8 +82,8 @@ TEST(BinaryPropertyListTest, EveryKindIsRead)
     EXPECT_EQ(single("\x52hi"), "s6869");
     EXPECT_EQ(single("\x61\0\xE4"s), "sc3a4");
     EXPECT_EQ(single("\x62\xD8\x3D\xDC\xF6"), "sf09f93b6");
-    EXPECT_EQ((BinaryList{ { "\xA2\x01\x01", "\x09" } }.parsed()), "[T,T]");
-    EXPECT_EQ((BinaryList{ { "\xD1\x01\x02", "\x51k", "\x08" } }.parsed()), "{6b:F}");
+    EXPECT_EQ((BinaryList {{"\xA2\x01\x01", "\x09"}}.parsed()), "[T,T]");
+    EXPECT_EQ((BinaryList {{"\xD1\x01\x02", "\x51k", "\x08"}}.parsed()), "{6b:F}");
 }
 
 TEST(BinaryPropertyListTest, IntegersOfEveryWidthAreRead)
@@ -128,15 +128,15 @@ TEST(BinaryPropertyListTest, OverlongCountsDoNotParse)
     EXPECT_EQ(single("\x62\0\x41\0"s), Refused);
     EXPECT_EQ(single("\x4F\x13" + bigEndian(~0ull, 8)), Refused);
     EXPECT_EQ(single("\x6F\x13" + bigEndian(1ull << 63, 8)), Refused);
-    EXPECT_EQ((BinaryList{ { "\xA9\x01", "\x09" } }.parsed()), Refused);
-    EXPECT_EQ((BinaryList{ { "\xAF\x13" + bigEndian(1ull << 62, 8), "\x09" } }.parsed()), Refused);
-    EXPECT_EQ((BinaryList{ { "\xDF\x13" + bigEndian(1ull << 62, 8), "\x09" } }.parsed()), Refused);
+    EXPECT_EQ((BinaryList {{"\xA9\x01", "\x09"}}.parsed()), Refused);
+    EXPECT_EQ((BinaryList {{"\xAF\x13" + bigEndian(1ull << 62, 8), "\x09"}}.parsed()), Refused);
+    EXPECT_EQ((BinaryList {{"\xDF\x13" + bigEndian(1ull << 62, 8), "\x09"}}.parsed()), Refused);
 }
 
 TEST(BinaryPropertyListTest, KindsThatNoListHoldsDoNotParse)
 {
-    for (const char* object : { "\x0F", "\x01", "\x0C", "\x21\x01\x01", "\x24", "\x30", "\x32\x01\x01\x01\x01", "\x71x",
-             "\x80\x01", "\xB0", "\xC0", "\xE0", "\xF0", "\x90" })
+    for (const char* object : {"\x0F", "\x01", "\x0C", "\x21\x01\x01", "\x24", "\x30", "\x32\x01\x01\x01\x01", "\x71x",
+             "\x80\x01", "\xB0", "\xC0", "\xE0", "\xF0", "\x90"})
         EXPECT_EQ(single(object), Refused) << object;
     EXPECT_EQ(single("\0"s), Refused); // null
 }
@@ -157,26 +157,26 @@ TEST(BinaryPropertyListTest, DatesThatAreNoMomentDoNotParse)
 
 TEST(BinaryPropertyListTest, KeysMustBeTexts)
 {
-    EXPECT_EQ((BinaryList{ { "\xD1\x01\x02", "\x10\x01", "\x08" } }.parsed()), Refused);
-    EXPECT_EQ((BinaryList{ { "\xD1\x07\x01", "\x08" } }.parsed()), Refused);
+    EXPECT_EQ((BinaryList {{"\xD1\x01\x02", "\x10\x01", "\x08"}}.parsed()), Refused);
+    EXPECT_EQ((BinaryList {{"\xD1\x07\x01", "\x08"}}.parsed()), Refused);
 }
 
 TEST(BinaryPropertyListTest, KeyGivenTwiceKeepsItsPlaceAndTheLastValue)
 {
     EXPECT_EQ(
-        (BinaryList{ { "\xD3\x01\x02\x01\x03\x03\x04", "\x51k", "\x51m", "\x08", "\x09" } }.parsed()), "{6b:T,6d:F}");
+        (BinaryList {{"\xD3\x01\x02\x01\x03\x03\x04", "\x51k", "\x51m", "\x08", "\x09"}}.parsed()), "{6b:T,6d:F}");
 }
 
 TEST(BinaryPropertyListTest, ReferencesOutOfRangeDoNotParse)
 {
-    EXPECT_EQ((BinaryList{ { "\xA1\x02", "\x09" } }.parsed()), Refused);
-    EXPECT_EQ((BinaryList{ .objects = { "\x09" }, .top = 1 }.parsed()), Refused);
+    EXPECT_EQ((BinaryList {{"\xA1\x02", "\x09"}}.parsed()), Refused);
+    EXPECT_EQ((BinaryList {.objects = {"\x09"}, .top = 1}.parsed()), Refused);
 }
 
 TEST(BinaryPropertyListTest, OffsetsOutOfRangeDoNotParse)
 {
-    for (const std::uint64_t offset : { 0, 7, 9, 10, 0xFFFF }) {
-        std::string bytes = BinaryList{ { "\x09" } }.bytes();
+    for (const std::uint64_t offset : {0, 7, 9, 10, 0xFFFF}) {
+        std::string bytes = BinaryList {{"\x09"}}.bytes();
         bytes.replace(9, 2, bigEndian(offset, 2));
         EXPECT_EQ(parsed(bytes), Refused) << offset;
     }
@@ -184,24 +184,24 @@ TEST(BinaryPropertyListTest, OffsetsOutOfRangeDoNotParse)
 
 TEST(BinaryPropertyListTest, WrongTrailersDoNotParse)
 {
-    EXPECT_EQ((BinaryList{ .objects = { "\x09" }, .moreObjects = 1 }.parsed()), Refused);
-    EXPECT_EQ((BinaryList{ .objects = { "\x09" }, .moreObjects = -1 }.parsed()), Refused);
-    EXPECT_EQ((BinaryList{ .objects = { "\x09" }, .tableShift = 1 }.parsed()), Refused);
-    EXPECT_EQ((BinaryList{ .objects = { "\x09" }, .tableShift = -1 }.parsed()), Refused);
-    EXPECT_EQ((BinaryList{ .objects = { "\x09" }, .tableShift = 1000 }.parsed()), Refused);
-    EXPECT_EQ((BinaryList{ .objects = { "\x09" }, .offsetWidth = 9 }.parsed()), Refused);
-    EXPECT_EQ((BinaryList{ .objects = { "\x09" }, .referenceWidth = 0 }.parsed()), Refused);
-    EXPECT_EQ((BinaryList{ .objects = { "\x09" }, .referenceWidth = 9 }.parsed()), Refused);
-    EXPECT_EQ(BinaryList{}.parsed(), Refused);
+    EXPECT_EQ((BinaryList {.objects = {"\x09"}, .moreObjects = 1}.parsed()), Refused);
+    EXPECT_EQ((BinaryList {.objects = {"\x09"}, .moreObjects = -1}.parsed()), Refused);
+    EXPECT_EQ((BinaryList {.objects = {"\x09"}, .tableShift = 1}.parsed()), Refused);
+    EXPECT_EQ((BinaryList {.objects = {"\x09"}, .tableShift = -1}.parsed()), Refused);
+    EXPECT_EQ((BinaryList {.objects = {"\x09"}, .tableShift = 1000}.parsed()), Refused);
+    EXPECT_EQ((BinaryList {.objects = {"\x09"}, .offsetWidth = 9}.parsed()), Refused);
+    EXPECT_EQ((BinaryList {.objects = {"\x09"}, .referenceWidth = 0}.parsed()), Refused);
+    EXPECT_EQ((BinaryList {.objects = {"\x09"}, .referenceWidth = 9}.parsed()), Refused);
+    EXPECT_EQ(BinaryList {}.parsed(), Refused);
     EXPECT_EQ(parsed("bplist00"), Refused);
     EXPECT_EQ(parsed("bplist00" + std::string(32, '\0')), Refused);
     EXPECT_EQ(parsed("bplist00" + std::string(32, '\xFF')), Refused);
-    EXPECT_EQ(parsed("bplist01" + BinaryList{ { "\x09" } }.bytes().substr(8)), Refused);
+    EXPECT_EQ(parsed("bplist01" + BinaryList {{"\x09"}}.bytes().substr(8)), Refused);
 }
 
 TEST(BinaryPropertyListTest, TruncationAndTrailingGarbageDoNotParse)
 {
-    const std::string whole = BinaryList{ { "\xD1\x01\x02", "\x51k", "\x5F\x10\x10sixteen letters!" } }.bytes();
+    const std::string whole = BinaryList {{"\xD1\x01\x02", "\x51k", "\x5F\x10\x10sixteen letters!"}}.bytes();
     ASSERT_NE(parsed(whole), Refused);
     for (std::size_t length = 0; length < whole.size(); ++length)
         EXPECT_EQ(parsed(whole.substr(0, length)), Refused) << length;
@@ -211,14 +211,14 @@ TEST(BinaryPropertyListTest, TruncationAndTrailingGarbageDoNotParse)
 
 TEST(BinaryPropertyListTest, CyclesDoNotParse)
 {
-    EXPECT_EQ((BinaryList{ { "\xA1"s + '\0' } }.parsed()), Refused);
-    EXPECT_EQ((BinaryList{ { "\xA2"s + '\0' + '\0' } }.parsed()), Refused);
-    EXPECT_EQ((BinaryList{ { "\xD1\x01"s + '\0', "\x51k" } }.parsed()), Refused);
+    EXPECT_EQ((BinaryList {{"\xA1"s + '\0'}}.parsed()), Refused);
+    EXPECT_EQ((BinaryList {{"\xA2"s + '\0' + '\0'}}.parsed()), Refused);
+    EXPECT_EQ((BinaryList {{"\xD1\x01"s + '\0', "\x51k"}}.parsed()), Refused);
 }
 
 TEST(BinaryPropertyListTest, SharedContainersThatMultiplyDoNotParse)
 {
-    BinaryList list{ .objects = {}, .referenceWidth = 2 };
+    BinaryList list {.objects = {}, .referenceWidth = 2};
     for (std::uint64_t i = 0; i < 40; ++i)
         list.objects.push_back("\xA2" + to(i + 1) + to(i + 1));
     list.objects.push_back("\x09");
@@ -232,9 +232,9 @@ TEST(BinaryPropertyListTest, SharedTextsAreCountedEachTime)
         std::string references = "\xAF\x11" + bigEndian(count, 2);
         for (std::size_t i = 0; i < count; ++i)
             references += to(1);
-        const BinaryList list{ .objects = { references, megabyte }, .offsetWidth = 4, .referenceWidth = 2 };
+        const BinaryList list {.objects = {references, megabyte}, .offsetWidth = 4, .referenceWidth = 2};
         const std::string bytes = list.bytes();
-        return parsePropertyList({ reinterpret_cast<const std::uint8_t*>(bytes.data()), bytes.size() }).has_value();
+        return parsePropertyList({reinterpret_cast<const std::uint8_t*>(bytes.data()), bytes.size()}).has_value();
     };
     EXPECT_TRUE(times(64));
     EXPECT_FALSE(times(65));
@@ -243,7 +243,7 @@ TEST(BinaryPropertyListTest, SharedTextsAreCountedEachTime)
 TEST(BinaryPropertyListTest, DepthIsBounded)
 {
     const auto nested = [](std::uint64_t depth) {
-        BinaryList list{ .objects = {}, .referenceWidth = 2 };
+        BinaryList list {.objects = {}, .referenceWidth = 2};
         for (std::uint64_t i = 1; i < depth; ++i)
             list.objects.push_back("\xA1" + to(i));
         list.objects.push_back("\xA0");
@@ -256,10 +256,10 @@ TEST(BinaryPropertyListTest, DepthIsBounded)
 TEST(BinaryPropertyListTest, WideReferencesAndOffsetsAreRead)
 {
     EXPECT_EQ(
-        (BinaryList{ .objects = { "\xA1" + bigEndian(1, 8), "\x09" }, .offsetWidth = 8, .referenceWidth = 8 }.parsed()),
+        (BinaryList {.objects = {"\xA1" + bigEndian(1, 8), "\x09"}, .offsetWidth = 8, .referenceWidth = 8}.parsed()),
         "[T]");
     EXPECT_EQ(
-        (BinaryList{ .objects = { "\xA1" + bigEndian(1, 3), "\x09" }, .offsetWidth = 1, .referenceWidth = 3 }.parsed()),
+        (BinaryList {.objects = {"\xA1" + bigEndian(1, 3), "\x09"}, .offsetWidth = 1, .referenceWidth = 3}.parsed()),
         "[T]");
 }
 

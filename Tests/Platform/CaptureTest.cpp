@@ -53,7 +53,7 @@ TEST(CaptureTest, WrittenMessagesReadBackWithTimeAndTechnology)
 {
     const ScratchFolder folder;
     for (const Technology technology :
-        { Technology::IFX, Technology::GSM, Technology::CDMA, Technology::LTE, Technology::UTRAN }) {
+        {Technology::IFX, Technology::GSM, Technology::CDMA, Technology::LTE, Technology::UTRAN}) {
         std::string reason;
         auto writer = createRecording(folder.file("x.pcap"), technology, reason);
         ASSERT_TRUE(writer) << reason;
@@ -64,8 +64,8 @@ TEST(CaptureTest, WrittenMessagesReadBackWithTimeAndTechnology)
         writer.reset();
         const RecordingText text = readRecording(folder.file("x.pcap"));
         EXPECT_EQ(text.technology, technology);
-        EXPECT_EQ(text.messages, (std::vector<std::string>{ "first", std::string(3, '\0'), "last" }));
-        EXPECT_EQ(text.times, (std::vector<std::int64_t>{ 1'733'000'000'123'456, 0, 4'294'967'295'999'999 }));
+        EXPECT_EQ(text.messages, (std::vector<std::string> {"first", std::string(3, '\0'), "last"}));
+        EXPECT_EQ(text.times, (std::vector<std::int64_t> {1'733'000'000'123'456, 0, 4'294'967'295'999'999}));
         EXPECT_EQ(text.damage, "");
     }
 }
@@ -94,7 +94,7 @@ TEST(CaptureTest, MessagesOfEitherBoundAreWrittenAndRead)
     EXPECT_EQ(writer->error(), "a message has 1 to 262144 bytes, this one has 262145");
     EXPECT_TRUE(writer->write(at(0), viewOf("after"))); // nothing of the refused ones is in the file
     writer.reset();
-    EXPECT_EQ(readRecording(folder.file("x")).messages, (std::vector<std::string>{ "x", longest, "after" }));
+    EXPECT_EQ(readRecording(folder.file("x")).messages, (std::vector<std::string> {"x", longest, "after"}));
 }
 
 TEST(CaptureTest, TimesThatACaptureCannotTellAreRefused)
@@ -136,14 +136,14 @@ TEST(CaptureTest, PlaceThatCannotBeWrittenIsReported)
 TEST(CaptureTest, BothByteOrdersAndBothTimeUnitsAreRead)
 {
     const ScratchFolder folder;
-    for (const bool swapped : { false, true }) {
+    for (const bool swapped : {false, true}) {
         folder.write("micro", CaptureBytes(0xA1B2C3D4, 148, swapped).packet(5, 123456, "message").bytes);
         folder.write("nano", CaptureBytes(0xA1B23C4D, 148, swapped).packet(5, 123456789, "message").bytes);
-        for (const char* name : { "micro", "nano" }) {
+        for (const char* name : {"micro", "nano"}) {
             const RecordingText text = readRecording(folder.file(name));
             EXPECT_EQ(text.technology, Technology::GSM);
-            EXPECT_EQ(text.messages, std::vector<std::string>{ "message" });
-            EXPECT_EQ(text.times, std::vector<std::int64_t>{ 5'123'456 });
+            EXPECT_EQ(text.messages, std::vector<std::string> {"message"});
+            EXPECT_EQ(text.times, std::vector<std::int64_t> {5'123'456});
             EXPECT_EQ(text.damage, "");
         }
     }
@@ -152,7 +152,7 @@ TEST(CaptureTest, BothByteOrdersAndBothTimeUnitsAreRead)
 TEST(CaptureTest, OtherLinkTypesTellNoTechnology)
 {
     const ScratchFolder folder;
-    for (const std::uint32_t linkType : { 1u, 146u, 152u }) {
+    for (const std::uint32_t linkType : {1u, 146u, 152u}) {
         const auto path = folder.write("x", CaptureBytes(0xA1B2C3D4, linkType).packet(5, 0, "message").bytes);
         const RecordingText text = readRecording(path);
         EXPECT_FALSE(text.technology) << linkType;
@@ -206,7 +206,7 @@ TEST(CaptureTest, MessageThatWasCapturedInPartIsDamage)
     const ScratchFolder folder;
     const auto path = folder.write("x", CaptureBytes().packet(1, 0, "whole").packet(2, 0, "part", 3).bytes);
     const RecordingText text = readRecording(path);
-    EXPECT_EQ(text.messages, std::vector<std::string>{ "whole" });
+    EXPECT_EQ(text.messages, std::vector<std::string> {"whole"});
     EXPECT_EQ(text.damage, "message 1 at byte 45: only 4 of 7 bytes were captured");
 }
 
@@ -220,8 +220,8 @@ TEST(CaptureTest, NewerCaptureFormIsRead)
     const std::string whole = section + interface + packet + packet;
     RecordingText text = readRecording(folder.write("x", whole));
     EXPECT_EQ(text.technology, Technology::LTE);
-    EXPECT_EQ(text.messages, (std::vector<std::string>{ "body", "body" }));
-    EXPECT_EQ(text.times, (std::vector<std::int64_t>{ 7'000'001, 7'000'001 }));
+    EXPECT_EQ(text.messages, (std::vector<std::string> {"body", "body"}));
+    EXPECT_EQ(text.times, (std::vector<std::int64_t> {7'000'001, 7'000'001}));
     EXPECT_EQ(text.damage, "");
     text = readRecording(folder.write("x", whole.substr(0, whole.size() - 10)));
     EXPECT_EQ(text.messages.size(), 1u);
@@ -254,7 +254,7 @@ TEST(CaptureTest, CaptureComesThroughAPipe)
     ASSERT_TRUE(pipe);
     const RecordingText text = readRecording("/dev/fd/" + std::to_string(::fileno(pipe)));
     ::pclose(pipe);
-    EXPECT_EQ(text.messages, (std::vector<std::string>{ "first", "second" }));
+    EXPECT_EQ(text.messages, (std::vector<std::string> {"first", "second"}));
 }
 
 } // namespace spectrel

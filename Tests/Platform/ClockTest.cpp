@@ -23,7 +23,7 @@ TEST(ClockTest, DefaultDateFormIsInUTCToTheSecond)
 
 TEST(ClockTest, DefaultDateFormReadsBack)
 {
-    for (const std::int64_t count : { 0l, 1709647651l, 951782400l, 4107542399l, -1l }) {
+    for (const std::int64_t count : {0l, 1709647651l, 951782400l, 4107542399l, -1l}) {
         Moment moment;
         ASSERT_TRUE(parseDefaultDateForm(defaultDateForm(seconds(count)), moment)) << count;
         EXPECT_EQ(moment, seconds(count));
@@ -41,12 +41,12 @@ TEST(ClockTest, OffsetFromUTCIsTakenOff)
 
 TEST(ClockTest, OtherFormsAreRefusedAndLeaveTheMoment)
 {
-    for (const char* text : { "", "2024-03-05", "2024-03-05 14:07:31", "2024-03-05T14:07:31 +0000",
+    for (const char* text : {"", "2024-03-05", "2024-03-05 14:07:31", "2024-03-05T14:07:31 +0000",
              " 2024-03-05 14:07:31 +0000", "2024-03-05 14:07:31 +0000 ", "2024-3-5 14:07:31 +0000",
              "2024-13-05 14:07:31 +0000", "2023-02-29 14:07:31 +0000", "2024-03-05 24:07:31 +0000",
              "2024-03-05 14:60:31 +0000", "2024-03-05 14:07:60 +0000", "2024-03-05 14:07:31 *0000",
              "2024-03-05 14:07:31 +0060", "2024-03- 5 14:07:31 +0000", "2024-03-05 -4:07:31 +0000",
-             "+024-03-05 14:07:31 +0000", "2024-00-05 14:07:31 +0000" }) {
+             "+024-03-05 14:07:31 +0000", "2024-00-05 14:07:31 +0000"}) {
         Moment moment = seconds(7);
         EXPECT_FALSE(parseDefaultDateForm(text, moment)) << text;
         EXPECT_EQ(moment, seconds(7)) << text;

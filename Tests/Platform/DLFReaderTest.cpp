@@ -70,41 +70,40 @@ TEST_F(DLFReaderTest, VersionReportAloneHoldsNoMessage)
 
 TEST_F(DLFReaderTest, LoneItemsGetTheirTypeByteBack)
 {
-    expectRestored(
-        { { record(0xB0C2, "abc") }, { record(0x0010) }, { record(0x000F, "x", '\xFF') }, { record(0, "", '\xFF') } });
+    expectRestored({{record(0xB0C2, "abc")}, {record(0x0010)}, {record(0x000F, "x", '\xFF')}, {record(0, "", '\xFF')}});
 }
 
 TEST_F(DLFReaderTest, TimeIsThatOfWriting)
 {
-    const RecordingText text = read(dlf({ { record(1), record(2) } }, 4'000'000'000u));
-    EXPECT_EQ(text.times, (std::vector<std::int64_t>{ 4'000'000'000'000'000, 4'000'000'000'000'000 }));
+    const RecordingText text = read(dlf({{record(1), record(2)}}, 4'000'000'000u));
+    EXPECT_EQ(text.times, (std::vector<std::int64_t> {4'000'000'000'000'000, 4'000'000'000'000'000}));
 }
 
 TEST_F(DLFReaderTest, TypeBytesOfLaterRecordsAreNotTakenForItems)
 {
     const std::string a = record(0xB0C2, "abc");
     const std::string b = record(0x0C00, "defgh", '\xFF'); // its type byte stands in the file, whatever its code
-    expectRestored({ { a, b, a }, { a, a, b } });
+    expectRestored({{a, b, a}, {a, a, b}});
 }
 
 TEST_F(DLFReaderTest, WrappersOfLaterRecordsAreKept)
 {
     const std::string a = record(0xB0C2, "abc");
-    expectRestored({ { a, wrapped(a), a, wrapped(record(7, "x", '\xFF'), '\x01') } });
+    expectRestored({{a, wrapped(a), a, wrapped(record(7, "x", '\xFF'), '\x01')}});
 }
 
 TEST_F(DLFReaderTest, FirstRecordsWrapperIsRestored)
 {
     const std::string a = record(0xB0C2, "abc");
-    expectRestored({ { wrapped(a) }, { wrapped(a, '\x01'), a }, { wrapped(a, '\xFF'), wrapped(a, '\x81') }, { a } });
+    expectRestored({{wrapped(a)}, {wrapped(a, '\x01'), a}, {wrapped(a, '\xFF'), wrapped(a, '\x81')}, {a}});
 }
 
 TEST_F(DLFReaderTest, LengthsThatLookLikeTypeBytesAreTakenAsLengths)
 {
     for (const std::size_t payload :
-        { 0xFFu - 12, 0x101u - 12, 0x1FFu - 12, 0x1FFu + 0x100u - 12, 0x81u - 12, 0x181u - 12 }) {
+        {0xFFu - 12, 0x101u - 12, 0x1FFu - 12, 0x1FFu + 0x100u - 12, 0x81u - 12, 0x181u - 12}) {
         const std::string a = record(0xB0C2, std::string(payload, 'a'));
-        expectRestored({ { a, a, wrapped(a) }, { a }, { a, a } });
+        expectRestored({{a, a, wrapped(a)}, {a}, {a, a}});
     }
 }
 
@@ -141,27 +140,27 @@ TEST_F(DLFReaderTest, FilesOfLoneItemsAreReadItemByItem)
     std::mt19937 random(31);
     std::vector<Messages> history;
     for (int i = 0; i < 5000; ++i)
-        history.push_back({ record(0xB0C2, randomBytes(random, random() % 600)) });
+        history.push_back({record(0xB0C2, randomBytes(random, random() % 600))});
     expectRestored(history);
 }
 
 TEST_F(DLFReaderTest, ShortMessageBetweenOthersIsKept)
 {
     const std::string a = record(0xB0C2, "abc");
-    expectRestored({ { a, a, "short", a, a } });
+    expectRestored({{a, a, "short", a, a}});
 }
 
 TEST_F(DLFReaderTest, EntryOfOneByteLeavesNothing)
 {
     const std::string a = record(0xB0C2, "abc");
-    EXPECT_EQ(read(dlf({ { "x" }, { a } })).messages, Messages{ a });
+    EXPECT_EQ(read(dlf({{"x"}, {a}})).messages, Messages {a});
 }
 
 TEST_F(DLFReaderTest, TruncationAnywhereYieldsTheMessagesBefore)
 {
     const std::string a = record(0xB0C2, "abcdef");
-    const std::string whole = dlf({ { a, a }, { wrapped(a), a } });
-    const std::size_t ends[] = { 161, 161 + 18, 161 + 37, 161 + 37 + 20, whole.size() };
+    const std::string whole = dlf({{a, a}, {wrapped(a), a}});
+    const std::size_t ends[] = {161, 161 + 18, 161 + 37, 161 + 37 + 20, whole.size()};
     for (std::size_t length = 161; length <= whole.size(); ++length) {
         const RecordingText text = read(whole.substr(0, length));
         const auto complete =
@@ -184,9 +183,9 @@ TEST_F(DLFReaderTest, TruncatedVersionReportIsDamage)
 TEST_F(DLFReaderTest, DamageTellsMessageAndPlace)
 {
     const std::string a = record(0xB0C2, "abcdef");
-    EXPECT_EQ(read(dlf({ { a, a.substr(0, 16) } })).damage,
+    EXPECT_EQ(read(dlf({{a, a.substr(0, 16)}})).damage,
         "message 1 at byte 179: the item has a length of 18, 15 bytes are left");
-    EXPECT_EQ(read(dlf({ { a } }) + "xyz").damage, "message 1 at byte 179: 3 bytes are left, too few for a message");
+    EXPECT_EQ(read(dlf({{a}}) + "xyz").damage, "message 1 at byte 179: 3 bytes are left, too few for a message");
 }
 
 TEST_F(DLFReaderTest, FileWithoutVersionReportIsReadWithTimeZero)
@@ -194,16 +193,16 @@ TEST_F(DLFReaderTest, FileWithoutVersionReportIsReadWithTimeZero)
     const std::string a = record(0xB0C2, "abcdef");
     const std::string b = record(0x0002, "x", '\xFF');
     const RecordingText text = read(a.substr(1) + b.substr(1) + a.substr(1));
-    EXPECT_EQ(text.messages, (Messages{ a, b, a }));
-    EXPECT_EQ(text.times, (std::vector<std::int64_t>{ 0, 0, 0 }));
+    EXPECT_EQ(text.messages, (Messages {a, b, a}));
+    EXPECT_EQ(text.times, (std::vector<std::int64_t> {0, 0, 0}));
 }
 
 /// Bytes under which every place may start a message end in time that grows with their number, not with the ways to
 /// cut.
 TEST_F(DLFReaderTest, HostileBytesEnd)
 {
-    for (const std::string& pattern : { std::string("\x0C\0", 2), std::string("\x01\x0C\0", 3), std::string("\x0C"),
-             std::string("\x01\x01"), std::string("\x81\x01\x0C\0\xFF\x0D\0", 7), std::string("\0", 1) }) {
+    for (const std::string& pattern : {std::string("\x0C\0", 2), std::string("\x01\x0C\0", 3), std::string("\x0C"),
+             std::string("\x01\x01"), std::string("\x81\x01\x0C\0\xFF\x0D\0", 7), std::string("\0", 1)}) {
         std::string bytes = versionReport();
         while (bytes.size() < 700'000)
             bytes += pattern;

@@ -24,7 +24,7 @@ std::string keys(const Dictionary& dictionary)
 
 TEST(DictionaryTest, KeepsInsertionOrderAndOverwritingKeepsThePlace)
 {
-    Dictionary dictionary{ { "c", "1" }, { "a", "2" }, { "b", "3" } };
+    Dictionary dictionary {{"c", "1"}, {"a", "2"}, {"b", "3"}};
     dictionary.set("a", "new");
     dictionary.setText("c", "also new");
     EXPECT_EQ(keys(dictionary), "c a b ");
@@ -33,7 +33,7 @@ TEST(DictionaryTest, KeepsInsertionOrderAndOverwritingKeepsThePlace)
 
 TEST(DictionaryTest, RemovingAndStoringAgainAppends)
 {
-    Dictionary dictionary{ { "a", "1" }, { "b", "2" }, { "c", "3" } };
+    Dictionary dictionary {{"a", "1"}, {"b", "2"}, {"c", "3"}};
     dictionary.remove("a");
     dictionary.set("a", "4");
     EXPECT_EQ(keys(dictionary), "b c a ");
@@ -41,7 +41,7 @@ TEST(DictionaryTest, RemovingAndStoringAgainAppends)
 
 TEST(DictionaryTest, MissingKeyReadsAsAbsent)
 {
-    const Dictionary dictionary{ { "a", "1" } };
+    const Dictionary dictionary {{"a", "1"}};
     EXPECT_TRUE(dictionary["b"].isAbsent());
     EXPECT_FALSE(dictionary.contains("b"));
     EXPECT_TRUE(dictionary.contains("a"));
@@ -49,7 +49,7 @@ TEST(DictionaryTest, MissingKeyReadsAsAbsent)
 
 TEST(DictionaryTest, AbsentValueRemovesTheKey)
 {
-    Dictionary dictionary{ { "a", "1" }, { "b", "2" } };
+    Dictionary dictionary {{"a", "1"}, {"b", "2"}};
     dictionary.set("a", Value());
     dictionary.set("never there", Value());
     EXPECT_EQ(keys(dictionary), "b ");
@@ -57,14 +57,14 @@ TEST(DictionaryTest, AbsentValueRemovesTheKey)
 
 TEST(DictionaryTest, TextOverAnotherKindReplacesIt)
 {
-    Dictionary dictionary{ { "a", List::make() } };
+    Dictionary dictionary {{"a", List::make()}};
     dictionary.setText("a", "text");
     EXPECT_EQ(*dictionary["a"].string(), "text");
 }
 
 TEST(DictionaryTest, CopySharesTheContainersInside)
 {
-    const Dictionary dictionary{ { "inner", Dictionary::make() }, { "text", "x" } };
+    const Dictionary dictionary {{"inner", Dictionary::make()}, {"text", "x"}};
     const DictionaryRef copied = dictionary.copy();
     copied->setText("text", "y");
     (*copied)["inner"].dictionary()->setText("k", "v");
@@ -74,7 +74,7 @@ TEST(DictionaryTest, CopySharesTheContainersInside)
 
 TEST(DictionaryTest, RemoveAllEmptiesAndTakesNewKeys)
 {
-    Dictionary dictionary{ { "a", "1" }, { "b", "2" } };
+    Dictionary dictionary {{"a", "1"}, {"b", "2"}};
     dictionary.removeAll();
     EXPECT_EQ(dictionary.count(), 0u);
     dictionary.set("b", "3");

@@ -16,7 +16,7 @@ protected:
     std::string content() const
     {
         std::ifstream file(path, std::ios::binary);
-        return { std::istreambuf_iterator<char>(file), {} };
+        return {std::istreambuf_iterator<char>(file), {}};
     }
 
     ScratchFolder folder;

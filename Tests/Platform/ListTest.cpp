@@ -8,7 +8,7 @@ namespace spectrel {
 
 TEST(ListTest, AppendsInOrderAndSkipsAbsentValues)
 {
-    const ListRef list = List::make({ "a", Value() });
+    const ListRef list = List::make({"a", Value()});
     list->append("b");
     list->append(Value());
     ASSERT_EQ(list->count(), 2u);
@@ -18,7 +18,7 @@ TEST(ListTest, AppendsInOrderAndSkipsAbsentValues)
 
 TEST(ListTest, RemovesFromTheFrontAtMostAll)
 {
-    const ListRef list = List::make({ "a", "b", "c" });
+    const ListRef list = List::make({"a", "b", "c"});
     list->removeFirst(0);
     EXPECT_EQ(list->count(), 3u);
     list->removeFirst(2);
@@ -29,7 +29,7 @@ TEST(ListTest, RemovesFromTheFrontAtMostAll)
 
 TEST(ListTest, CopySharesTheContainersInside)
 {
-    const ListRef list = List::make({ Dictionary::make() });
+    const ListRef list = List::make({Dictionary::make()});
     const ListRef copied = list->copy();
     copied->append("more");
     (*copied)[0].dictionary()->setText("k", "v");
@@ -39,7 +39,7 @@ TEST(ListTest, CopySharesTheContainersInside)
 
 TEST(ListTest, RemoveAllEmpties)
 {
-    const ListRef list = List::make({ "a" });
+    const ListRef list = List::make({"a"});
     list->removeAll();
     EXPECT_EQ(list->count(), 0u);
 }

@@ -205,7 +205,7 @@ TEST_F(LocalPortTest, RequestIsAnsweredWithItsIdAndSequenceNumber)
 {
     const auto local = serve([this](std::int32_t, ByteView body) -> std::optional<Bytes> {
         received.push_back(text(body));
-        return Bytes{ 'y', 'e', 's' };
+        return Bytes {'y', 'e', 's'};
     });
     ForkedPeer asker([this](ForkedPeer&) {
         const int socket = raw::connectTo(folder.path().string(), Name);
@@ -272,15 +272,15 @@ TEST_P(GarbageTest, EndsTheConnectionThatSentItAndHarmsNobodyElse)
 }
 
 INSTANTIATE_TEST_SUITE_P(Packets, GarbageTest,
-    testing::Values(raw::NamedPacket{ "one byte", "x" },
-        raw::NamedPacket{ "half a header", std::string("\x53\x01\0\0\0\0\0\0\0\0\0", 11) },
-        raw::NamedPacket{ "message without a body", raw::packet(1, 0, 0, "") },
-        raw::NamedPacket{ "request without a body", raw::packet(2, 0, 0, "") },
-        raw::NamedPacket{ "reply to nothing", raw::packet(3, 0, 0, "body") },
-        raw::NamedPacket{ "kind 0", raw::packet(0, 0, 0, "body") },
-        raw::NamedPacket{ "kind 4", raw::packet(4, 0, 0, "body") },
-        raw::NamedPacket{ "another mark", "T" + raw::packet(1, 0, 0, "body").substr(1) },
-        raw::NamedPacket{ "one byte too many", raw::packet(1, 0, 0, std::string(LargestMessage + 1, 'x')) }));
+    testing::Values(raw::NamedPacket {"one byte", "x"},
+        raw::NamedPacket {"half a header", std::string("\x53\x01\0\0\0\0\0\0\0\0\0", 11)},
+        raw::NamedPacket {"message without a body", raw::packet(1, 0, 0, "")},
+        raw::NamedPacket {"request without a body", raw::packet(2, 0, 0, "")},
+        raw::NamedPacket {"reply to nothing", raw::packet(3, 0, 0, "body")},
+        raw::NamedPacket {"kind 0", raw::packet(0, 0, 0, "body")},
+        raw::NamedPacket {"kind 4", raw::packet(4, 0, 0, "body")},
+        raw::NamedPacket {"another mark", "T" + raw::packet(1, 0, 0, "body").substr(1)},
+        raw::NamedPacket {"one byte too many", raw::packet(1, 0, 0, std::string(LargestMessage + 1, 'x'))}));
 
 TEST_F(LocalPortTest, EmptyPacketEndsItsConnectionOnly)
 {

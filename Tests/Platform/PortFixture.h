@@ -17,18 +17,18 @@ namespace spectrel {
 /// Real ports in a folder of the test's own. Limits are for failures only; nothing waits for them otherwise.
 class PortFixture : public testing::Test {
 protected:
-    static constexpr std::chrono::seconds Limit{ 20 };
-    static constexpr std::chrono::seconds Second{ 1 };
-    static constexpr std::chrono::nanoseconds AtOnce{ 0 };
+    static constexpr std::chrono::seconds Limit {20};
+    static constexpr std::chrono::seconds Second {1};
+    static constexpr std::chrono::nanoseconds AtOnce {0};
     static constexpr const char* Name = "org.spectrel.Test";
 
     static ByteView bytes(std::string_view text)
     {
-        return { reinterpret_cast<const std::uint8_t*>(text.data()), text.size() };
+        return {reinterpret_cast<const std::uint8_t*>(text.data()), text.size()};
     }
     static std::string text(ByteView body)
     {
-        return { body.begin(), body.end() };
+        return {body.begin(), body.end()};
     }
     /// A handler that keeps what comes, as "ID:BODY", and answers nothing.
     LocalMessagePort::MessageHandler keeping()
@@ -66,8 +66,8 @@ protected:
     LogRecorder log;
     ScratchFolder folder;
     QtRunLoop loop;
-    SocketMessagePorts ports{ folder.path().string() };
-    SocketMessagePorts elsewhere{ folder.path().string() }; // shares no table with `ports`, as another process's would
+    SocketMessagePorts ports {folder.path().string()};
+    SocketMessagePorts elsewhere {folder.path().string()}; // shares no table with `ports`, as another process's would
     std::vector<std::string> received;
 };
 

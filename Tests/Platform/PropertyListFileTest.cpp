@@ -23,7 +23,7 @@ unsigned mode(const std::string& path)
 TEST(PropertyListFileTest, WrittenFileReadsBack)
 {
     const ScratchFolder folder;
-    const Value value = Dictionary::make({ { "k", "v" } });
+    const Value value = Dictionary::make({{"k", "v"}});
     std::string reason;
     ASSERT_TRUE(writePropertyListToFile(value, folder.file("x"), reason)) << reason;
     EXPECT_EQ(readPropertyListFile(folder.file("x")), value);
@@ -36,7 +36,7 @@ TEST(PropertyListFileTest, FileIsPrivateAlsoWhenItWasThere)
     folder.write("old", std::string(5000, 'x'));
     ASSERT_EQ(::chmod(folder.file("old").c_str(), 0644), 0);
     std::string reason;
-    for (const char* name : { "old", "new" }) {
+    for (const char* name : {"old", "new"}) {
         ASSERT_TRUE(writePropertyListToFile("text", folder.file(name), reason)) << reason;
         EXPECT_EQ(mode(folder.file(name)), 0600u) << name;
         EXPECT_EQ(folder.read(name), serialisePropertyList("text")) << name;

@@ -47,7 +47,7 @@ public:
         case 2:
             return Value::boolean(_random() % 2 == 0);
         case 3:
-            return Date{ static_cast<double>(static_cast<std::int64_t>(_random() % 300'000'000'000) - 60'000'000'000) };
+            return Date {static_cast<double>(static_cast<std::int64_t>(_random() % 300'000'000'000) - 60'000'000'000)};
         case 4:
             return data();
         case 5:
@@ -63,8 +63,8 @@ public:
 private:
     std::string text()
     {
-        static constexpr std::string_view Pieces[] = { "a", "Z", "9", " ", "\t", "\n", "\r", "<", ">", "&", "]]>", "\"",
-            "\x7f", "\xC2\x80", "\xC3\xA4", "\xE2\x82\xAC", "\xEF\xBF\xBD", "\xF0\x9F\x93\xB6", "\xF4\x8F\xBF\xBF" };
+        static constexpr std::string_view Pieces[] = {"a", "Z", "9", " ", "\t", "\n", "\r", "<", ">", "&", "]]>", "\"",
+            "\x7f", "\xC2\x80", "\xC3\xA4", "\xE2\x82\xAC", "\xEF\xBF\xBD", "\xF0\x9F\x93\xB6", "\xF4\x8F\xBF\xBF"};
         std::string text;
         for (auto count = _random() % 30; count > 0; --count)
             text += Pieces[_random() % std::size(Pieces)];

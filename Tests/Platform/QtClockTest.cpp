@@ -7,8 +7,8 @@ namespace spectrel {
 namespace {
 
 constexpr std::string_view StatusPattern = "'Updated' yyyy-MM-dd 'at' HH:mm:ss";
-constexpr Moment Winter{ std::chrono::microseconds(1'709'647'651'999'999) }; // 2024-03-05 14:07:31.999999 UTC
-constexpr Moment Summer{ std::chrono::microseconds(1'719'878'400'000'000) }; // 2024-07-02 00:00:00 UTC
+constexpr Moment Winter {std::chrono::microseconds(1'709'647'651'999'999)}; // 2024-03-05 14:07:31.999999 UTC
+constexpr Moment Summer {std::chrono::microseconds(1'719'878'400'000'000)}; // 2024-07-02 00:00:00 UTC
 
 TEST(QtClockTest, FormatsByPatternInItsZone)
 {

@@ -27,11 +27,11 @@ protected:
     std::string content(const std::string& domain) const
     {
         std::ifstream file(folder.path().string() + "/" + domain + ".conf");
-        return { std::istreambuf_iterator<char>(file), {} };
+        return {std::istreambuf_iterator<char>(file), {}};
     }
 
     ScratchFolder folder;
-    QtPreferences preferences{ folder.path().string() };
+    QtPreferences preferences {folder.path().string()};
 };
 
 TEST_F(QtPreferencesTest, ValueIsInTheDomainsFileAfterSynchronizing)

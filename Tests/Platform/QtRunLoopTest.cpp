@@ -50,7 +50,7 @@ TEST_F(QtRunLoopTest, QueueThatFeedsItselfDoesNotStarveTimers)
 TEST_F(QtRunLoopTest, DelayedJobsRunWhenDueAndNotEarlier)
 {
     const auto start = steady_clock::now();
-    steady_clock::duration waited{};
+    steady_clock::duration waited {};
     loop.after(10500us, [&] {
         order += "late";
         waited = steady_clock::now() - start;

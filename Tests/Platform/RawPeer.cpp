@@ -59,8 +59,8 @@ int accept(int listening)
 
 std::string packet(std::uint8_t kind, std::int32_t id, std::uint32_t sequence, std::string_view body)
 {
-    std::string bytes{ '\x53', static_cast<char>(kind), '\0', '\0' };
-    for (const std::uint32_t number : { static_cast<std::uint32_t>(id), sequence }) {
+    std::string bytes {'\x53', static_cast<char>(kind), '\0', '\0'};
+    for (const std::uint32_t number : {static_cast<std::uint32_t>(id), sequence}) {
         for (int shift = 0; shift < 32; shift += 8)
             bytes += static_cast<char>(number >> shift);
     }
@@ -76,7 +76,7 @@ std::string receive(int socket)
 {
     static char bytes[300'000];
     const ssize_t count = ::recv(socket, bytes, sizeof bytes, 0);
-    return { bytes, count > 0 ? static_cast<std::size_t>(count) : 0 };
+    return {bytes, count > 0 ? static_cast<std::size_t>(count) : 0};
 }
 
 } // namespace spectrel::raw

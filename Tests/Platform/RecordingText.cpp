@@ -4,7 +4,7 @@ namespace spectrel {
 
 std::string u16(unsigned number)
 {
-    return { static_cast<char>(number), static_cast<char>(number >> 8) };
+    return {static_cast<char>(number), static_cast<char>(number >> 8)};
 }
 
 std::string u32(std::uint32_t number)
@@ -51,7 +51,7 @@ RecordingText readRecording(const std::string& path)
 
 ByteView viewOf(std::string_view text)
 {
-    return { reinterpret_cast<const std::uint8_t*>(text.data()), text.size() };
+    return {reinterpret_cast<const std::uint8_t*>(text.data()), text.size()};
 }
 
 } // namespace spectrel

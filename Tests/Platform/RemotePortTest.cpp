@@ -91,7 +91,7 @@ TEST_F(RemotePortTest, EmptyAnswerIsSuccessWithoutAReply)
 {
     const auto peer = answering(raw::packet(3, 7, 1, ""));
     const auto remote = ports.createRemote(Name);
-    reply = Bytes{ 'o', 'l', 'd' };
+    reply = Bytes {'o', 'l', 'd'};
     EXPECT_EQ(ask(*remote, "question", reply), SendStatus::Success);
     EXPECT_FALSE(reply);
 }
@@ -190,10 +190,10 @@ TEST_P(ReplyGarbageTest, IsATransportErrorAndEndsThePort)
 }
 
 INSTANTIATE_TEST_SUITE_P(Packets, ReplyGarbageTest,
-    testing::Values(raw::NamedPacket{ "text", "garbage" },
-        raw::NamedPacket{ "one-way message", raw::packet(1, 7, 1, "body") },
-        raw::NamedPacket{ "request", raw::packet(2, 7, 1, "body") },
-        raw::NamedPacket{ "one byte too many", raw::packet(3, 7, 1, std::string(LargestMessage + 1, 'x')) }));
+    testing::Values(raw::NamedPacket {"text", "garbage"},
+        raw::NamedPacket {"one-way message", raw::packet(1, 7, 1, "body")},
+        raw::NamedPacket {"request", raw::packet(2, 7, 1, "body")},
+        raw::NamedPacket {"one byte too many", raw::packet(3, 7, 1, std::string(LargestMessage + 1, 'x'))}));
 
 TEST_F(RemotePortTest, GarbageOutsideOfARequestEndsThePort)
 {
@@ -362,8 +362,8 @@ TEST_F(RemotePortTest, InterruptedWaitGoesOnToItsEnd)
     action.sa_handler = [](int) {}; // without SA_RESTART
     struct sigaction former = {};
     ::sigaction(SIGALRM, &action, &former);
-    const itimerval often{ { 0, 1000 }, { 0, 1000 } };
-    const itimerval never{};
+    const itimerval often {{0, 1000}, {0, 1000}};
+    const itimerval never {};
     const auto peer = owner([](int socket, ForkedPeer& parent) {
         raw::receive(socket);
         parent.await();

@@ -34,10 +34,10 @@ TEST(ResourcesTest, MissingAndMalformedListsAreNone)
 TEST(ResourcesTest, PathsAreThePropertyListsSortedByName)
 {
     const ScratchFolder folder;
-    for (const char* name : { "b.plist", "a.plist", "c.txt", "C.plist" })
+    for (const char* name : {"b.plist", "a.plist", "c.txt", "C.plist"})
         folder.write(name, OneKey);
     const auto paths = DirectoryResources(folder.path().string()).propertyListPaths();
-    EXPECT_EQ(paths, (std::vector{ folder.file("C.plist"), folder.file("a.plist"), folder.file("b.plist") }));
+    EXPECT_EQ(paths, (std::vector {folder.file("C.plist"), folder.file("a.plist"), folder.file("b.plist")}));
 }
 
 TEST(ResourcesTest, MissingFolderHasNoPaths)

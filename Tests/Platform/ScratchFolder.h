@@ -46,7 +46,7 @@ public:
     std::string read(std::string_view name) const
     {
         std::ifstream in(_path / name, std::ios::binary);
-        return { std::istreambuf_iterator<char>(in), {} };
+        return {std::istreambuf_iterator<char>(in), {}};
     }
 
 private:

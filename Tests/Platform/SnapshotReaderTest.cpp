@@ -19,15 +19,15 @@ Value data(const std::string& bytes)
 
 Value entry(const Value& displayState, const char* date = "2024-03-05 14:07:31 +0000")
 {
-    return Dictionary::make({ { "DisplayState", displayState }, { "Display", Dictionary::make() },
-        { "ExtraInfo", Dictionary::make() }, { "Date", date } });
+    return Dictionary::make({{"DisplayState", displayState}, {"Display", Dictionary::make()},
+        {"ExtraInfo", Dictionary::make()}, {"Date", date}});
 }
 
 class SnapshotReaderTest : public testing::Test {
 protected:
     RecordingText read(const ListRef& entries)
     {
-        const Value snapshot = Dictionary::make({ { "Timestamp", "2024-03-05 14:07:31 +0000" }, { "Data", entries } });
+        const Value snapshot = Dictionary::make({{"Timestamp", "2024-03-05 14:07:31 +0000"}, {"Data", entries}});
         std::string reason;
         EXPECT_TRUE(writePropertyListToFile(snapshot, _folder.file("x"), reason)) << reason;
         return readRecording(_folder.file("x"));
@@ -35,7 +35,7 @@ protected:
     /// One entry with these bytes.
     RecordingText readBuffer(const std::string& bytes)
     {
-        return read(List::make({ entry(data(bytes)) }));
+        return read(List::make({entry(data(bytes))}));
     }
 
     ScratchFolder _folder;
@@ -51,42 +51,40 @@ TEST_F(SnapshotReaderTest, MessagesOfAllEntriesComeInOrderWithTheirEntrysTime)
     const std::string b = record(0x0C00, "", '\xFF');
     const std::string c = wrapped(record(0xB0C3, "x"));
     const RecordingText text =
-        read(List::make({ entry(data(a + b)), entry(data(c), "2024-03-05 14:07:33 +0000"), entry(data("")) }));
-    EXPECT_EQ(text.messages, (Messages{ a, b, c }));
-    EXPECT_EQ(text.times, (std::vector<std::int64_t>{ 1709647651'000'000, 1709647651'000'000, 1709647653'000'000 }));
+        read(List::make({entry(data(a + b)), entry(data(c), "2024-03-05 14:07:33 +0000"), entry(data(""))}));
+    EXPECT_EQ(text.messages, (Messages {a, b, c}));
+    EXPECT_EQ(text.times, (std::vector<std::int64_t> {1709647651'000'000, 1709647651'000'000, 1709647653'000'000}));
     EXPECT_EQ(text.damage, "");
     EXPECT_FALSE(text.technology);
 }
 
 TEST_F(SnapshotReaderTest, EntryWithoutDateOrWithAnotherFormHasTimeZero)
 {
-    const Value dateless = Dictionary::make({ { "DisplayState", data(record(1)) } });
+    const Value dateless = Dictionary::make({{"DisplayState", data(record(1))}});
     const RecordingText text =
-        read(List::make({ entry(data(record(1))), dateless, entry(data(record(1)), "yesterday") }));
-    EXPECT_EQ(text.times, (std::vector<std::int64_t>{ 1709647651'000'000, 0, 0 }));
+        read(List::make({entry(data(record(1))), dateless, entry(data(record(1)), "yesterday")}));
+    EXPECT_EQ(text.times, (std::vector<std::int64_t> {1709647651'000'000, 0, 0}));
 }
 
 TEST_F(SnapshotReaderTest, EntryWithTheDLFIsSkipped)
 {
-    const Value dlf =
-        Dictionary::make({ { "Description", "DLF binary" }, { "DLF", data(versionReport() + record(1)) } });
-    const RecordingText text = read(List::make({ entry(data(record(1))), dlf }));
-    EXPECT_EQ(text.messages, Messages{ record(1) });
+    const Value dlf = Dictionary::make({{"Description", "DLF binary"}, {"DLF", data(versionReport() + record(1))}});
+    const RecordingText text = read(List::make({entry(data(record(1))), dlf}));
+    EXPECT_EQ(text.messages, Messages {record(1)});
     EXPECT_EQ(text.damage, "");
 }
 
 TEST_F(SnapshotReaderTest, EmptyAndForeignEntriesHoldNoMessages)
 {
-    const RecordingText text = read(List::make({ Dictionary::make(), "text", entry(data(record(1))) }));
-    EXPECT_EQ(text.messages, Messages{ record(1) });
+    const RecordingText text = read(List::make({Dictionary::make(), "text", entry(data(record(1)))}));
+    EXPECT_EQ(text.messages, Messages {record(1)});
     EXPECT_EQ(text.damage, "");
 }
 
 TEST_F(SnapshotReaderTest, ReportObjectIsOneMessageOfTheDictionaryReportingBaseband)
 {
-    const Value report =
-        Dictionary::make({ { "Cell", Dictionary::make({ { "ARFCN", "12" } }) }, { "n", Value::integer(3) } });
-    const RecordingText text = read(List::make({ Dictionary::make(), entry(report), entry("only a text") }));
+    const Value report = Dictionary::make({{"Cell", Dictionary::make({{"ARFCN", "12"}})}, {"n", Value::integer(3)}});
+    const RecordingText text = read(List::make({Dictionary::make(), entry(report), entry("only a text")}));
     EXPECT_EQ(text.technology, Technology::IFX);
     ASSERT_EQ(text.messages.size(), 2u);
     EXPECT_EQ(parsePropertyList(viewOf(text.messages[0])), report);
@@ -100,7 +98,7 @@ TEST_F(SnapshotReaderTest, ShortMessageBetweenOthersIsKept)
     for (std::size_t length = 1; length <= 12; ++length) {
         const std::string tooShort(length, '\x20');
         const RecordingText text = readBuffer(good + tooShort + good + good);
-        EXPECT_EQ(text.messages, (Messages{ good, tooShort, good, good })) << length;
+        EXPECT_EQ(text.messages, (Messages {good, tooShort, good, good})) << length;
         EXPECT_EQ(text.damage, "");
     }
 }
@@ -109,16 +107,16 @@ TEST_F(SnapshotReaderTest, ShortMessageAtTheStartIsKept)
 {
     const std::string good = record(0xB0C2, "abcdef");
     const RecordingText text = readBuffer("\x81" + good);
-    EXPECT_EQ(text.messages, (Messages{ "\x81", good }));
+    EXPECT_EQ(text.messages, (Messages {"\x81", good}));
 }
 
 TEST_F(SnapshotReaderTest, MessageOfUnknownTypeIsCutByItsOwnLength)
 {
     const std::string good = record(0xB0C2, "abcdef");
     const std::string unknown = record(0xB0C2, "uvw", '\x10');
-    EXPECT_EQ(readBuffer(good + unknown + good).messages, (Messages{ good, unknown, good }));
-    EXPECT_EQ(readBuffer(good + unknown).messages, (Messages{ good, unknown }));
-    EXPECT_EQ(readBuffer(unknown + good).messages, (Messages{ unknown, good }));
+    EXPECT_EQ(readBuffer(good + unknown + good).messages, (Messages {good, unknown, good}));
+    EXPECT_EQ(readBuffer(good + unknown).messages, (Messages {good, unknown}));
+    EXPECT_EQ(readBuffer(unknown + good).messages, (Messages {unknown, good}));
 }
 
 TEST_F(SnapshotReaderTest, GarbageMessageBetweenOthersIsKept)
@@ -126,7 +124,7 @@ TEST_F(SnapshotReaderTest, GarbageMessageBetweenOthersIsKept)
     const std::string good = record(0xB0C2, "abcdef");
     const std::string garbage = "this is no record of any kind, yet it was received";
     const RecordingText text = readBuffer(good + garbage + good + good);
-    EXPECT_EQ(text.messages, (Messages{ good, garbage, good, good }));
+    EXPECT_EQ(text.messages, (Messages {good, garbage, good, good}));
     EXPECT_EQ(text.damage, "");
 }
 
@@ -134,7 +132,7 @@ TEST_F(SnapshotReaderTest, TruncationAnywhereYieldsTheMessagesBefore)
 {
     const std::string good = record(0xB0C2, "abcdef");
     const std::string whole = good + wrapped(good) + good;
-    const std::size_t ends[] = { 0, good.size(), 2 * good.size() + 2, whole.size() };
+    const std::size_t ends[] = {0, good.size(), 2 * good.size() + 2, whole.size()};
     for (std::size_t length = 1; length <= whole.size(); ++length) {
         const RecordingText text = readBuffer(whole.substr(0, length));
         const auto complete =
@@ -148,7 +146,7 @@ TEST_F(SnapshotReaderTest, DamageTellsMessagePlaceAndEntry)
 {
     const std::string good = record(0xB0C2, "abcdef");
     const auto damageOf = [&](const std::string& rest) {
-        return read(List::make({ entry(data(good)), entry(data(good + rest)), entry(data(good)) })).damage;
+        return read(List::make({entry(data(good)), entry(data(good + rest)), entry(data(good))})).damage;
     };
     EXPECT_EQ(damageOf("\x01"), "message 2 at byte 19 of entry 1: 1 bytes are left, too few for a message");
     EXPECT_EQ(damageOf(good.substr(0, 15)),
@@ -163,7 +161,7 @@ TEST_F(SnapshotReaderTest, RecordWithAWrongLengthIsDamageEvenWhenOthersFollow)
     std::string wrong = good;
     wrong[1] = 5;
     const RecordingText text = readBuffer(good + wrong + good + good);
-    EXPECT_EQ(text.messages, Messages{ good });
+    EXPECT_EQ(text.messages, Messages {good});
     EXPECT_EQ(text.damage, "message 1 at byte 19 of entry 0: the item has a length of 5, the least is 12");
 }
 

@@ -14,11 +14,11 @@ protected:
     static Bytes list(const std::string& content)
     {
         const std::string text = "<?xml version=\"1.0\"?><plist version=\"1.0\">" + content + "</plist>";
-        return { text.begin(), text.end() };
+        return {text.begin(), text.end()};
     }
     void answer(SendStatus status, std::optional<Bytes> reply)
     {
-        ports.answer = [=](const FakeMessagePorts::Sent&) { return FakeMessagePorts::Answer{ status, reply }; };
+        ports.answer = [=](const FakeMessagePorts::Sent&) { return FakeMessagePorts::Answer {status, reply}; };
     }
     LogChannelResult createLogChannel()
     {
@@ -27,7 +27,7 @@ protected:
     }
 
     FakeMessagePorts ports;
-    SocketTelephonyServer server{ ports };
+    SocketTelephonyServer server {ports};
 };
 
 TEST_F(SocketTelephonyServerTest, NoConnectionWhenNobodyServesTheName)
@@ -70,8 +70,8 @@ TEST_F(SocketTelephonyServerTest, HandsOnTheServicesError)
 
 TEST_F(SocketTelephonyServerTest, SendStatusIsTheErrorWhenTheServiceIsNotReached)
 {
-    for (const auto status : { SendStatus::SendTimeout, SendStatus::ReceiveTimeout, SendStatus::Invalid,
-             SendStatus::TransportError, SendStatus::BecameInvalid }) {
+    for (const auto status : {SendStatus::SendTimeout, SendStatus::ReceiveTimeout, SendStatus::Invalid,
+             SendStatus::TransportError, SendStatus::BecameInvalid}) {
         answer(status, std::nullopt);
         const auto result = createLogChannel();
         EXPECT_EQ(result.error, static_cast<std::int32_t>(status));

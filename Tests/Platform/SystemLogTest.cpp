@@ -16,7 +16,7 @@ TEST(SystemLogTest, LinesAreFormattedAsPrintfDoes)
 TEST(SystemLogTest, LongLinesAreWrittenInFull)
 {
     LogRecorder log;
-    for (const std::size_t length : { 1022u, 1023u, 1024u, 1025u, 5000u }) {
+    for (const std::size_t length : {1022u, 1023u, 1024u, 1025u, 5000u}) {
         const std::string text(length, 'x');
         SPECTREL_LOG(Priority::Warning, "%s", text.c_str());
         EXPECT_EQ(log.takeLog(), "<4>" + text + "\n");

@@ -29,8 +29,8 @@ std::string printed(double number)
 
 TEST(TextBufferTest, DecimalsAreAsPrintfMakesThem)
 {
-    for (const std::int64_t number : { std::int64_t(0), std::int64_t(-1), std::int64_t(4294967295),
-             std::numeric_limits<std::int64_t>::min(), std::numeric_limits<std::int64_t>::max() }) {
+    for (const std::int64_t number : {std::int64_t(0), std::int64_t(-1), std::int64_t(4294967295),
+             std::numeric_limits<std::int64_t>::min(), std::numeric_limits<std::int64_t>::max()}) {
         TextBuffer buffer;
         EXPECT_EQ(buffer.decimal(number).view(), std::to_string(number));
     }
@@ -61,8 +61,8 @@ TEST(TextBufferTest, TwoDecimalsAreAsPrintfMakesThemForAnyDouble)
 TEST(TextBufferTest, ExtremesAreAsPrintfMakesThem)
 {
     using Limits = std::numeric_limits<double>;
-    for (const double number : { 0.0, -0.0, Limits::max(), Limits::lowest(), Limits::min(), Limits::denorm_min(),
-             Limits::infinity(), -Limits::infinity(), 0.004999, 0.005, -0.001 })
+    for (const double number : {0.0, -0.0, Limits::max(), Limits::lowest(), Limits::min(), Limits::denorm_min(),
+             Limits::infinity(), -Limits::infinity(), 0.004999, 0.005, -0.001})
         EXPECT_EQ(fixed2(number), printed(number));
 }
 

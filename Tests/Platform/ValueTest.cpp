@@ -31,8 +31,8 @@ TEST(ValueTest, AbsentReferencesMakeAbsentValues)
 
 TEST(ValueTest, EachKindAnswersOnlyItsOwnQuestion)
 {
-    const Value values[] = { "text", Dictionary::make(), List::make(), Value::integer(1), Value::real(1),
-        Value::boolean(true), Date{ 1 }, data({ 1 }) };
+    const Value values[] = {"text", Dictionary::make(), List::make(), Value::integer(1), Value::real(1),
+        Value::boolean(true), Date {1}, data({1})};
     for (const Value& value : values) {
         const int answers = (value.string() != nullptr) + (value.dictionary() != nullptr) + (value.list() != nullptr)
             + value.integer().has_value() + value.real().has_value() + value.boolean().has_value()
@@ -85,13 +85,13 @@ TEST(ValueTest, AssignedTextReplacesAnyKindAndKeepsItsMemory)
 
 TEST(ValueTest, EqualityIsDeepAndIgnoresTheOrderOfKeys)
 {
-    const Value left = Dictionary::make({ { "a", "1" }, { "b", List::make({ "x", Dictionary::make() }) } });
-    const Value right = Dictionary::make({ { "b", List::make({ "x", Dictionary::make() }) }, { "a", "1" } });
+    const Value left = Dictionary::make({{"a", "1"}, {"b", List::make({"x", Dictionary::make()})}});
+    const Value right = Dictionary::make({{"b", List::make({"x", Dictionary::make()})}, {"a", "1"}});
     EXPECT_EQ(left, right);
     right.dictionary()->setText("a", "2");
     EXPECT_NE(left, right);
-    EXPECT_EQ(Value(data({ 1, 2 })), Value(data({ 1, 2 })));
-    EXPECT_NE(Value(List::make({ "a", "b" })), Value(List::make({ "b", "a" })));
+    EXPECT_EQ(Value(data({1, 2})), Value(data({1, 2})));
+    EXPECT_NE(Value(List::make({"a", "b"})), Value(List::make({"b", "a"})));
 }
 
 TEST(ValueTest, IntegersOfOtherSignOrKindAreUnequal)

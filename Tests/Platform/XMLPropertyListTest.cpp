@@ -12,7 +12,7 @@ namespace {
 
 std::string parsed(std::string_view text)
 {
-    const auto value = parsePropertyList({ reinterpret_cast<const std::uint8_t*>(text.data()), text.size() });
+    const auto value = parsePropertyList({reinterpret_cast<const std::uint8_t*>(text.data()), text.size()});
     return value ? valueText(*value) : "does not parse";
 }
 
@@ -26,7 +26,7 @@ constexpr const char* Refused = "does not parse";
 bool parses(std::string_view content)
 {
     const std::string text = "<plist>" + std::string(content) + "</plist>";
-    return parsePropertyList({ reinterpret_cast<const std::uint8_t*>(text.data()), text.size() }).has_value();
+    return parsePropertyList({reinterpret_cast<const std::uint8_t*>(text.data()), text.size()}).has_value();
 }
 
 std::string repeated(std::string_view text, std::size_t count)
@@ -110,8 +110,8 @@ TEST(XMLPropertyListTest, IntegersAreDecimalOrHexadecimalWithinTheirRange)
     EXPECT_EQ(integer(" \n12\t"), "i12");
     EXPECT_EQ(integer("18446744073709551615"), "i18446744073709551615");
     EXPECT_EQ(integer("-9223372036854775808"), "i-9223372036854775808");
-    for (const char* malformed : { "", " ", "abc", "12abc", "1 2", "1.0", "1e3", "--1", "+-1", "- 1", "0x", "0xG",
-             "1_000", "18446744073709551616", "-9223372036854775809", "0x10000000000000000" })
+    for (const char* malformed : {"", " ", "abc", "12abc", "1 2", "1.0", "1e3", "--1", "+-1", "- 1", "0x", "0xG",
+             "1_000", "18446744073709551616", "-9223372036854775809", "0x10000000000000000"})
         EXPECT_EQ(integer(malformed), Refused) << malformed;
 }
 
@@ -126,7 +126,7 @@ TEST(XMLPropertyListTest, RealsAreStrict)
     EXPECT_EQ(real("-infinity"), "rfff0000000000000");
     EXPECT_EQ(real("nan"), "rnan");
     for (const char* malformed :
-        { "", "abc", "1.0abc", "1,0", "0x10", "--1", "-+1", "1e", "1e999", "1e-999", "nan(1)", ".", "1 2" })
+        {"", "abc", "1.0abc", "1,0", "0x10", "--1", "-+1", "1e", "1e999", "1e-999", "nan(1)", ".", "1 2"})
         EXPECT_EQ(real(malformed), Refused) << malformed;
 }
 
@@ -137,9 +137,9 @@ TEST(XMLPropertyListTest, DatesAreStrict)
     EXPECT_EQ(date("2000-12-31T23:59:59Z"), "t-1");
     EXPECT_EQ(date("2000-02-29T00:00:00Z"), "t-26524800");
     for (const char* malformed :
-        { "", "2024-03-05", "2024-03-05T14:07:31", "2024-03-05 14:07:31Z", "2024-13-05T14:07:31Z",
+        {"", "2024-03-05", "2024-03-05T14:07:31", "2024-03-05 14:07:31Z", "2024-13-05T14:07:31Z",
             "2023-02-29T14:07:31Z", "2024-03-05T24:07:31Z", "2024-03-05T14:60:31Z", "2024-03-05T14:07:60Z",
-            "2024-03-05T14:07:31.5Z", "2024-03-05T14:07:3 Z", "2024-03-05T14:07:-1Z", "2024-3-5T14:07:31Z" })
+            "2024-03-05T14:07:31.5Z", "2024-03-05T14:07:3 Z", "2024-03-05T14:07:-1Z", "2024-3-5T14:07:31Z"})
         EXPECT_EQ(date(malformed), Refused) << malformed;
 }
 
@@ -150,8 +150,8 @@ TEST(XMLPropertyListTest, DataIsBase64WithWhiteSpaceAnywhere)
     EXPECT_EQ(data("\n\t AA ==\n"), "d00");
     EXPECT_EQ(data("AAECAwQF"), "d000102030405");
     EXPECT_EQ(data("+/+/"), "dfbffbf");
-    for (const char* malformed : { "A", "AA", "AAA", "AA=", "AAA==", "=", "====", "AA==AA==", "AAAA=", "AA=A",
-             "AB==", "AAB=", "A-_A", "AA\xC3\xA4" })
+    for (const char* malformed : {"A", "AA", "AAA", "AA=", "AAA==", "=", "====", "AA==AA==", "AAAA=", "AA=A",
+             "AB==", "AAB=", "A-_A", "AA\xC3\xA4"})
         EXPECT_EQ(data(malformed), Refused) << malformed;
 }
 

@@ -45,7 +45,7 @@ protected:
 
     ClassDictionary classDict;
     CodeDictionary codeDictionary;
-    Section section{ classDict, codeDictionary };
+    Section section {classDict, codeDictionary};
 
 private:
     LogRecorder _recorder;

@@ -32,7 +32,7 @@ LTECell cell()
 TEST(RecordWriterTest, HeaderIsTypeLengthCodeAndTimestamp)
 {
     const Bytes record = RecordWriter(0xB0C2, Epoch1980 + std::chrono::microseconds(2500)).u8(7).take();
-    EXPECT_EQ(record, (Bytes{ 0x01, 13, 0, 0xC2, 0xB0, 0, 0, 2, 0, 0, 0, 0, 0, 7 }));
+    EXPECT_EQ(record, (Bytes {0x01, 13, 0, 0xC2, 0xB0, 0, 0, 2, 0, 0, 0, 0, 0, 7}));
 }
 
 TEST(RecordWriterTest, ExtraStreamHasItsOwnTypeAndThePlainCode)
@@ -53,8 +53,8 @@ TEST(RecordWriterTest, TimestampCountsEighthHundredthsOfASecondInTheUpper48Bits)
 TEST(RecordWriterTest, ServingCellRecordIsLaidOutByteForByte)
 {
     const Bytes record = lteServingCellRecord(cell(), Epoch1980);
-    const Bytes payload{ 2, 0xF7, 0x01, 0x14, 0x05, 0x64, 0x4B, 100, 100, 0x56, 0x34, 0x12, 0x00, 0xCD, 0xAB, 3, 0, 0,
-        0, 0, 0, 0, 0, 0, 0 };
+    const Bytes payload {2, 0xF7, 0x01, 0x14, 0x05, 0x64, 0x4B, 100, 100, 0x56, 0x34, 0x12, 0x00, 0xCD, 0xAB, 3, 0, 0,
+        0, 0, 0, 0, 0, 0, 0};
     ASSERT_EQ(record.size(), 38u);
     EXPECT_EQ(Bytes(record.begin() + 13, record.end()), payload);
 }
@@ -84,7 +84,7 @@ TEST(RoutedCodeTest, IsReadBehindAWrapperAndOnlyFromKnownTypes)
     Bytes record = RecordWriter(0xFF0002, Epoch1980).take();
     EXPECT_TRUE(routedCode(record, code));
     EXPECT_EQ(code, 0xFF0002u);
-    record.insert(record.begin(), { 0x81, 0 });
+    record.insert(record.begin(), {0x81, 0});
     EXPECT_TRUE(routedCode(record, code));
     EXPECT_EQ(code, 0xFF0002u);
     record[2] = 0x10;

@@ -67,7 +67,7 @@ protected:
     TelephonyServiceTest()
     {
         EXPECT_TRUE(service.start());
-        for (const std::uint32_t code : { 0xB0C2u, 0xB0C1u, 0xFF0001u })
+        for (const std::uint32_t code : {0xB0C2u, 0xB0C1u, 0xFF0001u})
             source.messages.push_back(RecordBuilder(code, 13).bytes());
     }
 
@@ -80,12 +80,12 @@ protected:
     }
     std::string openChannel(const std::string& client = "client")
     {
-        const Value reply = ask("org.spectrel.Telephony", 1, Dictionary::make({ { "CreateLogChannel", client } }));
+        const Value reply = ask("org.spectrel.Telephony", 1, Dictionary::make({{"CreateLogChannel", client}}));
         return *(*reply.dictionary())["PortName"].string();
     }
     void start(const std::string& channel, ListRef ordinary, ListRef extra)
     {
-        auto command = Dictionary::make({ { "SetState", "Streaming" } });
+        auto command = Dictionary::make({{"SetState", "Streaming"}});
         command->set("SetZephyrLogCodes", ordinary);
         command->set("SetRkExtraCodes", extra);
         ports.sent.clear();
@@ -102,12 +102,12 @@ protected:
     FakeRunLoop loop;
     FakeMessagePorts ports;
     ListSource source;
-    TelephonyService service{ loop, ports, source };
+    TelephonyService service {loop, ports, source};
 };
 
 TEST_F(TelephonyServiceTest, ChannelIsOpenedWithAPortOfItsOwn)
 {
-    EXPECT_EQ(displayText(ask("org.spectrel.Telephony", 1, Dictionary::make({ { "CreateLogChannel", "client" } }))),
+    EXPECT_EQ(displayText(ask("org.spectrel.Telephony", 1, Dictionary::make({{"CreateLogChannel", "client"}}))),
         "{\"Domain\": int 0, \"Error\": int 0, \"PortName\": \"org.spectrel.Telephony.LogChannel.1\"}");
     EXPECT_NE(openChannel("other"), openChannel("third"));
     EXPECT_EQ(service.channels(), 3u);
@@ -115,12 +115,12 @@ TEST_F(TelephonyServiceTest, ChannelIsOpenedWithAPortOfItsOwn)
 
 TEST_F(TelephonyServiceTest, MalformedWishGetsAnErrorAndNoChannel)
 {
-    const Value wishes[] = { Dictionary::make(), Dictionary::make({ { "CreateLogChannel", "" } }),
-        Dictionary::make({ { "CreateLogChannel", Value::integer(1) } }), List::make() };
+    const Value wishes[] = {Dictionary::make(), Dictionary::make({{"CreateLogChannel", ""}}),
+        Dictionary::make({{"CreateLogChannel", Value::integer(1)}}), List::make()};
     for (const Value& wish : wishes)
         EXPECT_EQ((*ask("org.spectrel.Telephony", 1, wish).dictionary())["Error"].int32(), 22) << displayText(wish);
     EXPECT_EQ((*ask("org.spectrel.Telephony", 9, wishes[0]).dictionary())["Error"].int32(), 22);
-    const Bytes garbage{ 1, 2 };
+    const Bytes garbage {1, 2};
     EXPECT_TRUE(ports.request("org.spectrel.Telephony", 1, garbage));
     EXPECT_EQ(service.channels(), 0u);
 }
@@ -129,7 +129,7 @@ TEST_F(TelephonyServiceTest, ClientWithoutAPortGetsAnError)
 {
     ports.refuseRemote = true;
     EXPECT_EQ(
-        (*ask("org.spectrel.Telephony", 1, Dictionary::make({ { "CreateLogChannel", "gone" } })).dictionary())["Error"]
+        (*ask("org.spectrel.Telephony", 1, Dictionary::make({{"CreateLogChannel", "gone"}})).dictionary())["Error"]
             .int32(),
         2);
 }
@@ -138,29 +138,28 @@ TEST_F(TelephonyServiceTest, ChannelsAreBounded)
 {
     for (std::size_t count = 0; count < TelephonyService::MostChannels; ++count)
         openChannel();
-    EXPECT_EQ(
-        (*ask("org.spectrel.Telephony", 1, Dictionary::make({ { "CreateLogChannel", "one" } })).dictionary())["Error"]
-            .int32(),
+    EXPECT_EQ((*ask("org.spectrel.Telephony", 1, Dictionary::make({{"CreateLogChannel", "one"}})).dictionary())["Error"]
+                  .int32(),
         24);
 }
 
 TEST_F(TelephonyServiceTest, TechnologyIsTheSources)
 {
-    EXPECT_EQ(displayText(ask(openChannel(), 0, Dictionary::make({ { "GetTechnology", "GetTechnology" } }))),
+    EXPECT_EQ(displayText(ask(openChannel(), 0, Dictionary::make({{"GetTechnology", "GetTechnology"}}))),
         "{\"GetTechnology\": \"kRKLogChannelTechnology_Zephyr_GSM\"}");
 }
 
 TEST_F(TelephonyServiceTest, OnlyTheRequestedCodesAreStreamed)
 {
     const std::string channel = openChannel();
-    start(channel, codes({ 0xB0C2 }), codes({ 1 }));
+    start(channel, codes({0xB0C2}), codes({1}));
     ASSERT_EQ(ports.sent.size(), 2u);
     EXPECT_EQ(ports.sent[0].id, 0);
     EXPECT_EQ(ports.sent[0].body[4], '\xB0');
     EXPECT_EQ(ports.sent[1].body[0], '\xFF');
     start(channel, codes({}), codes({}));
     EXPECT_TRUE(ports.sent.empty());
-    start(channel, codes({ 0xB0C2, 0xB0C1 }), nullptr);
+    start(channel, codes({0xB0C2, 0xB0C1}), nullptr);
     EXPECT_EQ(ports.sent.size(), 2u) << "an absent list wants nothing of its stream";
     EXPECT_EQ(source.streams, 1) << "a further start command replaces the stream";
 }
@@ -174,10 +173,10 @@ TEST_F(TelephonyServiceTest, StartWithoutAnyCodeListStreamsEverything)
 TEST_F(TelephonyServiceTest, MalformedRequestsGetAnErrorAnswer)
 {
     const std::string channel = openChannel();
-    const Value requests[] = { Dictionary::make({ { "SetState", "Idle" } }), List::make(), "Streaming",
-        Dictionary::make({ { "SetState", "Streaming" }, { "SetZephyrLogCodes", "all" } }),
-        Dictionary::make({ { "SetState", "Streaming" }, { "SetZephyrLogCodes", codes({ 65536 }) } }),
-        Dictionary::make({ { "SetState", "Streaming" }, { "SetRkExtraCodes", codes({ -1 }) } }) };
+    const Value requests[] = {Dictionary::make({{"SetState", "Idle"}}), List::make(), "Streaming",
+        Dictionary::make({{"SetState", "Streaming"}, {"SetZephyrLogCodes", "all"}}),
+        Dictionary::make({{"SetState", "Streaming"}, {"SetZephyrLogCodes", codes({65536})}}),
+        Dictionary::make({{"SetState", "Streaming"}, {"SetRkExtraCodes", codes({-1})}})};
     for (const Value& request : requests)
         EXPECT_TRUE((*ask(channel, 0, request).dictionary())["Error"].string()) << displayText(request);
     EXPECT_TRUE((*ask(channel, 7, requests[0]).dictionary())["Error"].string());
@@ -186,10 +185,10 @@ TEST_F(TelephonyServiceTest, MalformedRequestsGetAnErrorAnswer)
 
 TEST_F(TelephonyServiceTest, DeathOfAClientFreesItsChannelAndNoOther)
 {
-    start(openChannel("first"), codes({ 0xB0C2 }), nullptr);
+    start(openChannel("first"), codes({0xB0C2}), nullptr);
     EXPECT_EQ(source.streams, 1);
     ports.killPeers();
-    start(openChannel("second"), codes({ 0xB0C2 }), nullptr);
+    start(openChannel("second"), codes({0xB0C2}), nullptr);
     loop.runQueued();
     EXPECT_EQ(service.channels(), 1u);
     EXPECT_EQ(source.streams, 1);
@@ -200,7 +199,7 @@ TEST_F(TelephonyServiceTest, FullClientStopsTheStreamUntilThereIsRoom)
 {
     bool isFull = true;
     ports.answer = [&isFull](const auto&) {
-        return FakeMessagePorts::Answer{ isFull ? SendStatus::SendTimeout : SendStatus::Success, {} };
+        return FakeMessagePorts::Answer {isFull ? SendStatus::SendTimeout : SendStatus::Success, {}};
     };
     start(openChannel(), nullptr, nullptr);
     EXPECT_EQ(ports.sent.size(), 1u) << "one attempt";
@@ -237,7 +236,7 @@ public:
 class SimulatorSourceTest : public testing::Test {
 protected:
     FakeRunLoop loop;
-    SimulatorSource source{ loop, loop, 1, 1 };
+    SimulatorSource source {loop, loop, 1, 1};
     Collector collector;
 };
 
@@ -328,7 +327,7 @@ private:
 
 TEST_F(ReplaySourceTest, MessagesKeepTheirDistances)
 {
-    const auto source = open({ { recordingOf(5) }, 1, false, {} });
+    const auto source = open({{recordingOf(5)}, 1, false, {}});
     EXPECT_EQ(source->technology(), Technology::LTE);
     const auto stream = source->start(collector);
     loop.runQueued();
@@ -341,7 +340,7 @@ TEST_F(ReplaySourceTest, MessagesKeepTheirDistances)
 
 TEST_F(ReplaySourceTest, SpeedShortensThem)
 {
-    const auto source = open({ { recordingOf(5) }, 10, false, {} });
+    const auto source = open({{recordingOf(5)}, 10, false, {}});
     const auto stream = source->start(collector);
     loop.advance(400ms);
     EXPECT_EQ(collector.messages.size(), 5u);
@@ -349,7 +348,7 @@ TEST_F(ReplaySourceTest, SpeedShortensThem)
 
 TEST_F(ReplaySourceTest, SpeedZeroIsAsFastAsTheClientTakesThem)
 {
-    const auto source = open({ { recordingOf(500), recordingOf(3) }, 0, false, {} });
+    const auto source = open({{recordingOf(500), recordingOf(3)}, 0, false, {}});
     const auto stream = source->start(collector);
     loop.runQueued();
     EXPECT_EQ(collector.messages.size(), 503u);
@@ -357,7 +356,7 @@ TEST_F(ReplaySourceTest, SpeedZeroIsAsFastAsTheClientTakesThem)
 
 TEST_F(ReplaySourceTest, EachChannelHearsItFromTheStart)
 {
-    const auto source = open({ { recordingOf(3) }, 0, false, {} });
+    const auto source = open({{recordingOf(3)}, 0, false, {}});
     const auto first = source->start(collector);
     loop.runQueued();
     Collector late;
@@ -368,7 +367,7 @@ TEST_F(ReplaySourceTest, EachChannelHearsItFromTheStart)
 
 TEST_F(ReplaySourceTest, LoopBeginsAnew)
 {
-    const auto source = open({ { recordingOf(2) }, 1, true, {} });
+    const auto source = open({{recordingOf(2)}, 1, true, {}});
     const auto stream = source->start(collector);
     loop.advance(10s);
     EXPECT_GT(collector.messages.size(), 10u);
@@ -376,7 +375,7 @@ TEST_F(ReplaySourceTest, LoopBeginsAnew)
 
 TEST_F(ReplaySourceTest, LoopOverNothingEnds)
 {
-    const auto source = open({ { recordingOf(0) }, 0, true, {} });
+    const auto source = open({{recordingOf(0)}, 0, true, {}});
     const auto stream = source->start(collector);
     loop.advance(10s);
     EXPECT_TRUE(collector.messages.empty());
@@ -384,7 +383,7 @@ TEST_F(ReplaySourceTest, LoopOverNothingEnds)
 
 TEST_F(ReplaySourceTest, SlowClientLosesNothing)
 {
-    const auto source = open({ { recordingOf(5) }, 0, false, {} });
+    const auto source = open({{recordingOf(5)}, 0, false, {}});
     collector.isFull = true;
     const auto stream = source->start(collector);
     loop.advance(10s);
@@ -398,13 +397,13 @@ TEST_F(ReplaySourceTest, SlowClientLosesNothing)
 
 TEST_F(ReplaySourceTest, FilesOfTwoTechnologiesAreRefused)
 {
-    EXPECT_EQ(open({ { recordingOf(1), recordingOf(1, Technology::GSM) }, 1, false, {} }), nullptr);
+    EXPECT_EQ(open({{recordingOf(1), recordingOf(1, Technology::GSM)}, 1, false, {}}), nullptr);
     EXPECT_NE(reason.find("2.pcap: is of technology gsm"), std::string::npos) << reason;
 }
 
 TEST_F(ReplaySourceTest, MissingFileIsNamed)
 {
-    EXPECT_EQ(open({ { folder + "/nowhere.pcap" }, 1, false, {} }), nullptr);
+    EXPECT_EQ(open({{folder + "/nowhere.pcap"}, 1, false, {}}), nullptr);
     EXPECT_NE(reason.find("nowhere.pcap: "), std::string::npos) << reason;
 }
 

@@ -66,7 +66,7 @@ protected:
     /// `toolkit` may be a front end of the test's own.
     std::unique_ptr<SpectrelApp> makeApp(ScreenToolkit& chosen)
     {
-        return std::make_unique<SpectrelApp>(SpectrelApp::Services{ loop, loop, preferences, chosen,
+        return std::make_unique<SpectrelApp>(SpectrelApp::Services {loop, loop, preferences, chosen,
             [this](SpectrelModelObserver& given) {
                 observer = &given;
                 auto made = std::make_unique<FakeModel>();
@@ -74,11 +74,11 @@ protected:
                 return made;
             },
             [this](const DictionaryRef& snapshot, const std::string& path, std::string& reason) {
-                written.push_back({ snapshot, path });
+                written.push_back({snapshot, path});
                 reason = canWrite ? "" : "no room";
                 return canWrite;
             },
-            "/crash" });
+            "/crash"});
     }
     void launch()
     {
@@ -119,7 +119,7 @@ protected:
     /// Gives every row of the pane room on the screen.
     static void display(SpectrelPaneController& pane, double width = 320)
     {
-        pane.tableView().setVisibleRows(0, 100, { 0, 0, width, 50 });
+        pane.tableView().setVisibleRows(0, 100, {0, 0, width, 50});
     }
     void tap(std::size_t row) const
     {

@@ -9,7 +9,7 @@ class SpectrelAppTest : public AppFixture { };
 
 Value nested()
 {
-    return entries({ { "A", entries({ { "B", entries({ { "C", "1" } }) } }) }, { "D", entries({}) } });
+    return entries({{"A", entries({{"B", entries({{"C", "1"}})}})}, {"D", entries({})}});
 }
 
 TEST_F(SpectrelAppTest, NoPaneShowsTheSaveButtonWithoutTheMarker)
@@ -43,7 +43,7 @@ TEST_F(SpectrelAppTest, LaunchShowsTheRootPaneConnectingInTheWindow)
     EXPECT_EQ(app->updateMessage(), "Connecting...");
     ASSERT_NE(app->window(), nullptr);
     EXPECT_TRUE(app->window()->isKeyAndVisible);
-    EXPECT_EQ(app->window()->frame, (Rect{ 0, 0, 320, 480 }));
+    EXPECT_EQ(app->window()->frame, (Rect {0, 0, 320, 480}));
     EXPECT_EQ(app->window()->rootViewController, app->navController());
 }
 
@@ -79,7 +79,7 @@ TEST_F(SpectrelAppTest, AReloadWhileConnectedShowsItsTime)
 
 TEST_F(SpectrelAppTest, TheTimeIsTheDevicesOwn)
 {
-    loop.setZone({ 3600, false });
+    loop.setZone({3600, false});
     launch();
     connect();
     show(nested());
@@ -130,7 +130,7 @@ TEST_F(SpectrelAppTest, APaneWhosePathVanishedClosesWithAllAboveItAndTheOneBelow
     tap(0);
     EXPECT_EQ(openPaths(), "/ /A /A/B ");
     const auto closed = panes()[2];
-    show(entries({ { "A", entries({ { "X", "2" } }) } }));
+    show(entries({{"A", entries({{"X", "2"}})}}));
     EXPECT_EQ(openPaths(), "/ /A ");
     display(top());
     EXPECT_EQ(top().cellAtRow(0)->key.text, "X");
@@ -145,11 +145,11 @@ TEST_F(SpectrelAppTest, TheWalkStopsAtTheFirstPaneWithoutANode)
     tap(0);
     tap(0);
     toolkit.changes.clear();
-    show(entries({ { "D", "1" } }));
+    show(entries({{"D", "1"}}));
     EXPECT_EQ(openPaths(), "/ ");
     EXPECT_EQ(top().childAtRow(0)->displayName(), "D");
-    EXPECT_THAT(toolkit.changes,
-        testing::Contains(FakeToolkit::Change{ ScreenPart::Navigation, Animation::Animated }).Times(1));
+    EXPECT_THAT(
+        toolkit.changes, testing::Contains(FakeToolkit::Change {ScreenPart::Navigation, Animation::Animated}).Times(1));
 }
 
 TEST_F(SpectrelAppTest, TheRootPaneIsReloadedEvenWithoutATree)
@@ -245,7 +245,7 @@ TEST_F(SpectrelAppTest, TheSaveScreenOpensOnceAndClosesOnce)
     app->closeSaveView();
     EXPECT_EQ(app->saveViewController(), nullptr);
     EXPECT_THAT(
-        toolkit.changes, testing::Contains(FakeToolkit::Change{ ScreenPart::Modal, Animation::Animated }).Times(2));
+        toolkit.changes, testing::Contains(FakeToolkit::Change {ScreenPart::Modal, Animation::Animated}).Times(2));
 }
 
 } // namespace

@@ -40,14 +40,14 @@ TEST_F(SpectrelPaneControllerTest, ARootLeafShowsNoRows)
 TEST_F(SpectrelPaneControllerTest, RowsShowTheChildrenInTheNodesOrder)
 {
     launch();
-    show(entries({ { "Z", "1" }, { "M", entries({ { "x", "y" } }) }, { "A", List::make() } }));
+    show(entries({{"Z", "1"}, {"M", entries({{"x", "y"}})}, {"A", List::make()}}));
     EXPECT_EQ(rows(top()), "Z=1\nM>\nA>\n");
 }
 
 TEST_F(SpectrelPaneControllerTest, AnInnerNodeWithoutChildrenHasADisclosureIndicatorAndOpensAnEmptyPane)
 {
     launch();
-    show(entries({ { "Empty", entries({}) } }));
+    show(entries({{"Empty", entries({})}}));
     EXPECT_EQ(rows(top()), "Empty>\n");
     tap(0);
     EXPECT_EQ(openPaths(), "/ /Empty ");
@@ -58,18 +58,18 @@ TEST_F(SpectrelPaneControllerTest, AnInnerNodeWithoutChildrenHasADisclosureIndic
 TEST_F(SpectrelPaneControllerTest, TappingALeafRowOnlyDeselectsIt)
 {
     launch();
-    show(entries({ { "Leaf", "1" } }));
+    show(entries({{"Leaf", "1"}}));
     toolkit.changes.clear();
     tap(0);
     EXPECT_EQ(openPaths(), "/ ");
     EXPECT_EQ(top().tableView().selectedRow(), std::nullopt);
-    EXPECT_EQ(toolkit.changes, (std::vector<FakeToolkit::Change>{ { ScreenPart::Rows, Animation::None } }));
+    EXPECT_EQ(toolkit.changes, (std::vector<FakeToolkit::Change> {{ScreenPart::Rows, Animation::None}}));
 }
 
 TEST_F(SpectrelPaneControllerTest, SelectingNoRowIsIgnored)
 {
     launch();
-    show(entries({ { "Inner", entries({}) } }));
+    show(entries({{"Inner", entries({})}}));
     top().tableView().selectRow(std::nullopt);
     top().tableView().selectRow(7);
     EXPECT_EQ(openPaths(), "/ ");
@@ -78,7 +78,7 @@ TEST_F(SpectrelPaneControllerTest, SelectingNoRowIsIgnored)
 TEST_F(SpectrelPaneControllerTest, AnOpenedPaneTakesPathStatusAndIndicatorFromTheOneBelow)
 {
     launch();
-    show(entries({ { "Cells", List::make({ entries({ { "PCI", "17" } }) }) } }));
+    show(entries({{"Cells", List::make({entries({{"PCI", "17"}})})}}));
     tap(0);
     tap(0);
     EXPECT_EQ(openPaths(), "/ /Cells /Cells/0 ");
@@ -102,7 +102,7 @@ TEST_F(SpectrelPaneControllerTest, TheStatusLabelIsInThe14PointSystemFont)
 {
     SpectrelPaneController pane(toolkit, nullptr, "/");
     pane.setStatus("text", false);
-    EXPECT_EQ(pane.toolbarItems()[1].font, (Font{ 14, FontWeight::Regular }));
+    EXPECT_EQ(pane.toolbarItems()[1].font, (Font {14, FontWeight::Regular}));
 }
 
 TEST_F(SpectrelPaneControllerTest, TheSaveButtonOpensTheSaveScreen)
@@ -117,40 +117,40 @@ TEST_F(SpectrelPaneControllerTest, TheSaveButtonOpensTheSaveScreen)
 TEST_F(SpectrelPaneControllerTest, ARowMadeForAnInnerNodeLeavesTheValueOfALeafBlank)
 {
     launch();
-    show(entries({ { "Inner", entries({}) } }));
+    show(entries({{"Inner", entries({})}}));
     EXPECT_EQ(rows(top()), "Inner>\n");
-    show(entries({ { "Leaf", "1" } }));
+    show(entries({{"Leaf", "1"}}));
     EXPECT_EQ(rows(top()), "Leaf\n");
 }
 
 TEST_F(SpectrelPaneControllerTest, ARowMadeForALeafLosesItsValueForAnInnerNodeAndGetsItBack)
 {
     launch();
-    show(entries({ { "Leaf", "1" } }));
+    show(entries({{"Leaf", "1"}}));
     EXPECT_EQ(rows(top()), "Leaf=1\n");
-    show(entries({ { "Inner", entries({}) } }));
+    show(entries({{"Inner", entries({})}}));
     EXPECT_EQ(rows(top()), "Inner=>\n");
-    show(entries({ { "Leaf", "2" } }));
+    show(entries({{"Leaf", "2"}}));
     EXPECT_EQ(rows(top()), "Leaf=2\n");
 }
 
 TEST_F(SpectrelPaneControllerTest, AllRowsInSightReturnToThePoolInOrderBeforeAReloadTakesThemInThatOrder)
 {
     launch();
-    show(entries({ { "Leaf", "1" }, { "Inner", entries({}) }, { "Last", "3" } }));
+    show(entries({{"Leaf", "1"}, {"Inner", entries({})}, {"Last", "3"}}));
     EXPECT_EQ(rows(top()), "Leaf=1\nInner>\nLast=3\n");
-    const std::vector<const void*> before{ top().cellAtRow(0), top().cellAtRow(1), top().cellAtRow(2) };
-    show(entries({ { "Leaf", "4" }, { "Inner", entries({}) }, { "Last", "5" } }));
+    const std::vector<const void*> before {top().cellAtRow(0), top().cellAtRow(1), top().cellAtRow(2)};
+    show(entries({{"Leaf", "4"}, {"Inner", entries({})}, {"Last", "5"}}));
     EXPECT_EQ(rows(top()), "Leaf=4\nInner>\nLast=5\n");
-    EXPECT_EQ(before, (std::vector<const void*>{ top().cellAtRow(0), top().cellAtRow(1), top().cellAtRow(2) }));
+    EXPECT_EQ(before, (std::vector<const void*> {top().cellAtRow(0), top().cellAtRow(1), top().cellAtRow(2)}));
 }
 
 TEST_F(SpectrelPaneControllerTest, ScrollingFillsTheRowsComingIntoSightFromThoseThatLeft)
 {
     launch();
-    show(entries({ { "a", "1" }, { "b", "2" }, { "c", "3" }, { "d", "4" }, { "e", "5" } }));
+    show(entries({{"a", "1"}, {"b", "2"}, {"c", "3"}, {"d", "4"}, {"e", "5"}}));
     TableView& table = top().tableView();
-    const Rect bounds{ 0, 0, 320, 50 };
+    const Rect bounds {0, 0, 320, 50};
     table.setVisibleRows(0, 3, bounds);
     const void* first = top().cellAtRow(0);
     const void* second = top().cellAtRow(1);
@@ -166,20 +166,20 @@ TEST_F(SpectrelPaneControllerTest, ScrollingFillsTheRowsComingIntoSightFromThose
 TEST_F(SpectrelPaneControllerTest, ValuesAreScrolledBackWhenTheirRowShowsAnotherChild)
 {
     launch();
-    show(entries({ { "a", std::string(100, 'x') }, { "b", "2" } }));
+    show(entries({{"a", std::string(100, 'x')}, {"b", "2"}}));
     TableView& table = top().tableView();
-    table.setVisibleRows(0, 1, { 0, 0, 320, 50 });
+    table.setVisibleRows(0, 1, {0, 0, 320, 50});
     ASSERT_TRUE(top().cellAtRow(0)->view->scrollBy(50));
     top().reloadWithNode(top().node());
     EXPECT_EQ(top().cellAtRow(0)->view->contentOffset, 50);
-    table.setVisibleRows(1, 1, { 0, 0, 320, 50 });
+    table.setVisibleRows(1, 1, {0, 0, 320, 50});
     EXPECT_EQ(top().cellAtRow(1)->view->contentOffset, 0);
 }
 
 TEST_F(SpectrelPaneControllerTest, ANewWidthLaysTheRowsInSightOutAgain)
 {
     launch();
-    show(entries({ { "a", "1" }, { "b", entries({}) } }));
+    show(entries({{"a", "1"}, {"b", entries({})}}));
     display(top(), 320);
     EXPECT_EQ(top().cellAtRow(0)->value->frame.x, 310);
     display(top(), 200);

@@ -16,7 +16,7 @@ protected:
     }
     static ListRef twoEntries()
     {
-        return List::make({ entries({ { "Description", "Snapshot (2024)" } }), entries({ { "DLF", "x" } }) });
+        return List::make({entries({{"Description", "Snapshot (2024)"}}), entries({{"DLF", "x"}})});
     }
     const Dictionary& snapshot() const
     {
@@ -101,11 +101,11 @@ TEST_F(SpectrelSaveViewControllerTest, ClosingTwiceInOneTurnDoesNoHarm)
 TEST_F(SpectrelSaveViewControllerTest, EveryEntryIsARowWithItsDescriptionAndACheckmark)
 {
     auto& screen = open(twoEntries());
-    screen.saveContentTable()->setVisibleRows(0, 10, { 0, 0, 320, 44 });
+    screen.saveContentTable()->setVisibleRows(0, 10, {0, 0, 320, 44});
     ASSERT_EQ(screen.saveContentTable()->numberOfRows(), 2U);
     const CellRef first = screen.saveContentTable()->cellAtRow(0);
     EXPECT_EQ(first->textLabel.text, "Snapshot (2024)");
-    EXPECT_EQ(first->textLabel.font, (Font{ 13, FontWeight::Regular, "Helvetica" }));
+    EXPECT_EQ(first->textLabel.font, (Font {13, FontWeight::Regular, "Helvetica"}));
     EXPECT_EQ(first->accessory, CellAccessory::Checkmark);
     EXPECT_EQ(first->reuseIdentifier(), "SaveHistoryContentCell");
     const CellRef second = screen.saveContentTable()->cellAtRow(1);
@@ -160,7 +160,7 @@ TEST_F(SpectrelSaveViewControllerTest, ReturnATouchOfTheBackgroundAndARowTakeThe
 
 TEST_F(SpectrelSaveViewControllerTest, TheScreenFillsTheApplicationsFrame)
 {
-    EXPECT_EQ(open(twoEntries()).frame(), (Rect{ 0, 0, 320, 480 }));
+    EXPECT_EQ(open(twoEntries()).frame(), (Rect {0, 0, 320, 480}));
 }
 
 } // namespace

@@ -44,9 +44,9 @@ std::string capability(const char* name)
 /// What stands for a character on a terminal that has only ASCII.
 char32_t inASCII(char32_t character)
 {
-    constexpr std::array<std::pair<char32_t, char32_t>, 12> Likenesses{ { { U'‹', U'<' }, { U'›', U'>' },
-        { U'…', U'~' }, { U'✓', U'x' }, { U'─', U'-' }, { U'│', U'|' }, { U'┌', U'+' }, { U'┐', U'+' }, { U'└', U'+' },
-        { U'┘', U'+' }, { U'°', U'o' }, { U'–', U'-' } } };
+    constexpr std::array<std::pair<char32_t, char32_t>, 12> Likenesses {
+        {{U'‹', U'<'}, {U'›', U'>'}, {U'…', U'~'}, {U'✓', U'x'}, {U'─', U'-'}, {U'│', U'|'}, {U'┌', U'+'}, {U'┐', U'+'},
+            {U'└', U'+'}, {U'┘', U'+'}, {U'°', U'o'}, {U'–', U'-'}}};
     if (character < 0x7F)
         return character;
     const auto found =
@@ -127,7 +127,7 @@ void CursesTerminal::rememberLeavingSequence() const
         sequence += "\033[?1006l\033[?1003l\033[?1002l\033[?1000l";
     if (_hasColours)
         sequence += capability("op");
-    for (const char* name : { "sgr0", "rmkx", "rmcup", "cnorm" })
+    for (const char* name : {"sgr0", "rmkx", "rmcup", "cnorm"})
         sequence += capability(name);
     TerminalGuard::setLeavingSequence(sequence);
 }
@@ -144,7 +144,7 @@ int CursesTerminal::height() const
 
 void CursesTerminal::updateSize()
 {
-    winsize size{};
+    winsize size {};
     if (::ioctl(STDOUT_FILENO, TIOCGWINSZ, &size) == 0 && size.ws_row > 0 && size.ws_col > 0)
         ::resizeterm(size.ws_row, size.ws_col);
 }
@@ -156,7 +156,7 @@ void CursesTerminal::forgetShown()
 
 void CursesTerminal::showCell(int x, int y, const GridCell& cell) const
 {
-    std::array<wchar_t, 5> text{};
+    std::array<wchar_t, 5> text {};
     for (std::size_t index = 0; index < cell.text.size(); ++index)
         text[index] = static_cast<wchar_t>(_isUTF8 ? cell.text[index] : inASCII(cell.text[index]));
     if (!_isUTF8)
@@ -168,7 +168,7 @@ void CursesTerminal::showCell(int x, int y, const GridCell& cell) const
     short pair = 0;
     if (_hasColours && cell.style.tint != Tint::Plain)
         pair = cell.style.tint == Tint::Accent ? AccentPair : WarningPair;
-    cchar_t shown{};
+    cchar_t shown {};
     if (::setcchar(&shown, text.data(), attributes, pair, nullptr) == OK)
         mvadd_wch(y, x, &shown);
     if (!_isUTF8 && cell.columns == 2)
@@ -196,7 +196,7 @@ void CursesTerminal::show(const Grid& grid)
 
 void CursesTerminal::readMouse(const std::function<void(const InputEvent&)>& handler) const
 {
-    MEVENT mouse{};
+    MEVENT mouse {};
     if (::getmouse(&mouse) != OK)
         return;
     if (const auto event = KeyDecoder::mouse(mouse.bstate, mouse.x, mouse.y))
@@ -216,9 +216,9 @@ bool CursesTerminal::read(const std::function<void(const InputEvent&)>& handler)
         if (result == KEY_CODE_YES && code == KEY_MOUSE)
             readMouse(handler);
         else
-            _decoder.feed({ result == KEY_CODE_YES, code }, handler);
+            _decoder.feed({result == KEY_CODE_YES, code}, handler);
     }
-    pollfd input{ STDIN_FILENO, POLLIN, 0 };
+    pollfd input {STDIN_FILENO, POLLIN, 0};
     return ::poll(&input, 1, 0) < 0 || (input.revents & (POLLHUP | POLLERR | POLLNVAL)) == 0;
 }
 

@@ -20,9 +20,9 @@ void Grid::clear()
 void Grid::set(int x, int y, const GridCell& content)
 {
     if (at(x, y).columns == 0 && x > 0 && at(x - 1, y).columns == 2)
-        cell(x - 1, y) = GridCell{ .style = at(x - 1, y).style };
+        cell(x - 1, y) = GridCell {.style = at(x - 1, y).style};
     if (at(x, y).columns == 2 && x + 1 < _width)
-        cell(x + 1, y) = GridCell{ .style = at(x + 1, y).style };
+        cell(x + 1, y) = GridCell {.style = at(x + 1, y).style};
     cell(x, y) = content;
 }
 
@@ -36,11 +36,11 @@ int Grid::put(int x, int y, std::string_view text, Style style, Span clip)
             return end;
         if (x >= left && end <= right) {
             if (glyph->columns == 2)
-                set(x + 1, y, { {}, 0, style });
-            set(x, y, { glyph->text, 1, style });
+                set(x + 1, y, {{}, 0, style});
+            set(x, y, {glyph->text, 1, style});
             cell(x, y).columns = static_cast<std::uint8_t>(glyph->columns);
         } else {
-            fill(y, { std::max(x, left), std::min(end, right) }, style);
+            fill(y, {std::max(x, left), std::min(end, right)}, style);
         }
         x = end;
     }
@@ -52,7 +52,7 @@ void Grid::fill(int y, Span span, Style style)
     if (y < 0 || y >= _height)
         return;
     for (int x = std::max(0, span.left); x < std::min(span.right, _width); ++x)
-        set(x, y, { .style = style });
+        set(x, y, {.style = style});
 }
 
 void Grid::reverse(int y, Span span)

@@ -23,7 +23,7 @@ struct Style {
 
 /// One place on the screen.
 struct GridCell {
-    std::array<char32_t, 4> text{ U' ' }; // as in Glyph
+    std::array<char32_t, 4> text {U' '}; // as in Glyph
     std::uint8_t columns = 1; // 0: covered by the wide glyph to its left
     Style style;
     friend bool operator==(const GridCell&, const GridCell&) = default;
@@ -65,7 +65,7 @@ public:
     int put(int x, int y, std::string_view text, Style style, Span clip);
     int put(int x, int y, std::string_view text, Style style)
     {
-        return put(x, y, text, style, { 0, _width });
+        return put(x, y, text, style, {0, _width});
     }
     /// Blanks the columns.
     void fill(int y, Span span, Style style);

@@ -10,7 +10,7 @@ namespace {
 
 constexpr unsigned EscapeCharacter = 0x1B;
 
-constexpr std::array FunctionKeys{
+constexpr std::array FunctionKeys {
     std::pair(static_cast<unsigned>(KEY_UP), Key::Up),
     std::pair(static_cast<unsigned>(KEY_DOWN), Key::Down),
     std::pair(static_cast<unsigned>(KEY_LEFT), Key::Left),
@@ -26,7 +26,7 @@ constexpr std::array FunctionKeys{
     std::pair(static_cast<unsigned>(KEY_BTAB), Key::BackTab),
 };
 
-constexpr std::array ControlCharacters{
+constexpr std::array ControlCharacters {
     std::pair(0x08U, Key::Backspace),
     std::pair(0x09U, Key::Tab),
     std::pair(0x0AU, Key::Enter),
@@ -41,7 +41,7 @@ std::optional<KeyEvent> lookUp(const std::array<std::pair<unsigned, Key>, Count>
 {
     for (const auto& [known, key] : table) {
         if (known == code)
-            return KeyEvent{ key };
+            return KeyEvent {key};
     }
     return std::nullopt;
 }
@@ -66,7 +66,7 @@ void KeyDecoder::feed(RawKey raw, const Handler& handler)
         return;
     }
     const bool isCharacter = !raw.isFunctionKey && raw.code >= 0x20 && raw.code != 0x7F;
-    const auto event = isCharacter ? KeyEvent{ Key::Character, raw.code }
+    const auto event = isCharacter ? KeyEvent {Key::Character, raw.code}
         : raw.isFunctionKey        ? lookUp(FunctionKeys, raw.code)
                                    : lookUp(ControlCharacters, raw.code);
     if (event)
@@ -76,18 +76,18 @@ void KeyDecoder::feed(RawKey raw, const Handler& handler)
 void KeyDecoder::flush(const Handler& handler)
 {
     if (std::exchange(_state, State::Plain) == State::Escaped)
-        handler(KeyEvent{ Key::Escape });
+        handler(KeyEvent {Key::Escape});
 }
 
 std::optional<MouseEvent> KeyDecoder::mouse(unsigned long buttons, int x, int y)
 {
     using Action = MouseEvent::Action;
     if (buttons & BUTTON4_PRESSED)
-        return MouseEvent{ Action::WheelUp, x, y };
+        return MouseEvent {Action::WheelUp, x, y};
     if (buttons & BUTTON5_PRESSED)
-        return MouseEvent{ Action::WheelDown, x, y };
+        return MouseEvent {Action::WheelDown, x, y};
     if (buttons & (BUTTON1_PRESSED | BUTTON1_CLICKED))
-        return MouseEvent{ Action::Press, x, y };
+        return MouseEvent {Action::Press, x, y};
     return std::nullopt;
 }
 

@@ -9,9 +9,9 @@ namespace spectrel {
 
 namespace {
 
-constexpr Style TitleStyle{ .isBold = true, .isReversed = true };
-constexpr Style NameStyle{ .isBold = true };
-constexpr Style FaintStyle{ .isFaint = true };
+constexpr Style TitleStyle {.isBold = true, .isReversed = true};
+constexpr Style NameStyle {.isBold = true};
+constexpr Style FaintStyle {.isFaint = true};
 constexpr std::string_view BackMark = "‹";
 constexpr std::string_view DisclosureMark = "›";
 constexpr std::string_view MoreMark = "…";
@@ -196,7 +196,7 @@ void PaneView::draw(Grid& grid, bool isRoot, char spinner)
     const Layout layout(grid.height());
     settle(*pane, layout.rows);
     pane->tableView().setVisibleRows(_top, static_cast<std::size_t>(std::max(layout.rows, 0)),
-        { 0, 0, grid.width() * TerminalMetrics::Column, TerminalMetrics::Line });
+        {0, 0, grid.width() * TerminalMetrics::Column, TerminalMetrics::Line});
     if (layout.hasTitle)
         drawTitle(grid, *pane, isRoot);
     for (int line = 0; line < layout.rows; ++line) {
@@ -206,7 +206,7 @@ void PaneView::draw(Grid& grid, bool isRoot, char spinner)
             break;
         drawRow(grid, layout.firstRow() + line, *cell);
         if (row == _cursor)
-            grid.reverse(layout.firstRow() + line, { 0, grid.width() });
+            grid.reverse(layout.firstRow() + line, {0, grid.width()});
     }
     if (layout.hasToolbar)
         drawToolbar(grid, *pane, spinner);
@@ -214,13 +214,13 @@ void PaneView::draw(Grid& grid, bool isRoot, char spinner)
 
 void PaneView::drawTitle(Grid& grid, const SpectrelPaneController& pane, bool isRoot) const
 {
-    grid.fill(0, { 0, grid.width() }, TitleStyle);
+    grid.fill(0, {0, grid.width()}, TitleStyle);
     const int start = isRoot ? 1 : grid.put(0, 0, BackMark, TitleStyle) + 1;
     const int end = grid.put(start, 0, pane.title(), TitleStyle);
     const std::string_view right = isRoot ? HelpHint : std::string_view(pane.path());
     const int columns = columnsOf(right);
     if (end + 2 + columns + 1 <= grid.width())
-        grid.put(grid.width() - columns - 1, 0, right, Style{ .isReversed = true });
+        grid.put(grid.width() - columns - 1, 0, right, Style {.isReversed = true});
 }
 
 void PaneView::drawRow(Grid& grid, int y, const SpectrelCell& cell) const
@@ -228,7 +228,7 @@ void PaneView::drawRow(Grid& grid, int y, const SpectrelCell& cell) const
     const int width = grid.width();
     const auto place = [](double points) { return TerminalMetrics::columns(points); };
     if (cell.accessory == CellAccessory::DisclosureIndicator) {
-        grid.put(place(cell.key.frame.x), y, cell.key.text, NameStyle, { 0, width - 2 });
+        grid.put(place(cell.key.frame.x), y, cell.key.text, NameStyle, {0, width - 2});
         grid.put(width - 1, y, DisclosureMark, FaintStyle);
         return;
     }
@@ -237,7 +237,7 @@ void PaneView::drawRow(Grid& grid, int y, const SpectrelCell& cell) const
     if (!cell.value || !cell.view)
         return;
     const int valueStart = place(cell.value->frame.x) - offset;
-    const int valueEnd = grid.put(valueStart, y, cell.value->text, Style{ .tint = Tint::Accent });
+    const int valueEnd = grid.put(valueStart, y, cell.value->text, Style {.tint = Tint::Accent});
     if (offset > 0)
         grid.put(0, y, MoreMark, FaintStyle);
     if (valueEnd > width || (valueStart >= width && !cell.value->text.empty()))
@@ -255,19 +255,19 @@ void PaneView::drawToolbar(Grid& grid, const SpectrelPaneController& pane, char 
     };
     if (std::ranges::any_of(items, hasKind(ToolbarItem::Kind::SaveButton))) {
         const int columns = columnsOf(SaveButton);
-        _saveButton = { std::max(0, right - columns - 1), std::max(0, right - 1) };
-        grid.put(_saveButton.left, y, SaveButton, Style{ .isBold = true });
+        _saveButton = {std::max(0, right - columns - 1), std::max(0, right - 1)};
+        grid.put(_saveButton.left, y, SaveButton, Style {.isBold = true});
         right = _saveButton.left - 1;
     }
     int x = 1;
     bool isFirst = true;
     for (const ToolbarItem& item : items) {
         if (item.kind == ToolbarItem::Kind::LoadingIndicator && item.isSpinning) {
-            grid.put(x, y, std::string_view(&spinner, 1), Style{ .tint = Tint::Accent }, { 0, right });
+            grid.put(x, y, std::string_view(&spinner, 1), Style {.tint = Tint::Accent}, {0, right});
             x += 2;
         } else if (item.kind == ToolbarItem::Kind::Label) {
-            const Style style = isFirst ? Style{} : Style{ .tint = Tint::Warning };
-            x = grid.put(x, y, item.text, style, { 0, right }) + 2;
+            const Style style = isFirst ? Style {} : Style {.tint = Tint::Warning};
+            x = grid.put(x, y, item.text, style, {0, right}) + 2;
             isFirst = false;
         }
     }

@@ -15,8 +15,8 @@ constexpr std::string_view DescriptionLabel = " Description: ";
 constexpr std::string_view CheckMark = "✓";
 constexpr std::string_view SaveButton = "[Save]";
 constexpr std::string_view CancelButton = "[Cancel]";
-constexpr Span SavePlace{ 1, 7 };
-constexpr Span CancelPlace{ 9, 17 };
+constexpr Span SavePlace {1, 7};
+constexpr Span CancelPlace {9, 17};
 
 bool holds(Span span, int x)
 {
@@ -144,27 +144,27 @@ void SaveView::drawDescription(Grid& grid, int y, const SpectrelSaveViewControll
 {
     const bool isEditing = controller.saveDescription()->isFirstResponder;
     const std::string text = controller.saveDescription()->text.value_or("");
-    const int start = grid.put(0, y, DescriptionLabel, Style{ .isBold = true });
+    const int start = grid.put(0, y, DescriptionLabel, Style {.isBold = true});
     const int room = grid.width() - start - 1;
     // The end of the text, where it is typed, stays in sight.
-    const int end = grid.put(start + std::min(0, room - columnsOf(text)), y, text, Style{}, { start, grid.width() });
+    const int end = grid.put(start + std::min(0, room - columnsOf(text)), y, text, Style {}, {start, grid.width()});
     if (isEditing)
-        grid.reverse(y, { end, end + 1 });
+        grid.reverse(y, {end, end + 1});
 }
 
 void SaveView::drawEntries(Grid& grid, const Layout& layout, SpectrelSaveViewController& controller) const
 {
     TableView& table = *controller.saveContentTable();
     table.setVisibleRows(_top, static_cast<std::size_t>(layout.entries),
-        { 0, 0, grid.width() * TerminalMetrics::Column, TerminalMetrics::Line });
+        {0, 0, grid.width() * TerminalMetrics::Column, TerminalMetrics::Line});
     for (int line = 0; line < layout.entries; ++line) {
         const CellRef cell = table.cellAtRow(_top + static_cast<std::size_t>(line));
         if (!cell)
             break;
         const int y = layout.firstEntry + line;
         if (cell->accessory == CellAccessory::Checkmark)
-            grid.put(1, y, CheckMark, Style{ .tint = Tint::Accent });
-        grid.put(3, y, cell->textLabel.text, Style{ .isBold = _focus == Focus::Entries });
+            grid.put(1, y, CheckMark, Style {.tint = Tint::Accent});
+        grid.put(3, y, cell->textLabel.text, Style {.isBold = _focus == Focus::Entries});
     }
 }
 
@@ -173,14 +173,14 @@ void SaveView::draw(Grid& grid, SpectrelSaveViewController& controller)
     const Layout layout(grid.height());
     scroll(0, layout.entries, controller); // the screen may have grown
     if (layout.title >= 0) {
-        grid.fill(layout.title, { 0, grid.width() }, Style{ .isReversed = true });
-        grid.put(1, layout.title, Title, Style{ .isBold = true, .isReversed = true });
+        grid.fill(layout.title, {0, grid.width()}, Style {.isReversed = true});
+        grid.put(1, layout.title, Title, Style {.isBold = true, .isReversed = true});
     }
     if (layout.description >= 0)
         drawDescription(grid, layout.description, controller);
     drawEntries(grid, layout, controller);
-    grid.put(SavePlace.left, layout.buttons, SaveButton, Style{ .isBold = true, .isReversed = _focus == Focus::Save });
-    grid.put(CancelPlace.left, layout.buttons, CancelButton, Style{ .isReversed = _focus == Focus::Cancel });
+    grid.put(SavePlace.left, layout.buttons, SaveButton, Style {.isBold = true, .isReversed = _focus == Focus::Save});
+    grid.put(CancelPlace.left, layout.buttons, CancelButton, Style {.isReversed = _focus == Focus::Cancel});
 }
 
 } // namespace spectrel

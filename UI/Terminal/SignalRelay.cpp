@@ -10,8 +10,8 @@ namespace spectrel {
 
 namespace {
 
-std::array<volatile std::sig_atomic_t, NSIG> cameIn{};
-int wakeEnds[2] = { -1, -1 };
+std::array<volatile std::sig_atomic_t, NSIG> cameIn {};
+int wakeEnds[2] = {-1, -1};
 
 bool endsProgram(int signal)
 {

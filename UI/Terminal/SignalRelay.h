@@ -27,7 +27,7 @@ public:
     void stopProcess();
 
 private:
-    static constexpr std::array Signals{ SIGINT, SIGTERM, SIGHUP, SIGWINCH, SIGTSTP, SIGCONT };
+    static constexpr std::array Signals {SIGINT, SIGTERM, SIGHUP, SIGWINCH, SIGTSTP, SIGCONT};
     std::array<struct sigaction, Signals.size()> _before;
 };
 

@@ -13,7 +13,7 @@ namespace spectrel {
 
 namespace {
 
-constexpr std::chrono::milliseconds SpinnerInterval{ 150 };
+constexpr std::chrono::milliseconds SpinnerInterval {150};
 
 } // namespace
 
@@ -81,7 +81,7 @@ private:
             resume();
         }
         bool ends = false;
-        for (const int signal : { SIGINT, SIGTERM, SIGHUP })
+        for (const int signal : {SIGINT, SIGTERM, SIGHUP})
             ends |= SignalRelay::take(signal);
         if (ends)
             _frontEnd.quit();

@@ -16,15 +16,15 @@ namespace spectrel {
 namespace {
 
 // Plain memory, set before the terminal is touched: a signal handler may read nothing else.
-std::atomic<bool> isArmed{ false };
-termios savedModes{};
+std::atomic<bool> isArmed {false};
+termios savedModes {};
 bool hasSavedModes = false;
-std::array<char, 512> leavingSequence{};
+std::array<char, 512> leavingSequence {};
 std::size_t leavingLength = 0;
 int savedStandardError = -1; // the real one, while its place is taken by the pipe
 int heldLines = -1; // the pipe's end to read
 
-constexpr std::array CrashSignals{ SIGSEGV, SIGABRT, SIGBUS, SIGFPE, SIGILL, SIGQUIT };
+constexpr std::array CrashSignals {SIGSEGV, SIGABRT, SIGBUS, SIGFPE, SIGILL, SIGQUIT};
 std::array<struct sigaction, CrashSignals.size()> actionsBefore;
 alignas(16) std::array<char, 32 * 1024> handlerStack; // a stack overflow leaves no room on the ordinary one
 
@@ -58,7 +58,7 @@ void releaseStandardError() noexcept
 
 void holdStandardError()
 {
-    std::array<int, 2> ends{};
+    std::array<int, 2> ends {};
     if (::isatty(STDERR_FILENO) == 0 || ::pipe2(ends.data(), O_NONBLOCK | O_CLOEXEC) != 0)
         return;
     const int saved = ::fcntl(STDERR_FILENO, F_DUPFD_CLOEXEC, 3);
@@ -86,7 +86,7 @@ void handleCrash(int signal)
 
 void installCrashHandlers()
 {
-    stack_t stack{};
+    stack_t stack {};
     if (::sigaltstack(nullptr, &stack) == 0 && (stack.ss_flags & SS_DISABLE) != 0) {
         stack = {};
         stack.ss_sp = handlerStack.data();

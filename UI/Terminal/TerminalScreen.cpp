@@ -15,7 +15,7 @@ constexpr std::string_view SpinnerFrames = "|/-\\";
 
 const std::vector<std::string>& helpLines()
 {
-    static const std::vector<std::string> lines{
+    static const std::vector<std::string> lines {
         "Keys",
         "",
         "Up Down  j k      move",
@@ -47,12 +47,12 @@ TerminalScreen::TerminalScreen(std::function<void()> needsDisplay, std::function
 
 Size TerminalScreen::sizeOfText(std::string_view text, const Font&) const
 {
-    return { columnsOf(text) * TerminalMetrics::Column, TerminalMetrics::Line };
+    return {columnsOf(text) * TerminalMetrics::Column, TerminalMetrics::Line};
 }
 
 Size TerminalScreen::mainScreenSize() const
 {
-    return { _grid.width() * TerminalMetrics::Column, _grid.height() * TerminalMetrics::Line };
+    return {_grid.width() * TerminalMetrics::Column, _grid.height() * TerminalMetrics::Line};
 }
 
 void TerminalScreen::screenDidChange(ScreenPart part, Animation)
@@ -161,7 +161,7 @@ const Grid& TerminalScreen::draw()
         view->draw(_grid, _panes.size() == 1, SpinnerFrames[_spinner % SpinnerFrames.size()]);
     if (!_alerts.empty()) {
         const Alert& alert = _alerts.front();
-        drawBox({ alert.title, "", alert.message, "", "[" + alert.button + "]" }, 0);
+        drawBox({alert.title, "", alert.message, "", "[" + alert.button + "]"}, 0);
     } else if (_showsHelp) {
         drawBox(helpLines(), 0);
     }
@@ -181,15 +181,15 @@ void TerminalScreen::drawBox(const std::vector<std::string>& lines, std::size_t 
     std::string bar;
     for (int column = 0; column < width - 2; ++column)
         bar += "─";
-    _grid.put(left, top, "┌" + bar + "┐", Style{});
+    _grid.put(left, top, "┌" + bar + "┐", Style {});
     for (std::size_t index = 0; index < lines.size(); ++index) {
         const int y = top + 1 + static_cast<int>(index);
-        _grid.fill(y, { left, left + width }, Style{});
-        _grid.put(left, y, "│", Style{});
-        _grid.put(left + 2, y, lines[index], Style{ .isBold = index == boldLine }, { left, left + width - 1 });
-        _grid.put(left + width - 1, y, "│", Style{});
+        _grid.fill(y, {left, left + width}, Style {});
+        _grid.put(left, y, "│", Style {});
+        _grid.put(left + 2, y, lines[index], Style {.isBold = index == boldLine}, {left, left + width - 1});
+        _grid.put(left + width - 1, y, "│", Style {});
     }
-    _grid.put(left, top + height - 1, "└" + bar + "┘", Style{});
+    _grid.put(left, top + height - 1, "└" + bar + "┘", Style {});
 }
 
 bool TerminalScreen::isAnimating() const

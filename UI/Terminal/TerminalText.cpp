@@ -24,7 +24,7 @@ Decoded decodeUTF8(std::string_view text)
     const auto byte = [text](std::size_t at) { return static_cast<unsigned char>(text[at]); };
     const unsigned lead = byte(0);
     if (lead < 0x80)
-        return { lead, 1 };
+        return {lead, 1};
     const std::size_t length = lead >= 0xF0 ? 4 : lead >= 0xE0 ? 3 : 2;
     if (lead < 0xC2 || lead > 0xF4 || text.size() < length)
         return {};
@@ -37,7 +37,7 @@ Decoded decodeUTF8(std::string_view text)
     const char32_t least = length == 4 ? 0x10000 : length == 3 ? 0x800 : 0x80;
     if (character < least || character > 0x10FFFF || (character >= 0xD800 && character <= 0xDFFF))
         return {};
-    return { character, length };
+    return {character, length};
 }
 
 /// The width by the tables of a UTF-8 locale, whichever locale the program runs in; -1 when it is not known.

@@ -10,7 +10,7 @@ namespace spectrel {
 
 /// What fills one place on the screen: a character and the marks that combine with it.
 struct Glyph {
-    std::array<char32_t, 4> text{}; // ends at the first 0; marks beyond the third are left out
+    std::array<char32_t, 4> text {}; // ends at the first 0; marks beyond the third are left out
     int columns = 1; // 1 or 2
     std::size_t bytes = 0; // that it took of the text, left-out ones included
 };

@@ -8,7 +8,7 @@ namespace {
 class PDPContextListTest : public SectionFixture<PDPContextList> {
 protected:
     PDPContextListTest()
-        : SectionFixture(List::make({ "old" }))
+        : SectionFixture(List::make({"old"}))
     {
     }
 };
@@ -16,14 +16,14 @@ protected:
 TEST_F(PDPContextListTest, ListReplacesTheContextsAsTheyCame)
 {
     deliverPropertyList(
-        0xFF0002, List::make({ Dictionary::make({ { "APN", "internet" }, { "CID", Value::integer(1) } }), "odd" }));
+        0xFF0002, List::make({Dictionary::make({{"APN", "internet"}, {"CID", Value::integer(1)}}), "odd"}));
     EXPECT_EQ(display(), "[{\"APN\": \"internet\", \"CID\": int 1}, \"odd\"]");
     EXPECT_EQ(log(), "<4>PDPContextList\n");
 }
 
 TEST_F(PDPContextListTest, DictionaryLeavesTheContextsUnchanged)
 {
-    deliverPropertyList(0xFF0002, Dictionary::make({ { "APN", "internet" } }));
+    deliverPropertyList(0xFF0002, Dictionary::make({{"APN", "internet"}}));
     EXPECT_EQ(display(), "[\"old\"]");
     EXPECT_EQ(log(), "<4>PDPContextList\n");
 }
@@ -36,7 +36,7 @@ TEST_F(PDPContextListTest, EmptyListEmptiesTheContexts)
 
 TEST_F(PDPContextListTest, GarbageLeavesTheContextsUnchangedWithoutAMessage)
 {
-    const Bytes garbage{ 1, 2, 3 };
+    const Bytes garbage {1, 2, 3};
     deliver(0xFF0002, RecordBuilder::withPayload(0xFF0002, garbage));
     EXPECT_EQ(display(), "[\"old\"]");
     EXPECT_EQ(log(), "<4>PDPContextList\n");
@@ -45,9 +45,9 @@ TEST_F(PDPContextListTest, GarbageLeavesTheContextsUnchangedWithoutAMessage)
 TEST_F(PDPContextListTest, NodeThatIsNoListTakesNothing)
 {
     section.updateSectionRef(Dictionary::make());
-    deliverPropertyList(0xFF0002, List::make({ "new" }));
+    deliverPropertyList(0xFF0002, List::make({"new"}));
     section.updateSectionRef({});
-    deliverPropertyList(0xFF0002, List::make({ "new" }));
+    deliverPropertyList(0xFF0002, List::make({"new"}));
     EXPECT_EQ(display(), "[\"old\"]");
 }
 

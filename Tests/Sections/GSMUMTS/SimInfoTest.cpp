@@ -17,28 +17,27 @@ protected:
 
 TEST_F(SimInfoTest, OnlyTheICCIDSetsOnlyTheICCID)
 {
-    deliverPropertyList(0xFF0000, Dictionary::make({ { "kSimFile_ICCID", "8900112233" } }));
+    deliverPropertyList(0xFF0000, Dictionary::make({{"kSimFile_ICCID", "8900112233"}}));
     EXPECT_EQ(display(), "{\"EF-ICCID\": \"8900112233\"}");
     EXPECT_EQ(log(), "<4>SimInfo\n");
 }
 
 TEST_F(SimInfoTest, AbsentFilesKeepTheirValues)
 {
-    deliverPropertyList(0xFF0000, Dictionary::make({ { "kSimFile_ICCID", "1" }, { "kSimFile_LOCI", "2" } }));
-    deliverPropertyList(0xFF0000, Dictionary::make({ { "kSimFile_LOCI", "3" } }));
+    deliverPropertyList(0xFF0000, Dictionary::make({{"kSimFile_ICCID", "1"}, {"kSimFile_LOCI", "2"}}));
+    deliverPropertyList(0xFF0000, Dictionary::make({{"kSimFile_LOCI", "3"}}));
     EXPECT_EQ(display(), "{\"EF-ICCID\": \"1\", \"EF-LOCI\": \"3\"}");
 }
 
 TEST_F(SimInfoTest, EveryFileHasItsLabelInTableOrder)
 {
-    const std::pair<const char*, const char*> files[] = { { "kSimFile_OPLMNAcT", "EF-OPLMNAcT" },
-        { "kSimFile_ICCID", "EF-ICCID" }, { "kSimFile_MSISDN", "EF-MSISDN" },
-        { "kSimFile_MBDN", "EF-3GPP MAIL BOX DIALING NUMBER" }, { "kSimFile_HPPLMN", "EF-HPPLMN SEARCH PERIOD" },
-        { "kSimFile_LOCI", "EF-LOCI" }, { "kSimFile_PSLOCI", "EF-GPRS/PS-LOCI" },
-        { "kSimFile_ACC", "EF-ACCESS CONTROL CLASS" }, { "kSimFile_AD", "EF-ADMINISTRATIVE DATA" },
-        { "kSimFile_FPLMN", "EF-FPLMN" }, { "kSimFile_AHPLMN", "EF-ACTING HPLMN" },
-        { "kSimFile_RATMODE", "EF-RAT MODE" }, { "kSimFile_PNN", "EF-PLMN NETWORK NAME" },
-        { "kSimFile_OPL", "EF-OPERATOR PLMN LIST" } };
+    const std::pair<const char*, const char*> files[] = {{"kSimFile_OPLMNAcT", "EF-OPLMNAcT"},
+        {"kSimFile_ICCID", "EF-ICCID"}, {"kSimFile_MSISDN", "EF-MSISDN"},
+        {"kSimFile_MBDN", "EF-3GPP MAIL BOX DIALING NUMBER"}, {"kSimFile_HPPLMN", "EF-HPPLMN SEARCH PERIOD"},
+        {"kSimFile_LOCI", "EF-LOCI"}, {"kSimFile_PSLOCI", "EF-GPRS/PS-LOCI"},
+        {"kSimFile_ACC", "EF-ACCESS CONTROL CLASS"}, {"kSimFile_AD", "EF-ADMINISTRATIVE DATA"},
+        {"kSimFile_FPLMN", "EF-FPLMN"}, {"kSimFile_AHPLMN", "EF-ACTING HPLMN"}, {"kSimFile_RATMODE", "EF-RAT MODE"},
+        {"kSimFile_PNN", "EF-PLMN NETWORK NAME"}, {"kSimFile_OPL", "EF-OPERATOR PLMN LIST"}};
     auto payload = Dictionary::make();
     for (const auto& [key, label] : files)
         payload->set(key, label);
@@ -52,15 +51,15 @@ TEST_F(SimInfoTest, EveryFileHasItsLabelInTableOrder)
 TEST_F(SimInfoTest, ValuesAreStoredAsTheyAre)
 {
     deliverPropertyList(
-        0xFF0000, Dictionary::make({ { "kSimFile_ACC", Value::integer(3) }, { "kSimFile_PNN", List::make({ "a" }) } }));
+        0xFF0000, Dictionary::make({{"kSimFile_ACC", Value::integer(3)}, {"kSimFile_PNN", List::make({"a"})}}));
     EXPECT_EQ(display(), "{\"EF-ACCESS CONTROL CLASS\": int 3, \"EF-PLMN NETWORK NAME\": [\"a\"]}");
 }
 
 TEST_F(SimInfoTest, PayloadThatIsNoPropertyListIsLoggedRaisesAndChangesNothing)
 {
-    deliverPropertyList(0xFF0000, Dictionary::make({ { "kSimFile_ICCID", "1" } }));
+    deliverPropertyList(0xFF0000, Dictionary::make({{"kSimFile_ICCID", "1"}}));
     log();
-    const Bytes garbage{ '<', 'x' };
+    const Bytes garbage {'<', 'x'};
     EXPECT_THROW(
         deliver(0xFF0000, RecordBuilder::withPayload(0xFF0000, garbage)), LogCode_0xFF0000::UnknownDataException);
     EXPECT_EQ(display(), "{\"EF-ICCID\": \"1\"}");
@@ -74,7 +73,7 @@ TEST_F(SimInfoTest, RecordWithoutPayloadRaises)
 
 TEST_F(SimInfoTest, PayloadThatIsNoDictionaryHasNoFiles)
 {
-    deliverPropertyList(0xFF0000, List::make({ "kSimFile_ICCID" }));
+    deliverPropertyList(0xFF0000, List::make({"kSimFile_ICCID"}));
     EXPECT_EQ(display(), "{}");
 }
 

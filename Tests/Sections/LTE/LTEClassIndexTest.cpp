@@ -11,13 +11,13 @@ TEST(LTEClassIndexTest, CodesAreRegisteredInCreationOrder)
 {
     const LTEClassIndex index;
     EXPECT_EQ(
-        index.getAllLogCodes(), (std::vector<std::string>{ "45250", "45249", "16711681", "16711680", "16711682" }));
+        index.getAllLogCodes(), (std::vector<std::string> {"45250", "45249", "16711681", "16711680", "16711682"}));
 }
 
 TEST(LTEClassIndexTest, EverySectionIsFoundUnderItsName)
 {
     const LTEClassIndex index;
-    for (const char* name : { "Serving Cell Info", "SIM Info", "PDP Context Info" }) {
+    for (const char* name : {"Serving Cell Info", "SIM Info", "PDP Context Info"}) {
         ASSERT_NE(index.getClass(name), nullptr) << name;
         EXPECT_EQ(index.getClass(name)->getSectionName(), name);
     }

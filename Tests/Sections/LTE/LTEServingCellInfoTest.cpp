@@ -30,13 +30,13 @@ protected:
     static DictionaryRef cell(int identity, std::string_view type = kRKCellMonitorCellTypeServing)
     {
         return Dictionary::make({
-            { std::string(kRKCellMonitorCellRadioAccessTechnology), kRKCellMonitorRadioAccessTechnologyLTE },
-            { std::string(kRKCellMonitorCellType), type },
-            { std::string(kRKCellMonitorTAC), Value::integer(12) },
-            { std::string(kRKCellMonitorCellId), Value::integer(identity) },
-            { std::string(kRKCellMonitorPID), Value::integer(77) },
-            { std::string(kRKCellMonitorBandInfo), Value::integer(20) },
-            { std::string(kRKCellMonitorUARFCN), Value::integer(6300) },
+            {std::string(kRKCellMonitorCellRadioAccessTechnology), kRKCellMonitorRadioAccessTechnologyLTE},
+            {std::string(kRKCellMonitorCellType), type},
+            {std::string(kRKCellMonitorTAC), Value::integer(12)},
+            {std::string(kRKCellMonitorCellId), Value::integer(identity)},
+            {std::string(kRKCellMonitorPID), Value::integer(77)},
+            {std::string(kRKCellMonitorBandInfo), Value::integer(20)},
+            {std::string(kRKCellMonitorUARFCN), Value::integer(6300)},
         });
     }
 };
@@ -52,7 +52,7 @@ TEST_F(LTEServingCellInfoTest, RecordOneByteTooShortChangesNothing)
 
 TEST_F(LTEServingCellInfoTest, RecordOf38BytesSetsAllEightKeysAndRemovesUARFCN)
 {
-    deliverPropertyList(0xFF0001, List::make({ cell(5) }));
+    deliverPropertyList(0xFF0001, List::make({cell(5)}));
     EXPECT_EQ(shown("UARFCN"), "\"6300\"");
     log();
     deliver(0xB0C2, servingCell(38));
@@ -74,8 +74,8 @@ TEST_F(LTEServingCellInfoTest, KeysAreWrittenInOrder)
 
 TEST_F(LTEServingCellInfoTest, BandwidthIsNamedByItsResourceBlocks)
 {
-    const std::pair<int, const char*> bandwidths[] = { { 6, "1.4 MHz" }, { 15, "3 MHz" }, { 25, "5 MHz" },
-        { 50, "10 MHz" }, { 75, "15 MHz" }, { 100, "20 MHz" }, { 0, "Unknown" }, { 7, "Unknown" }, { 255, "Unknown" } };
+    const std::pair<int, const char*> bandwidths[] = {{6, "1.4 MHz"}, {15, "3 MHz"}, {25, "5 MHz"}, {50, "10 MHz"},
+        {75, "15 MHz"}, {100, "20 MHz"}, {0, "Unknown"}, {7, "Unknown"}, {255, "Unknown"}};
     for (const auto& [resourceBlocks, name] : bandwidths) {
         deliver(0xB0C2, servingCell().u8(20, static_cast<std::uint32_t>(resourceBlocks)).u8(21, 6));
         EXPECT_EQ(shown("Download Bandwidth"), "\"" + std::string(name) + "\"") << resourceBlocks;
@@ -113,7 +113,7 @@ TEST_F(LTEServingCellInfoTest, OtherCodeIsLoggedAsUnknown)
 
 TEST_F(LTEServingCellInfoTest, CellInformationSetsFiveKeysInOrder)
 {
-    deliverPropertyList(0xFF0001, List::make({ cell(5) }));
+    deliverPropertyList(0xFF0001, List::make({cell(5)}));
     EXPECT_EQ(display(),
         "{\"Tracking Area Code\": \"12\", \"Cell Identity\": \"5\", \"Physical Cell ID\": \"77\", "
         "\"Freq Band Indicator\": \"20\", \"UARFCN\": \"6300\"}");
@@ -122,14 +122,14 @@ TEST_F(LTEServingCellInfoTest, CellInformationSetsFiveKeysInOrder)
 
 TEST_F(LTEServingCellInfoTest, OnlyANeighbourChangesNothing)
 {
-    deliverPropertyList(0xFF0001, List::make({ cell(5, kRKCellMonitorCellTypeNeighbor) }));
+    deliverPropertyList(0xFF0001, List::make({cell(5, kRKCellMonitorCellTypeNeighbor)}));
     EXPECT_EQ(display(), "{}");
     EXPECT_EQ(log(), Trace);
 }
 
 TEST_F(LTEServingCellInfoTest, FirstOfTwoServingCellsCounts)
 {
-    deliverPropertyList(0xFF0001, List::make({ cell(4, kRKCellMonitorCellTypeNeighbor), cell(5), cell(6) }));
+    deliverPropertyList(0xFF0001, List::make({cell(4, kRKCellMonitorCellTypeNeighbor), cell(5), cell(6)}));
     EXPECT_EQ(shown("Cell Identity"), "\"5\"");
 }
 
@@ -137,7 +137,7 @@ TEST_F(LTEServingCellInfoTest, MissingTACIsLoggedAndTheOtherFourAreSet)
 {
     auto serving = cell(5);
     serving->remove(kRKCellMonitorTAC);
-    deliverPropertyList(0xFF0001, List::make({ serving }));
+    deliverPropertyList(0xFF0001, List::make({serving}));
     EXPECT_EQ(display(),
         "{\"Cell Identity\": \"5\", \"Physical Cell ID\": \"77\", \"Freq Band Indicator\": \"20\", "
         "\"UARFCN\": \"6300\"}");
@@ -147,10 +147,10 @@ TEST_F(LTEServingCellInfoTest, MissingTACIsLoggedAndTheOtherFourAreSet)
 TEST_F(LTEServingCellInfoTest, EachMissingKeyHasItsOwnLine)
 {
     deliverPropertyList(0xFF0001,
-        List::make({ Dictionary::make({
-            { std::string(kRKCellMonitorCellRadioAccessTechnology), kRKCellMonitorRadioAccessTechnologyLTE },
-            { std::string(kRKCellMonitorCellType), kRKCellMonitorCellTypeServing },
-        }) }));
+        List::make({Dictionary::make({
+            {std::string(kRKCellMonitorCellRadioAccessTechnology), kRKCellMonitorRadioAccessTechnologyLTE},
+            {std::string(kRKCellMonitorCellType), kRKCellMonitorCellTypeServing},
+        })}));
     EXPECT_EQ(display(), "{}");
     EXPECT_EQ(log(),
         std::string(Trace)
@@ -169,7 +169,7 @@ TEST_F(LTEServingCellInfoTest, OnlyWholeNumbersOf32BitsRead)
     serving->set(kRKCellMonitorPID, Value::real(9.0));
     serving->set(kRKCellMonitorBandInfo, Value::real(9.5));
     serving->set(kRKCellMonitorUARFCN, Value::integer(-5));
-    deliverPropertyList(0xFF0001, List::make({ serving }));
+    deliverPropertyList(0xFF0001, List::make({serving}));
     EXPECT_EQ(display(), "{\"Physical Cell ID\": \"9\", \"UARFCN\": \"-5\"}");
 }
 
@@ -177,7 +177,7 @@ TEST_F(LTEServingCellInfoTest, EntriesThatAreNoCellsAreSkipped)
 {
     auto typeless = cell(4);
     typeless->remove(kRKCellMonitorCellType);
-    deliverPropertyList(0xFF0001, List::make({ "text", Value::integer(1), List::make(), typeless, cell(5) }));
+    deliverPropertyList(0xFF0001, List::make({"text", Value::integer(1), List::make(), typeless, cell(5)}));
     EXPECT_EQ(shown("Cell Identity"), "\"5\"");
 }
 
@@ -191,7 +191,7 @@ TEST_F(LTEServingCellInfoTest, PayloadThatIsNoListHasNoCells)
 
 TEST_F(LTEServingCellInfoTest, PayloadThatDoesNotParseIsLoggedTwice)
 {
-    const Bytes garbage{ 'g', 'a', 'r' };
+    const Bytes garbage {'g', 'a', 'r'};
     deliver(0xFF0001, RecordBuilder::withPayload(0xFF0001, garbage));
     EXPECT_EQ(display(), "{}");
     EXPECT_EQ(log(),
@@ -200,7 +200,7 @@ TEST_F(LTEServingCellInfoTest, PayloadThatDoesNotParseIsLoggedTwice)
 
 TEST_F(LTEServingCellInfoTest, ServingCellAfterCellInformationShowsTheRawDownlinkChannel)
 {
-    deliverPropertyList(0xFF0001, List::make({ cell(5) }));
+    deliverPropertyList(0xFF0001, List::make({cell(5)}));
     deliver(0xB0C2, servingCell());
     EXPECT_EQ(shown("UARFCN"), "none");
     EXPECT_EQ(shown("Download Frequency"), "\"1300\"");

@@ -40,7 +40,7 @@ TEST_F(UTRANLogGeneratorTest, WithoutATemplateItAnswersEveryOperation)
 TEST_F(UTRANLogGeneratorTest, FirstPathWithUTRANInAnyCaseIsTheTemplate)
 {
     resources.lists["LTE"] = Dictionary::make();
-    resources.lists["My_utran2"] = Dictionary::make({ { "Chosen", "yes" } });
+    resources.lists["My_utran2"] = Dictionary::make({{"Chosen", "yes"}});
     const auto generator = UTRANLogGenerator::generator();
     EXPECT_NE(log.takeLogWith("<3>Created UTRANLogGenerator object\n"), "");
     generator->updateState(state, RecordBuilder(1, 13));

@@ -26,11 +26,11 @@ struct Outcome {
 /// Runs the action in a process of its own on a terminal of 20 by 4.
 Outcome runOnTerminal(const char* kind, const std::function<void()>& action)
 {
-    winsize size{ 4, 20, 0, 0 };
+    winsize size {4, 20, 0, 0};
     int master = -1;
     const pid_t child = ::forkpty(&master, nullptr, nullptr, &size);
     if (child == 0) {
-        const rlimit noCore{ 0, 0 };
+        const rlimit noCore {0, 0};
         ::setrlimit(RLIMIT_CORE, &noCore);
         ::setenv("TERM", kind, 1);
         ::setenv("LC_ALL", "C.UTF-8", 1);
@@ -56,7 +56,7 @@ std::unique_ptr<CursesTerminal> showText(std::string_view text)
         std::exit(1);
     }
     Grid grid(terminal->width(), terminal->height());
-    grid.put(0, 0, text, Style{ .tint = Tint::Accent });
+    grid.put(0, 0, text, Style {.tint = Tint::Accent});
     terminal->show(grid);
     return terminal;
 }
@@ -80,7 +80,7 @@ TEST(CursesTerminalTest, ShowsTheGridAndGivesTheTerminalBack)
 
 TEST(CursesTerminalTest, ACrashGivesTheTerminalBackAndStaysACrash)
 {
-    for (const int signal : { SIGSEGV, SIGABRT, SIGBUS, SIGFPE, SIGILL, SIGQUIT }) {
+    for (const int signal : {SIGSEGV, SIGABRT, SIGBUS, SIGFPE, SIGILL, SIGQUIT}) {
         const Outcome outcome = runOnTerminal("xterm", [signal] {
             std::signal(signal, SIG_DFL); // whatever a sanitizer has put there
             const auto terminal = showText("text");
@@ -123,7 +123,7 @@ TEST(CursesTerminalTest, AnUnknownTerminalIsRefusedWithItsName)
 TEST(SignalRelayTest, ASignalMakesTheFileReadableAndIsTakenOnce)
 {
     const SignalRelay relay;
-    pollfd readable{ relay.file(), POLLIN, 0 };
+    pollfd readable {relay.file(), POLLIN, 0};
     EXPECT_EQ(::poll(&readable, 1, 0), 0);
     ::raise(SIGWINCH);
     EXPECT_EQ(::poll(&readable, 1, 0), 1);

@@ -66,14 +66,14 @@ TEST(TerminalTextTest, MarksBeyondTheThirdAreLeftOut)
 {
     std::string_view text = "a\u0301\u0302\u0303\u0304\u0305z";
     const auto glyph = takeGlyph(text);
-    EXPECT_EQ(glyph->text, (std::array<char32_t, 4>{ U'a', 0x301, 0x302, 0x303 }));
+    EXPECT_EQ(glyph->text, (std::array<char32_t, 4> {U'a', 0x301, 0x302, 0x303}));
     EXPECT_EQ(text, "z");
 }
 
 TEST(TerminalTextTest, CharactersBecomeUTF8)
 {
     std::string text;
-    for (const char32_t character : { U'a', U'é', U'日', char32_t(0x1F600), char32_t(0xD800), char32_t(0x110000) })
+    for (const char32_t character : {U'a', U'é', U'日', char32_t(0x1F600), char32_t(0xD800), char32_t(0x110000)})
         appendUTF8(text, character);
     EXPECT_EQ(text, "aé日\xF0\x9F\x98\x80\uFFFD\uFFFD");
 }

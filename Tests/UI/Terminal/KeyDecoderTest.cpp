@@ -13,12 +13,12 @@ class KeyDecoderTest : public testing::Test {
 protected:
     void key(int code)
     {
-        decoder.feed({ true, static_cast<unsigned>(code) }, note);
+        decoder.feed({true, static_cast<unsigned>(code)}, note);
     }
     void characters(std::u32string_view text)
     {
         for (const char32_t character : text)
-            decoder.feed({ false, character }, note);
+            decoder.feed({false, character}, note);
     }
     void endOfInput()
     {
@@ -31,19 +31,18 @@ protected:
 
 TEST_F(KeyDecoderTest, FunctionKeysHaveNames)
 {
-    for (const int code : { KEY_UP, KEY_SLEFT, KEY_NPAGE, KEY_BACKSPACE, KEY_BTAB, KEY_F(5) })
+    for (const int code : {KEY_UP, KEY_SLEFT, KEY_NPAGE, KEY_BACKSPACE, KEY_BTAB, KEY_F(5)})
         key(code);
     EXPECT_EQ(events,
-        (std::vector<KeyEvent>{
-            { Key::Up }, { Key::ShiftLeft }, { Key::PageDown }, { Key::Backspace }, { Key::BackTab } }));
+        (std::vector<KeyEvent> {{Key::Up}, {Key::ShiftLeft}, {Key::PageDown}, {Key::Backspace}, {Key::BackTab}}));
 }
 
 TEST_F(KeyDecoderTest, CharactersComeAsTheyAre)
 {
     characters(U"q日\r\t\x7f\x15\f\x02");
     EXPECT_EQ(events,
-        (std::vector<KeyEvent>{ { Key::Character, U'q' }, { Key::Character, U'日' }, { Key::Enter }, { Key::Tab },
-            { Key::Backspace }, { Key::ClearLine }, { Key::Redraw } }));
+        (std::vector<KeyEvent> {{Key::Character, U'q'}, {Key::Character, U'日'}, {Key::Enter}, {Key::Tab},
+            {Key::Backspace}, {Key::ClearLine}, {Key::Redraw}}));
 }
 
 TEST_F(KeyDecoderTest, EscapeIsAKeyWhenNothingFollows)
@@ -52,14 +51,14 @@ TEST_F(KeyDecoderTest, EscapeIsAKeyWhenNothingFollows)
     EXPECT_TRUE(events.empty());
     endOfInput();
     endOfInput();
-    EXPECT_EQ(events, (std::vector<KeyEvent>{ { Key::Escape } }));
+    EXPECT_EQ(events, (std::vector<KeyEvent> {{Key::Escape}}));
 }
 
 TEST_F(KeyDecoderTest, AnUnknownSequenceIsSwallowedWhole)
 {
     characters(U"\x1b[1;7Dx\x1bOPy");
     endOfInput();
-    EXPECT_EQ(events, (std::vector<KeyEvent>{ { Key::Character, U'x' }, { Key::Character, U'y' } }));
+    EXPECT_EQ(events, (std::vector<KeyEvent> {{Key::Character, U'x'}, {Key::Character, U'y'}}));
 }
 
 TEST_F(KeyDecoderTest, EscapeAndAKeyAreTwoKeysHoweverFastTheyCome)
@@ -68,15 +67,14 @@ TEST_F(KeyDecoderTest, EscapeAndAKeyAreTwoKeysHoweverFastTheyCome)
     key(KEY_UP);
     endOfInput();
     EXPECT_EQ(events,
-        (std::vector<KeyEvent>{
-            { Key::Escape }, { Key::Character, U'q' }, { Key::Escape }, { Key::Escape }, { Key::Up } }));
+        (std::vector<KeyEvent> {{Key::Escape}, {Key::Character, U'q'}, {Key::Escape}, {Key::Escape}, {Key::Up}}));
 }
 
 TEST_F(KeyDecoderTest, TheMouseHasOneButtonAndAWheel)
 {
-    EXPECT_EQ(KeyDecoder::mouse(BUTTON1_PRESSED, 3, 4), (MouseEvent{ MouseEvent::Action::Press, 3, 4 }));
-    EXPECT_EQ(KeyDecoder::mouse(BUTTON4_PRESSED, 3, 4), (MouseEvent{ MouseEvent::Action::WheelUp, 3, 4 }));
-    EXPECT_EQ(KeyDecoder::mouse(BUTTON5_PRESSED, 3, 4), (MouseEvent{ MouseEvent::Action::WheelDown, 3, 4 }));
+    EXPECT_EQ(KeyDecoder::mouse(BUTTON1_PRESSED, 3, 4), (MouseEvent {MouseEvent::Action::Press, 3, 4}));
+    EXPECT_EQ(KeyDecoder::mouse(BUTTON4_PRESSED, 3, 4), (MouseEvent {MouseEvent::Action::WheelUp, 3, 4}));
+    EXPECT_EQ(KeyDecoder::mouse(BUTTON5_PRESSED, 3, 4), (MouseEvent {MouseEvent::Action::WheelDown, 3, 4}));
     EXPECT_EQ(KeyDecoder::mouse(BUTTON3_PRESSED, 3, 4), std::nullopt);
 }
 

@@ -10,7 +10,7 @@ class PaneViewTest : public TerminalFixture { };
 TEST_F(PaneViewTest, ARootPaneShowsTitleRowsAndStatus)
 {
     start();
-    show(entries({ { "Serving Cell Info", entries({}) }, { "State", "Idle" } }));
+    show(entries({{"Serving Cell Info", entries({})}, {"State", "Idle"}}));
     EXPECT_EQ(text(),
         " Spectrel                        ? help\n"
         " Serving Cell Info                     ›\n"
@@ -52,7 +52,7 @@ TEST_F(PaneViewTest, TheSpinnerRestsOnceThereIsADisplay)
 TEST_F(PaneViewTest, ALostSessionShowsItsReasonAfterTheStatus)
 {
     start();
-    show(entries({ { "State", "Idle" } }));
+    show(entries({{"State", "Idle"}}));
     screen.resize(60, 7);
     lose("Could not create RKServerConnection");
     EXPECT_EQ(line(6), " | Connecting...  Could not create RKServerConnection");
@@ -61,7 +61,7 @@ TEST_F(PaneViewTest, ALostSessionShowsItsReasonAfterTheStatus)
 TEST_F(PaneViewTest, EnterOpensAndBackspaceGoesBack)
 {
     start();
-    show(entries({ { "A", entries({ { "B", "1" } }) } }));
+    show(entries({{"A", entries({{"B", "1"}})}}));
     press(Key::Enter);
     EXPECT_EQ(line(0), "‹ A                                  /A");
     EXPECT_EQ(line(1), " B                                     1");
@@ -74,7 +74,7 @@ TEST_F(PaneViewTest, EnterOpensAndBackspaceGoesBack)
 TEST_F(PaneViewTest, RightOpensAndLeftAndEscapeGoBack)
 {
     start();
-    show(entries({ { "A", entries({ { "B", entries({}) } }) } }));
+    show(entries({{"A", entries({{"B", entries({})}})}}));
     press(Key::Right, 2);
     EXPECT_EQ(openPaths(), "/ /A /A/B ");
     press(Key::Left);
@@ -86,7 +86,7 @@ TEST_F(PaneViewTest, ThePathIsLeftOutWhereItDoesNotFit)
 {
     start();
     const std::string name(30, 'n');
-    show(entries({ { name, entries({}) } }));
+    show(entries({{name, entries({})}}));
     press(Key::Enter);
     EXPECT_EQ(line(0), "‹ " + name);
 }
@@ -119,7 +119,7 @@ TEST_F(PaneViewTest, ALongValueScrollsSidewaysInItsRow)
 {
     start();
     const std::string value = "0123456789abcdefghijklmnopqrstuvwxyz";
-    show(entries({ { "Key", value }, { "Other", "1" } }));
+    show(entries({{"Key", value}, {"Other", "1"}}));
     EXPECT_EQ(line(1), " Key     0123456789abcdefghijklmnopqrst…");
     press(Key::Right);
     EXPECT_EQ(line(1), "…" + value);
@@ -130,7 +130,7 @@ TEST_F(PaneViewTest, ALongValueScrollsSidewaysInItsRow)
 TEST_F(PaneViewTest, LeftScrollsBackBeforeItGoesBack)
 {
     start();
-    show(entries({ { "A", entries({ { "Key", std::string(50, 'x') } }) } }));
+    show(entries({{"A", entries({{"Key", std::string(50, 'x')}})}}));
     press(Key::Enter);
     const std::string before = line(1);
     press(Key::Right);
@@ -145,11 +145,11 @@ TEST_F(PaneViewTest, LeftScrollsBackBeforeItGoesBack)
 TEST_F(PaneViewTest, SidewaysScrollingStaysThroughAReload)
 {
     start();
-    show(entries({ { "Key", std::string(50, 'x') } }));
+    show(entries({{"Key", std::string(50, 'x')}}));
     line(1);
     type(U"l");
     const std::string scrolled = line(1);
-    show(entries({ { "Key", std::string(50, 'x') } }));
+    show(entries({{"Key", std::string(50, 'x')}}));
     EXPECT_EQ(line(1), scrolled);
     type(U"h");
     EXPECT_NE(line(1), scrolled);
@@ -169,9 +169,9 @@ TEST_F(PaneViewTest, CursorAndPlaceStayThroughReloads)
 TEST_F(PaneViewTest, TheCursorStaysWithItsRowWhenRowsComeAboveIt)
 {
     start();
-    show(entries({ { "a", "1" }, { "b", "2" } }));
+    show(entries({{"a", "1"}, {"b", "2"}}));
     press(Key::Down);
-    show(entries({ { "new", "0" }, { "a", "1" }, { "b", "2" } }));
+    show(entries({{"new", "0"}, {"a", "1"}, {"b", "2"}}));
     press(Key::Enter); // a leaf: nothing opens
     EXPECT_EQ(line(cursorLine()), " b                                     2");
 }
@@ -194,7 +194,7 @@ TEST_F(PaneViewTest, APanesPlaceIsKeptWhileAnotherIsOpenAbove)
 {
     start();
     auto display = numbered(10);
-    display->set("Inner", entries({ { "x", "1" } }));
+    display->set("Inner", entries({{"x", "1"}}));
     show(display);
     press(Key::End);
     press(Key::Enter);
@@ -208,9 +208,9 @@ TEST_F(PaneViewTest, APanesPlaceIsKeptWhileAnotherIsOpenAbove)
 TEST_F(PaneViewTest, APaneWhosePathVanishedGivesWayToTheOneBelow)
 {
     start();
-    show(entries({ { "A", entries({ { "B", "1" } }) } }));
+    show(entries({{"A", entries({{"B", "1"}})}}));
     press(Key::Enter);
-    show(entries({ { "C", "2" } }));
+    show(entries({{"C", "2"}}));
     EXPECT_EQ(line(0), " Spectrel                        ? help");
     EXPECT_EQ(line(1), " C                                     2");
 }
@@ -218,16 +218,16 @@ TEST_F(PaneViewTest, APaneWhosePathVanishedGivesWayToTheOneBelow)
 TEST_F(PaneViewTest, RowsAreUsedAgainOnScreenAsThePoolHandsThemOut)
 {
     start();
-    show(entries({ { "Inner", entries({}) } }));
+    show(entries({{"Inner", entries({})}}));
     EXPECT_EQ(line(1), " Inner                                 ›");
-    show(entries({ { "Leaf", "1" } }));
+    show(entries({{"Leaf", "1"}}));
     EXPECT_EQ(line(1), " Leaf"); // a row made for an inner node has no place for a value
 }
 
 TEST_F(PaneViewTest, AClickOnARowOpensItAndOneOnTheTitleGoesBack)
 {
     start();
-    show(entries({ { "Leaf", "1" }, { "A", entries({ { "x", "1" } }) } }));
+    show(entries({{"Leaf", "1"}, {"A", entries({{"x", "1"}})}}));
     click(5, 1);
     EXPECT_EQ(cursorLine(), 1);
     click(5, 4); // no row there
@@ -255,7 +255,7 @@ TEST_F(PaneViewTest, TheWheelScrollsWithTheCursorStayingInSight)
 TEST_F(PaneViewTest, AWiderWindowLaysTheRowsOutAgain)
 {
     start();
-    show(entries({ { "Key", "value" } }));
+    show(entries({{"Key", "value"}}));
     EXPECT_EQ(line(1), " Key                               value");
     screen.resize(20, 5);
     EXPECT_EQ(text(),
@@ -280,12 +280,12 @@ TEST_F(PaneViewTest, NoWindowIsTooSmall)
 {
     startAllowingSave();
     lose("a reason");
-    show(entries({ { "中文", entries({ { "Key", std::string(50, 'x') } }) }, { "b", "2" } }));
+    show(entries({{"中文", entries({{"Key", std::string(50, 'x')}})}, {"b", "2"}}));
     for (int height = 0; height < 5; ++height) {
         for (int width = 0; width < 12; ++width) {
             screen.resize(width, height);
             screen.draw();
-            for (const Key key : { Key::Down, Key::PageDown, Key::Up, Key::Enter, Key::Right, Key::Left, Key::Escape })
+            for (const Key key : {Key::Down, Key::PageDown, Key::Up, Key::Enter, Key::Right, Key::Left, Key::Escape})
                 press(key);
             for (int y = 0; y < height; ++y)
                 click(width / 2, y);
@@ -311,7 +311,7 @@ TEST_F(PaneViewTest, NoWindowIsTooSmall)
 TEST_F(PaneViewTest, WideCharactersTakeTwoColumnsAndKeepTheValueAtTheEdge)
 {
     start();
-    show(entries({ { "中文", "日本" }, { "e\u0301te\u0301", "x" } }));
+    show(entries({{"中文", "日本"}, {"e\u0301te\u0301", "x"}}));
     EXPECT_EQ(line(1), " 中文                               日本");
     EXPECT_EQ(line(2), " e\u0301te\u0301" + std::string(35, ' ') + "x");
 }
@@ -319,11 +319,11 @@ TEST_F(PaneViewTest, WideCharactersTakeTwoColumnsAndKeepTheValueAtTheEdge)
 TEST_F(PaneViewTest, NothingInANameOrValueReachesTheTerminalAsACommand)
 {
     start();
-    show(entries({ { "a\x1b[31m", "\a\x7f" },
-        { "b\xff\xc0",
+    show(entries({{"a\x1b[31m", "\a\x7f"},
+        {"b\xff\xc0",
             "\xc2\x9b"
-            "2J" },
-        { "c\u202Ed", "e\u200Bf" } }));
+            "2J"},
+        {"c\u202Ed", "e\u200Bf"}}));
     EXPECT_EQ(line(1), " a␛[31m                               ␇␡");
     EXPECT_EQ(line(2), " b\uFFFD\uFFFD                                 \uFFFD2J");
     EXPECT_EQ(line(3), " c\uFFFDd" + std::string(34, ' ') + "ef");
@@ -354,7 +354,7 @@ TEST_F(PaneViewTest, AClickOnTheSaveButtonOpensTheSaveScreen)
 TEST_F(PaneViewTest, QuestionMarkShowsTheKeysAndAnyKeyHidesThem)
 {
     start();
-    show(entries({ { "A", entries({}) } }));
+    show(entries({{"A", entries({})}}));
     screen.resize(60, 15);
     type(U"?");
     EXPECT_THAT(text(), testing::HasSubstr("Enter Right       open"));

@@ -10,7 +10,7 @@ protected:
         startAllowingSave();
         auto contents = List::make();
         for (int entry = 0; entry < count; ++entry)
-            contents->append(entries({ { "Description", "Snapshot (" + std::to_string(entry) + ")" } }));
+            contents->append(entries({{"Description", "Snapshot (" + std::to_string(entry) + ")"}}));
         model->saveContents = contents;
         show(numbered(3));
         type(U"s");

@@ -57,20 +57,20 @@ protected:
     void press(Key key, int times = 1)
     {
         for (; times > 0; --times)
-            screen.handle(KeyEvent{ key });
+            screen.handle(KeyEvent {key});
     }
     void type(std::u32string_view characters)
     {
         for (const char32_t character : characters)
-            screen.handle(KeyEvent{ Key::Character, character });
+            screen.handle(KeyEvent {Key::Character, character});
     }
     void click(int x, int y)
     {
-        screen.handle(MouseEvent{ MouseEvent::Action::Press, x, y });
+        screen.handle(MouseEvent {MouseEvent::Action::Press, x, y});
     }
     void wheel(MouseEvent::Action action)
     {
-        screen.handle(MouseEvent{ action, 1, 2 });
+        screen.handle(MouseEvent {action, 1, 2});
     }
     static DictionaryRef numbered(int count)
     {
@@ -82,7 +82,7 @@ protected:
 
     int drawings = 0; // asked for
     int quits = 0;
-    TerminalScreen screen{ [this] { ++drawings; }, [this] { ++quits; } };
+    TerminalScreen screen {[this] { ++drawings; }, [this] { ++quits; }};
 };
 
 } // namespace spectrel
