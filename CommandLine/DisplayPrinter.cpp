@@ -5,6 +5,7 @@
 
 #include <cstdio>
 #include <rapidjson/writer.h>
+#include <utility>
 
 namespace spectrel {
 
@@ -28,32 +29,11 @@ private:
     std::string& _out;
 };
 
-using JsonWriter = rapidjson::Writer<StringSink>;
-
-void writeText(JsonWriter& writer, std::string_view text)
+/// Appends a child's separator, and so begins every child but the first.
+void separate(bool& isFirst, std::string& out)
 {
-    writer.String(text.data(), static_cast<rapidjson::SizeType>(text.size()));
-}
-
-void writeValue(JsonWriter& writer, const Value& value)
-{
-    if (const auto* text = value.string()) {
-        writeText(writer, *text);
-    } else if (const auto& dictionary = value.dictionary()) {
-        writer.StartObject();
-        forEachDisplayChild(*dictionary, [&writer](std::string_view name, const Value& child) {
-            writer.Key(name.data(), static_cast<rapidjson::SizeType>(name.size()));
-            writeValue(writer, child);
-        });
-        writer.EndObject();
-    } else if (const auto& list = value.list()) {
-        writer.StartArray();
-        for (const Value& element : list->elements())
-            writeValue(writer, element);
-        writer.EndArray();
-    } else {
-        writeText(writer, UnknownText);
-    }
+    if (!std::exchange(isFirst, false))
+        out += ',';
 }
 
 void appendPlain(std::string_view text, std::string& out)
@@ -109,16 +89,33 @@ void appendTree(const Value& display, std::string& out)
 
 void appendJson(const Value& display, std::string& out)
 {
-    StringSink sink(out);
-    JsonWriter writer(sink);
-    writeValue(writer, display);
+    bool isFirst = true;
+    if (const auto& dictionary = display.dictionary()) {
+        out += '{';
+        forEachDisplayChild(*dictionary, [&](std::string_view name, const Value& child) {
+            separate(isFirst, out);
+            appendJsonText(name, out);
+            out += ':';
+            appendJson(child, out);
+        });
+        out += '}';
+    } else if (const auto& list = display.list()) {
+        out += '[';
+        for (const Value& element : list->elements()) {
+            separate(isFirst, out);
+            appendJson(element, out);
+        }
+        out += ']';
+    } else {
+        appendJsonText(display.string() ? std::string_view(*display.string()) : std::string_view(UnknownText), out);
+    }
 }
 
 void appendJsonText(std::string_view text, std::string& out)
 {
     StringSink sink(out);
-    JsonWriter writer(sink);
-    writeText(writer, text);
+    rapidjson::Writer<StringSink> writer(sink);
+    writer.String(text.data(), static_cast<rapidjson::SizeType>(text.size()));
 }
 
 } // namespace spectrel

@@ -1,6 +1,6 @@
 #include "Telephony/ReplaySource.h"
 
-#include <algorithm>
+#include <cmath>
 #include <cstdio>
 #include <utility>
 
@@ -76,9 +76,9 @@ private:
             _origin = _message->time;
             _startedAt = _clock.now();
         }
-        const std::chrono::duration<double> place = _message->time - *_origin;
-        const std::chrono::duration<double> played = _clock.now() - _startedAt;
-        return std::chrono::duration_cast<std::chrono::nanoseconds>(place / _options.speed - played);
+        const auto recorded = static_cast<double>((_message->time - *_origin).count());
+        const std::chrono::microseconds place(std::llround(recorded / _options.speed));
+        return place - (_clock.now() - _startedAt);
     }
 
     /// False at the end of all files.

@@ -16,7 +16,7 @@ bool containsUTRAN(const std::string& path)
 {
     constexpr std::string_view Wanted = "UTRAN";
     const auto same = [](char left, char right) { return std::toupper(static_cast<unsigned char>(left)) == right; };
-    return std::ranges::search(path, Wanted, same).begin() != path.end();
+    return std::search(path.begin(), path.end(), Wanted.begin(), Wanted.end(), same) != path.end();
 }
 
 } // namespace

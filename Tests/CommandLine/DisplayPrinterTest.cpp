@@ -31,7 +31,7 @@ TEST(DisplayPrinterTest, TreeIsIndentedInDisplayOrder)
 
 TEST(DisplayPrinterTest, JsonHasTheNamesAndTheOrderOfTheTree)
 {
-    EXPECT_EQ(json(Sorted), R"({"Up":["b","c"],"Down":"a"})");
+    EXPECT_EQ(json(Sorted), "{\"Up\":[\"b\",\"c\"],\"Down\":\"a\"}");
 }
 
 TEST(DisplayPrinterTest, AbsentDisplayIsUnknown)
@@ -42,8 +42,8 @@ TEST(DisplayPrinterTest, AbsentDisplayIsUnknown)
 
 TEST(DisplayPrinterTest, AnythingElseIsUnknown)
 {
-    EXPECT_EQ(json(List::make({ Value::integer(1), Value::boolean(true), Date{ 0 } })),
-        R"(["(unknown)","(unknown)","(unknown)"])");
+    const Value display = List::make({Value::integer(1), Value::boolean(true), Date {0}});
+    EXPECT_EQ(json(display), "[\"(unknown)\",\"(unknown)\",\"(unknown)\"]");
 }
 
 TEST(DisplayPrinterTest, ControlCharactersNeverReachTheTerminal)

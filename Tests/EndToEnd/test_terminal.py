@@ -100,13 +100,15 @@ class Terminal(Place):
     def test_signals_give_the_terminal_back(self):
         for name in ("TERM", "SEGV"):
             with self.subTest(signal=name):
+                self.socket = self.path(f"tmux-{name}")
+                self.addCleanup(self.tmux, "kill-server")
                 self.open("--terminal")
                 self.see("Connecting...")
                 subprocess.run(["pkill", f"-{name}", "-f", f"^{BIN}/spectrel --terminal"], env=self.environment)
                 self.see("status", "prompt%")
                 self.keys("echo still $((40 + 2))", "Enter")
                 self.see("still 42")
-                self.tmux("kill-server")
+                self.keys("exit", "Enter")
 
     def test_resize_draws_anew(self):
         self.replay(serving_cell(321))
