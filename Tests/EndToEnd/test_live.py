@@ -57,6 +57,13 @@ class Watch(Place):
         self.assertEqual(done.returncode, 0)
         self.assertIn("Connecting... (Could not create RKServerConnection)", done.stderr)
 
+    def test_flood_does_not_starve_the_refresh(self):
+        file = self.write("a.pcap", capture([serving_cell(number) for number in range(500)], step=0.001))
+        self.start_service("--replay", file, "--speed", "0", "--loop")
+        done = self.run_spectrel("watch", "--format", "json", "--count", "2")
+        self.assertEqual([list(display) for display in self.displays(done)],
+                         2 * [["Serving Cell Info", "SIM Info", "PDP Context Info"]])
+
     def test_several_programs_watch_at_once(self):
         self.start_service("--simulate", "lte")
         first = self.start_watch("--format", "json")
@@ -120,27 +127,40 @@ class OtherServices(Place):
         first, second = [json.loads(line)["Serving Cell Info"]["Physical Cell ID"] for line in done.stdout.splitlines()]
         self.assertLess(int(first), int(second))
 
-    def test_service_that_answers_garbage_is_told(self):
-        script = self.write("garbage.py", GARBAGE_SERVICE.encode())
+    def test_service_that_misbehaves_is_told_and_tried_again(self):
+        for answer, reason in (("peer.send(packet[:1] + b'\\3' + packet[2:12] + b'garbage')", "returns error: -11"),
+                               ("peers.append(peer)", "returns error: -2"),
+                               ("peer.close()", "returns error: -5")):
+            with self.subTest(answer=answer):
+                self.misbehave(answer, reason)
+
+    def misbehave(self, answer, reason):
+        script = self.write("service.py", MISBEHAVING_SERVICE.replace("ANSWER", answer).encode())
         process = subprocess.Popen([sys.executable, script, self.path("ports")], stdout=subprocess.PIPE, text=True)
         self.processes.append(process)
         process.stdout.readline()
         done = self.run_spectrel("watch", "--duration", "500ms")
         self.assertEqual(done.returncode, 0)
-        self.assertIn("Connecting... (_RKServerConnectionNetworkMonitorCreateLogChannel returns error", done.stderr)
+        self.assertIn("Connecting... (_RKServerConnectionNetworkMonitorCreateLogChannel " + reason, done.stderr)
+        process.kill()
+        process.wait()
 
 
-GARBAGE_SERVICE = """
+MISBEHAVING_SERVICE = """
 import os, socket, sys
-os.makedirs(sys.argv[1], mode=0o700)
+os.makedirs(sys.argv[1], mode=0o700, exist_ok=True)
+path = os.path.join(sys.argv[1], "org.spectrel.Telephony")
+if os.path.exists(path):
+    os.unlink(path)
 port = socket.socket(socket.AF_UNIX, socket.SOCK_SEQPACKET)
-port.bind(os.path.join(sys.argv[1], "org.spectrel.Telephony"))
+port.bind(path)
 port.listen()
 print("ready", flush=True)
+peers = []
 while True:
     peer, _ = port.accept()
     packet = peer.recv(300000)
-    peer.send(packet[:1] + b"\\3" + packet[2:12] + b"garbage")
+    ANSWER
 """
 
 
