@@ -23,7 +23,6 @@ enum class ChannelError : std::int32_t {
     MalformedRequest = 22, // no dictionary with a local port name
     NoSuchPort = 2, // nobody serves the local port
     TooManyChannels = 24,
-    MalformedReply = 74, // told by the program itself: the service answered nothing, or not a dictionary
 };
 
 /// Requests on a log channel, and every log message from it, have this id.

@@ -5,8 +5,8 @@
 #include "Platform/PropertyList.h"
 #include "Platform/TelephonyProtocol.h"
 #include "Telephony/Encoders/RecordWriter.h"
+#include "Telephony/Tell.h"
 
-#include <cstdio>
 #include <utility>
 
 namespace spectrel {
@@ -14,11 +14,6 @@ namespace spectrel {
 namespace {
 
 namespace Protocol = TelephonyProtocol;
-
-void tell(const std::string& line)
-{
-    std::fprintf(stderr, "spectrel-telephonyd: %s\n", line.c_str());
-}
 
 Bytes serialised(const Value& value)
 {

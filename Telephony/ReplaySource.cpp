@@ -1,7 +1,8 @@
 #include "Telephony/ReplaySource.h"
 
+#include "Telephony/Tell.h"
+
 #include <cmath>
-#include <cstdio>
 #include <utility>
 
 namespace spectrel {
@@ -10,11 +11,6 @@ namespace {
 
 /// Messages delivered in one turn of the run loop, so that other channels have theirs.
 constexpr int MessagesPerTurn = 64;
-
-void tell(const std::string& line)
-{
-    std::fprintf(stderr, "spectrel-telephonyd: %s\n", line.c_str());
-}
 
 } // namespace
 

@@ -2,6 +2,7 @@
 
 #include "Platform/Dictionary.h"
 #include "Platform/PropertyList.h"
+#include "Platform/TelephonyProtocol.h"
 
 #include <chrono>
 #include <utility>
@@ -9,6 +10,8 @@
 namespace spectrel {
 
 namespace {
+
+namespace Protocol = TelephonyProtocol;
 
 constexpr std::chrono::seconds Timeout {1};
 
@@ -21,11 +24,11 @@ LogChannelResult readAnswer(ByteView answer)
 {
     const auto list = parsePropertyList(answer);
     const DictionaryRef dictionary = list ? list->dictionary() : nullptr;
-    const auto error = dictionary ? (*dictionary)["Error"].int32() : std::nullopt;
+    const auto error = dictionary ? (*dictionary)[Protocol::ErrorKey].int32() : std::nullopt;
     if (!error)
         return failure(SocketTelephonyServer::UnreadableAnswer);
-    LogChannelResult result {(*dictionary)["Domain"].int32().value_or(0), *error, std::nullopt};
-    if (const std::string* const name = (*dictionary)["PortName"].string())
+    LogChannelResult result {(*dictionary)[Protocol::DomainKey].int32().value_or(0), *error, std::nullopt};
+    if (const std::string* const name = (*dictionary)[Protocol::PortNameKey].string())
         result.portName = *name;
     return result;
 }
@@ -39,13 +42,14 @@ public:
 
     LogChannelResult RKServerConnectionNetworkMonitorCreateLogChannel(std::string_view localPortName) override
     {
-        const auto request = serialisePropertyList(Dictionary::make({{"CreateLogChannel", localPortName}}));
+        const auto request =
+            serialisePropertyList(Dictionary::make({{std::string(Protocol::CreateLogChannelKey), localPortName}}));
         if (!request)
             return failure(static_cast<std::int32_t>(SendStatus::TransportError));
         const ByteView body(reinterpret_cast<const std::uint8_t*>(request->data()), request->size());
         std::optional<Bytes> answer;
         const auto status =
-            _port->sendRequest(SocketTelephonyServer::RequestId, body, Timeout, Timeout, ReplyMode::Wait, &answer);
+            _port->sendRequest(Protocol::CreateLogChannelId, body, Timeout, Timeout, ReplyMode::Wait, &answer);
         if (status != SendStatus::Success)
             return failure(static_cast<std::int32_t>(status));
         return answer ? readAnswer(*answer) : failure(SocketTelephonyServer::NoAnswer);
@@ -59,7 +63,7 @@ private:
 
 std::unique_ptr<TelephonyServerConnection> SocketTelephonyServer::RKServerConnectionCreate(NotificationHandler)
 {
-    auto port = _ports.createRemote(PortName);
+    auto port = _ports.createRemote(Protocol::ServicePort);
     return port ? std::make_unique<Connection>(std::move(port)) : nullptr;
 }
 

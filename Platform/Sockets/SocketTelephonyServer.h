@@ -7,13 +7,10 @@ namespace spectrel {
 
 /// The telephony service as a message port of a well-known name.
 ///
-/// A wish for a log channel is a request with id 1, answered within a second: {"CreateLogChannel": local port's name} →
-/// {"Error": integer, "Domain": integer, "PortName": string}. What goes wrong on the way has an error of its own below.
+/// TelephonyProtocol.h has what is said; an answer is waited for a second. What goes wrong on the way has an error of
+/// its own below.
 class SocketTelephonyServer final : public TelephonyServer {
 public:
-    static constexpr std::string_view PortName = "org.spectrel.Telephony";
-    static constexpr std::int32_t RequestId = 1;
-
     /// The domain of errors that this end found; the service's own errors come with the service's domain.
     static constexpr std::int32_t TransportDomain = -1;
     /// Errors -1 to -5 are the send status; these two follow.

@@ -2,9 +2,9 @@
 
 #include "Telephony/Encoders/LTERecords.h"
 #include "Telephony/Encoders/PropertyListRecords.h"
+#include "Telephony/Tell.h"
 
 #include <algorithm>
-#include <cstdio>
 #include <deque>
 
 namespace spectrel {
@@ -47,7 +47,7 @@ public:
         while (!_waiting.empty() && _sink.deliver(_waiting.front()))
             _waiting.pop_front();
         if (_waiting.empty() && _lost > 0) {
-            std::fprintf(stderr, "spectrel-telephonyd: a client was too slow and lost %zu messages\n", _lost);
+            tell("a client was too slow and lost " + std::to_string(_lost) + " messages");
             _lost = 0;
         }
     }

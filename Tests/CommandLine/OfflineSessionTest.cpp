@@ -4,6 +4,7 @@
 #include "Tests/Fakes/FakeResources.h"
 #include "Tests/Fakes/LogRecorder.h"
 #include "Tests/Fakes/RecordBuilder.h"
+#include "Tests/Fakes/ScratchFolder.h"
 
 #include <cstdlib>
 #include <filesystem>
@@ -18,14 +19,8 @@ class OfflineSessionTest : public testing::Test {
 protected:
     OfflineSessionTest()
     {
-        std::string pattern = testing::TempDir() + "offline-XXXXXX";
-        folder = ::mkdtemp(pattern.data());
         resources.lists["LTE"] = Dictionary::make({{"Serving Cell Info", Dictionary::make()}});
         session.useTechnology(Technology::LTE);
-    }
-    ~OfflineSessionTest() override
-    {
-        std::filesystem::remove_all(folder);
     }
     void applyAt(std::chrono::milliseconds offset)
     {
@@ -53,7 +48,8 @@ protected:
     const Bytes record = RecordBuilder(0xB0C2, 38).bytes();
     LogRecorder log;
     FakeResources resources;
-    std::string folder;
+    const ScratchFolder scratch;
+    const std::string folder = scratch.path().string();
     OfflineSession session {true};
 };
 

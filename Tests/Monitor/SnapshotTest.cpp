@@ -3,6 +3,7 @@
 #include "Platform/Dictionary.h"
 #include "Platform/PropertyList.h"
 #include "Tests/Fakes/DisplayText.h"
+#include "Tests/Fakes/ScratchFolder.h"
 
 #include <filesystem>
 #include <fstream>
@@ -16,16 +17,8 @@ constexpr Moment Opened {std::chrono::seconds(1'709'647'651)};
 
 class SnapshotTest : public testing::Test {
 protected:
-    SnapshotTest()
-    {
-        std::string pattern = testing::TempDir() + "snapshot-XXXXXX";
-        folder = ::mkdtemp(pattern.data());
-    }
-    ~SnapshotTest() override
-    {
-        std::filesystem::remove_all(folder);
-    }
-    std::string folder;
+    const ScratchFolder scratch;
+    const std::string folder = scratch.path().string();
     std::string reason;
 };
 

@@ -1,6 +1,6 @@
 #include "Platform/Recording.h"
+#include "Tests/Fakes/ScratchFolder.h"
 #include "Tests/Platform/RecordingText.h"
-#include "Tests/Platform/ScratchFolder.h"
 
 #include <algorithm>
 #include <gtest/gtest.h>

@@ -1,5 +1,5 @@
+#include "Tests/Fakes/ScratchFolder.h"
 #include "Tests/Platform/RecordingText.h"
-#include "Tests/Platform/ScratchFolder.h"
 
 #include <algorithm>
 #include <gtest/gtest.h>

@@ -1,5 +1,5 @@
 #include "Platform/Syslog/FileLog.h"
-#include "Tests/Platform/ScratchFolder.h"
+#include "Tests/Fakes/ScratchFolder.h"
 
 #include <fstream>
 #include <gmock/gmock.h>

@@ -3,7 +3,7 @@
 #include "Platform/Qt/QtRunLoop.h"
 #include "Platform/Sockets/SocketMessagePorts.h"
 #include "Tests/Fakes/LogRecorder.h"
-#include "Tests/Platform/ScratchFolder.h"
+#include "Tests/Fakes/ScratchFolder.h"
 
 #include <chrono>
 #include <gmock/gmock.h>

@@ -1,6 +1,6 @@
 #include "Platform/Sockets/PortName.h"
 #include "Tests/Fakes/LogRecorder.h"
-#include "Tests/Platform/ScratchFolder.h"
+#include "Tests/Fakes/ScratchFolder.h"
 
 #include <filesystem>
 #include <gmock/gmock.h>

@@ -1,7 +1,7 @@
 #include "Platform/PropertyList.h"
 
 #include "Platform/Dictionary.h"
-#include "Tests/Platform/ScratchFolder.h"
+#include "Tests/Fakes/ScratchFolder.h"
 #include "Tests/Platform/ValueText.h"
 
 #include <gtest/gtest.h>

@@ -1,7 +1,7 @@
 #include "Platform/Dictionary.h"
 #include "Platform/List.h"
 #include "Platform/PropertyList.h"
-#include "Tests/Platform/ScratchFolder.h"
+#include "Tests/Fakes/ScratchFolder.h"
 #include "Tests/Platform/ValueText.h"
 
 #include <bit>

@@ -1,6 +1,6 @@
 #include "Platform/Qt/QtPreferences.h"
 #include "Platform/Qt/QtRunLoop.h"
-#include "Tests/Platform/ScratchFolder.h"
+#include "Tests/Fakes/ScratchFolder.h"
 
 #include <QDBusConnection>
 #include <QDBusMessage>

@@ -1,8 +1,8 @@
 #include "Platform/Dictionary.h"
 #include "Platform/List.h"
 #include "Platform/PropertyList.h"
+#include "Tests/Fakes/ScratchFolder.h"
 #include "Tests/Platform/RecordingText.h"
-#include "Tests/Platform/ScratchFolder.h"
 
 #include <algorithm>
 #include <gtest/gtest.h>

@@ -11,6 +11,7 @@
 #include "Tests/Fakes/FakeMessagePorts.h"
 #include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Fakes/RecordBuilder.h"
+#include "Tests/Fakes/ScratchFolder.h"
 
 #include <algorithm>
 #include <cstdlib>
@@ -292,15 +293,6 @@ TEST_F(SimulatorSourceTest, BusyClientLosesNothingOnceItTakesAgain)
 
 class ReplaySourceTest : public testing::Test {
 protected:
-    ReplaySourceTest()
-    {
-        std::string pattern = testing::TempDir() + "replay-XXXXXX";
-        folder = ::mkdtemp(pattern.data());
-    }
-    ~ReplaySourceTest() override
-    {
-        std::filesystem::remove_all(folder);
-    }
     std::string recordingOf(int count, Technology technology = Technology::LTE)
     {
         std::string path = folder + "/" + std::to_string(++_files) + ".pcap";
@@ -318,7 +310,8 @@ protected:
 
     FakeRunLoop loop;
     Collector collector;
-    std::string folder;
+    const ScratchFolder scratch;
+    const std::string folder = scratch.path().string();
     std::string reason;
 
 private:

@@ -6,6 +6,7 @@
 #include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Fakes/FakeToolkit.h"
 #include "Tests/Fakes/LogRecorder.h"
+#include "Tests/Fakes/ScratchFolder.h"
 #include "Tests/UI/FakeModel.h"
 #include "UI/SpectrelApp.h"
 #include "UI/SpectrelCell.h"
@@ -29,24 +30,21 @@ class DeviceRoot {
 public:
     DeviceRoot()
     {
-        std::string pattern = (std::filesystem::temp_directory_path() / "spectrel-device-XXXXXX").string();
-        _path = ::mkdtemp(pattern.data());
-        ::setenv("SPECTREL_DEVICE_ROOT", _path.c_str(), 1);
+        ::setenv("SPECTREL_DEVICE_ROOT", _folder.path().c_str(), 1);
     }
     ~DeviceRoot()
     {
         ::unsetenv("SPECTREL_DEVICE_ROOT");
-        std::filesystem::remove_all(_path);
     }
     DeviceRoot(const DeviceRoot&) = delete;
     DeviceRoot& operator=(const DeviceRoot&) = delete;
     void addMarker() const
     {
-        std::filesystem::create_directories(_path + SpectrelApp::SaveMarker);
+        std::filesystem::create_directories(_folder.path().string() + SpectrelApp::SaveMarker);
     }
 
 private:
-    std::string _path;
+    ScratchFolder _folder;
 };
 
 /// One save as the writer was asked for it.

@@ -1,0 +1,10 @@
+#pragma once
+
+#include <string>
+
+namespace spectrel {
+
+/// "spectrel-telephonyd: LINE" on standard error.
+void tell(const std::string& line);
+
+} // namespace spectrel
