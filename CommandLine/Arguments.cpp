@@ -1,10 +1,8 @@
 #include "CommandLine/Arguments.h"
 
+#include "CommandLine/OptionTypes.h"
+
 #include <CLI/CLI.hpp>
-#include <array>
-#include <charconv>
-#include <cmath>
-#include <cstdio>
 #include <iostream>
 
 namespace spectrel {
@@ -28,18 +26,6 @@ const CLI::Validator IsFormat(
         return outputFormatNamed(name) ? std::string() : "'" + name + "' is not one of tree, json, changes, csv, none";
     },
     "tree|json|changes|csv|none");
-
-const CLI::Validator IsTechnology(
-    [](std::string& name) {
-        return technologyNamed(name) ? std::string() : "'" + name + "' is not one of ifx, gsm, cdma, lte, utran";
-    },
-    "ifx|gsm|cdma|lte|utran");
-
-const CLI::Validator IsDuration(
-    [](std::string& text) {
-        return parseDuration(text) ? std::string() : "'" + text + "' is no time such as 30s, 5m, 2h or 500ms";
-    },
-    "TIME");
 
 template <typename Set> void addFormat(CLI::App* command, Set set)
 {
@@ -109,22 +95,6 @@ void addRecord(CLI::App& program, Arguments& arguments)
 }
 
 } // namespace
-
-std::optional<std::chrono::milliseconds> parseDuration(std::string_view text)
-{
-    static constexpr std::array<std::pair<std::string_view, double>, 5> Units {
-        {{"ms", 1.0}, {"s", 1e3}, {"m", 60e3}, {"h", 3600e3}, {"", 1e3}}};
-    const std::size_t digits = std::min(text.find_first_not_of("0123456789."), text.size());
-    double number = 0;
-    const auto result = std::from_chars(text.data(), text.data() + digits, number);
-    if (digits == 0 || result.ec != std::errc() || result.ptr != text.data() + digits)
-        return std::nullopt;
-    for (const auto& [unit, milliseconds] : Units) {
-        if (text.substr(digits) == unit && number * milliseconds >= 1 && number * milliseconds < 1e12)
-            return std::chrono::milliseconds(std::llround(number * milliseconds));
-    }
-    return std::nullopt;
-}
 
 std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
 {

@@ -39,7 +39,4 @@ inline constexpr int WrongUsage = 2;
 /// each told on the stream where it belongs.
 std::optional<int> readArguments(int argc, char** argv, Arguments& arguments);
 
-/// "30", "30s", "1.5m", "2h", "500ms"; none for anything else.
-std::optional<std::chrono::milliseconds> parseDuration(std::string_view text);
-
 } // namespace spectrel

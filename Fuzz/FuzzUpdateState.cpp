@@ -1,10 +1,12 @@
-// One inbound message body, as the message port delivers it, applied to an LTE display; then a refresh.
+// One inbound message body, as the message port delivers it, applied to a technology's display; then a refresh.
 
+#include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/Template/ArrayOutOfBoundsException.h"
 #include "LogGenerator/Template/PropertyListReaders.h"
 #include "Monitor/SpectrelModelNode.h"
+#include "Platform/Dictionary.h"
+#include "Platform/Recording.h"
 #include "Platform/Resources.h"
-#include "Sections/LTE/LTELogGenerator.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -15,7 +17,8 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t siz
     static const DirectoryResources resources(SPECTREL_SOURCE_DIR "/Resources");
     Resources::install(&resources);
 
-    const auto generator = LTELogGenerator::generator();
+    const auto technology = technologyConstant(*technologyNamed(SPECTREL_FUZZ_TECHNOLOGY));
+    const auto generator = LogGenerator::generatorFromTechnology(Value(technology));
     Dictionary state;
     try {
         generator->updateState(state, {bytes, size});

@@ -6,36 +6,51 @@ namespace spectrel {
 
 namespace {
 
-std::uint32_t read(RecordView record, const Field& field)
+/// The bytes that the field touches, as few as can be.
+std::uint32_t bytesOf(RecordView record, Width width, std::size_t offset)
 {
-    switch (field.width) {
-    case Width::U8:
-        return record.u8(field.offset);
-    case Width::U16:
-        return record.u16(field.offset);
-    case Width::U32:
-        return record.u32(field.offset);
+    const unsigned end = width.first + width.count;
+    if (end <= 8)
+        return record.u8(offset);
+    return end <= 16 ? record.u16(offset) : record.u32(offset);
+}
+
+void storeInto(Dictionary& dictionary, RecordView record, std::span<const Field> fields, std::size_t start)
+{
+    TextBuffer buffer;
+    for (const Field& field : fields) {
+        buffer.clear();
+        dictionary.setText(field.key, field.format(fieldValue(record, field, start), buffer));
     }
-    return 0;
 }
 
 } // namespace
+
+std::uint32_t fieldValue(RecordView record, const Field& field, std::size_t start)
+{
+    const auto [first, count, isSigned] = field.width;
+    // Upwards until the last bit stands at the top, and back down: with copies of it, where it is a sign.
+    const std::uint32_t atTop = bytesOf(record, field.width, start + field.offset) << (32 - first - count);
+    return isSigned ? static_cast<std::uint32_t>(static_cast<std::int32_t>(atTop) >> (32 - count))
+                    : atTop >> (32 - count);
+}
 
 std::string_view decimal(std::uint32_t value, TextBuffer& buffer)
 {
     return buffer.decimal(static_cast<std::int32_t>(value)).view();
 }
 
-void storeFields(RecordView record, std::span<const Field> fields, const Value& sectionRef)
+void storeFields(RecordView record, std::span<const Field> fields, const Value& sectionRef, std::size_t start)
 {
-    Dictionary* section = sectionRef.dictionary().get();
-    if (!section)
-        return;
-    TextBuffer buffer;
-    for (const Field& field : fields) {
-        buffer.clear();
-        section->setText(field.key, field.format(read(record, field), buffer));
-    }
+    if (const auto& section = sectionRef.dictionary())
+        storeInto(*section, record, fields, start);
+}
+
+DictionaryRef entryWithFields(RecordView record, std::span<const Field> fields, std::size_t start)
+{
+    auto entry = std::make_shared<Dictionary>();
+    storeInto(*entry, record, fields, start);
+    return entry;
 }
 
 } // namespace spectrel

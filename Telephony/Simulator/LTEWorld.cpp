@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <array>
-#include <cmath>
 
 namespace spectrel {
 
@@ -23,29 +22,15 @@ struct Layer {
 /// Carriers of one network; each site has the first and some have another.
 constexpr std::array<Layer, 3> Layers {{{3, 1300, 100, 18}, {20, 6300, 50, 19}, {7, 3350, 75, 15}}};
 
-/// Distance on the ring.
-double alongRing(double from, double to)
-{
-    const double direct = std::fabs(from - to);
-    return std::min(direct, RoadLength - direct);
-}
-
-/// Path loss in dB at a distance in metres (3GPP TR 36.942, macro cell, urban: 128.1 + 37.6 lg(d/km)).
-double pathLoss(double metres)
-{
-    return 128.1 + 37.6 * std::log10(std::max(metres, 35.0) / 1000);
-}
-
 } // namespace
 
-LTEWorld::LTEWorld(std::uint32_t seed)
-    : _random(seed)
+LTEWorld::LTEWorld(Scene scene, std::uint32_t seed)
+    : _dice(seed)
+    , _journey(scene, RoadLength, _dice)
 {
     buildRoad();
-    _shadowing.resize(_cells.size());
-    for (double& decibels : _shadowing)
-        decibels = random(-4, 4);
-    _position = random(0, RoadLength);
+    for (std::size_t cell = 0; cell < _cells.size(); ++cell)
+        _shadowing.emplace_back(_dice);
     measure();
     const auto strongest =
         std::ranges::max_element(_cells, [](const LTECell& a, const LTECell& b) { return a.rsrp < b.rsrp; });
@@ -53,30 +38,24 @@ LTEWorld::LTEWorld(std::uint32_t seed)
     _candidate = _serving;
 }
 
-/// The generator's raw numbers, so that every library draws the same drive.
-double LTEWorld::random(double from, double to)
-{
-    return from + (to - from) * static_cast<double>(_random()) / static_cast<double>(std::mt19937::max());
-}
-
 void LTEWorld::buildRoad()
 {
     std::uint32_t site = 4096;
     for (double position = 0; position < RoadLength; position += SiteDistance, ++site) {
         for (std::size_t layer = 0; layer < Layers.size(); ++layer) {
-            if (layer > 0 && random(0, 1) < 0.5)
+            if (layer > 0 && _dice.between(0, 1) < 0.5)
                 continue;
             LTECell cell;
             cell.identity = site << 8 | static_cast<std::uint32_t>(layer + 1);
-            cell.physicalCellId = static_cast<std::uint16_t>(_random() % 504);
+            cell.physicalCellId = static_cast<std::uint16_t>(_dice.below(504));
             cell.band = Layers[layer].band;
             cell.downlinkChannel = Layers[layer].downlinkChannel;
             cell.uplinkChannel = static_cast<std::uint16_t>(cell.downlinkChannel + 18000);
             cell.resourceBlocks = Layers[layer].resourceBlocks;
             cell.antennas = layer == 0 ? 4 : 2;
             cell.trackingArea = static_cast<std::uint16_t>(position < RoadLength / 2 ? 1201 : 1202);
-            cell.position = position + random(-60, 60);
-            cell.offset = random(30, 120);
+            cell.position = position + _dice.between(-60, 60);
+            cell.offset = _dice.between(30, 120);
             cell.power = Layers[layer].power;
             _cells.push_back(cell);
         }
@@ -86,24 +65,22 @@ void LTEWorld::buildRoad()
 void LTEWorld::advance(std::chrono::milliseconds step)
 {
     const double seconds = std::chrono::duration<double>(step).count();
-    _speed = std::clamp(_speed + random(-1, 1) * seconds, 6.0, 22.0);
-    _position = std::fmod(_position + _speed * seconds, RoadLength);
-    for (double& decibels : _shadowing)
-        decibels = std::clamp(decibels + random(-1, 1) * std::sqrt(seconds), -6.0, 6.0);
+    _journey.advance(step, _dice);
+    for (Shadowing& shadowing : _shadowing)
+        shadowing.advance(step, _dice);
     measure();
     reselect(step);
     const double quality = std::clamp((servingCell().rsrp + 115) / 45, 0.02, 1.0);
-    _received += 2.5e6 * quality * seconds * random(0.2, 1);
-    _sent += 2.0e5 * quality * seconds * random(0.2, 1);
+    _received += 2.5e6 * quality * seconds * _dice.between(0.2, 1);
+    _sent += 2.0e5 * quality * seconds * _dice.between(0.2, 1);
 }
 
 void LTEWorld::measure()
 {
     for (std::size_t index = 0; index < _cells.size(); ++index) {
         LTECell& cell = _cells[index];
-        const double metres = std::hypot(alongRing(_position, cell.position), cell.offset);
-        const double shadowing = index < _shadowing.size() ? _shadowing[index] : 0;
-        cell.rsrp = std::clamp(cell.power - pathLoss(metres) + shadowing, -140.0, -44.0);
+        const double loss = pathLoss(_journey.distanceTo(cell.position, cell.offset));
+        cell.rsrp = std::clamp(cell.power - loss + _shadowing[index].decibels(), -140.0, -44.0);
     }
 }
 

@@ -1,8 +1,9 @@
 #pragma once
 
+#include "Telephony/Simulator/Radio.h"
+
 #include <chrono>
 #include <cstdint>
-#include <random>
 #include <vector>
 
 namespace spectrel {
@@ -28,7 +29,7 @@ struct LTECell {
 /// The same seed gives the same drive.
 class LTEWorld {
 public:
-    explicit LTEWorld(std::uint32_t seed);
+    LTEWorld(Scene scene, std::uint32_t seed);
 
     void advance(std::chrono::milliseconds step);
 
@@ -51,16 +52,14 @@ private:
     void buildRoad();
     void measure();
     void reselect(std::chrono::milliseconds step);
-    double random(double from, double to);
 
-    std::mt19937 _random;
+    Dice _dice;
+    Journey _journey;
     std::vector<LTECell> _cells;
-    std::vector<double> _shadowing; // dB, one for each cell, wandering slowly
+    std::vector<Shadowing> _shadowing; // one for each cell
     std::size_t _serving = 0;
     std::size_t _candidate = 0; // better than the serving cell
     std::chrono::milliseconds _candidateFor {0};
-    double _position = 0; // metres along the road, which is a ring
-    double _speed = 14; // metres a second
     double _received = 0;
     double _sent = 0;
 };

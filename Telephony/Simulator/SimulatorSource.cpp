@@ -1,7 +1,5 @@
 #include "Telephony/Simulator/SimulatorSource.h"
 
-#include "Telephony/Encoders/LTERecords.h"
-#include "Telephony/Encoders/PropertyListRecords.h"
 #include "Telephony/Tell.h"
 
 #include <algorithm>
@@ -10,8 +8,6 @@
 namespace spectrel {
 
 namespace {
-
-constexpr std::chrono::milliseconds Step {100};
 
 /// Live messages wait for a client that is busy; beyond this many the oldest go, and the loss is told.
 constexpr std::size_t LongestQueue = 4096;
@@ -59,28 +55,11 @@ private:
     std::size_t _lost = 0;
 };
 
-const std::vector<SimulatorSource::Cadence>& SimulatorSource::cadences()
-{
-    using namespace std::chrono_literals;
-    static const std::vector<Cadence> All {
-        {10s, true, [](const LTEWorld&, Moment time) { return simFilesRecord(time); }},
-        {2s, true, [](const LTEWorld& world, Moment time) { return lteCellInformationRecord(world, time); }},
-        {1s, true,
-            [](const LTEWorld& world, Moment time) {
-                return contextsRecord(world.bytesReceived(), world.bytesSent(), time);
-            }},
-        {400ms, false,
-            [](const LTEWorld& world, Moment time) { return lteServingCellRecord(world.servingCell(), time); }},
-        {800ms, false, [](const LTEWorld& world, Moment time) { return lteAntennasRecord(world.servingCell(), time); }},
-    };
-    return All;
-}
-
-SimulatorSource::SimulatorSource(RunLoop& runLoop, const Clock& clock, std::uint32_t seed, double rate)
+SimulatorSource::SimulatorSource(RunLoop& runLoop, const Clock& clock, std::unique_ptr<Baseband> baseband, double rate)
     : _runLoop(runLoop)
     , _clock(clock)
+    , _baseband(std::move(baseband))
     , _rate(rate)
-    , _world(seed)
 {
 }
 
@@ -89,13 +68,10 @@ SimulatorSource::~SimulatorSource() = default;
 std::unique_ptr<LogStream> SimulatorSource::start(MessageSink& sink)
 {
     auto stream = std::make_unique<Stream>(*this, sink);
-    for (const Cadence& cadence : cadences()) {
-        if (cadence.atStart)
-            stream->send(cadence.make(_world, _clock.now()));
-    }
+    _baseband->greet(_clock.now(), [&stream](ByteView record) { stream->send(record); });
     _streams.push_back(stream.get());
     if (!_timer)
-        _timer = _runLoop.repeat(Step, [this] { tick(); });
+        _timer = _runLoop.repeat(Baseband::Step, [this] { tick(); });
     return stream;
 }
 
@@ -108,20 +84,9 @@ void SimulatorSource::remove(Stream& stream)
 
 void SimulatorSource::tick()
 {
-    _owed += static_cast<double>(Step.count()) * _rate;
-    for (; _owed >= static_cast<double>(Step.count()); _owed -= static_cast<double>(Step.count()))
-        step();
-}
-
-void SimulatorSource::step()
-{
-    _world.advance(Step);
-    _elapsed += Step;
-    const Moment now = _clock.now();
-    for (const Cadence& cadence : cadences()) {
-        if (_elapsed % cadence.interval == std::chrono::milliseconds::zero())
-            send(cadence.make(_world, now));
-    }
+    constexpr double StepLength = Baseband::Step.count();
+    for (_owed += StepLength * _rate; _owed >= StepLength; _owed -= StepLength)
+        _baseband->advance(_clock.now(), [this](ByteView record) { send(record); });
 }
 
 void SimulatorSource::send(ByteView record)

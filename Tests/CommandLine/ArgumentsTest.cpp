@@ -1,5 +1,7 @@
 #include "CommandLine/Arguments.h"
 
+#include "CommandLine/OptionTypes.h"
+
 #include <gtest/gtest.h>
 
 namespace spectrel {

@@ -2,10 +2,14 @@
 
 A mismatch writes NAME.FORMAT.fail and shows the difference. After reading it, accept the new output with
     SPECTREL_BIN_DIR=build/dev/bin python3 Tests/EndToEnd/test_golden.py --accept
+
+NAME.changes may stand there compressed, as NAME.changes.gz. A new recording is made with
+    spectrel-telephonyd --simulate TECH --seed N --write Tests/Golden/NAME.pcap --duration 5m
 """
 
 import difflib
 import glob
+import gzip
 import os
 import sys
 import unittest
@@ -14,6 +18,26 @@ from harness import Place
 
 GOLDEN = os.path.join(os.path.dirname(os.path.abspath(__file__)), "..", "Golden")
 FORMATS = ("json", "changes", "tree")
+LONG = 200_000
+
+
+def read(path):
+    """The text of a file that may stand there compressed."""
+    if os.path.exists(path + ".gz"):
+        with gzip.open(path + ".gz", "rt", encoding="utf-8") as file:
+            return file.read()
+    with open(path, encoding="utf-8") as file:
+        return file.read()
+
+
+def write(path, text):
+    """Writes the file as it stands there; a long new one compressed."""
+    if os.path.exists(path + ".gz") or len(text) > LONG and not os.path.exists(path):
+        with open(path + ".gz", "wb") as file:
+            file.write(gzip.compress(text.encode(), mtime=0))
+    else:
+        with open(path, "w", encoding="utf-8") as file:
+            file.write(text)
 
 
 class Golden(Place):
@@ -32,10 +56,8 @@ class Golden(Place):
         self.assertEqual(done.returncode, 0, done.stderr)
         beside = recording.removesuffix(".pcap") + "." + form
         if self.accepting:
-            with open(beside, "w", encoding="utf-8") as file:
-                file.write(done.stdout)
-        with open(beside, encoding="utf-8") as file:
-            expected = file.read()
+            write(beside, done.stdout)
+        expected = read(beside)
         if done.stdout != expected:
             with open(beside + ".fail", "w", encoding="utf-8") as file:
                 file.write(done.stdout)

@@ -11,7 +11,7 @@ using namespace std::chrono_literals;
 
 std::string drive(std::uint32_t seed, int steps)
 {
-    LTEWorld world(seed);
+    LTEWorld world(Scene::Drive, seed);
     std::string text;
     for (int step = 0; step < steps; ++step) {
         world.advance(100ms);
@@ -28,7 +28,7 @@ TEST(LTEWorldTest, SameSeedGivesTheSameDrive)
 
 TEST(LTEWorldTest, DrivePassesSeveralCells)
 {
-    LTEWorld world(1);
+    LTEWorld world(Scene::Drive, 1);
     std::set<std::uint32_t> cells;
     for (int step = 0; step < 3000; ++step) {
         world.advance(100ms);
@@ -39,7 +39,7 @@ TEST(LTEWorldTest, DrivePassesSeveralCells)
 
 TEST(LTEWorldTest, ValuesBelongTogether)
 {
-    LTEWorld world(3);
+    LTEWorld world(Scene::Drive, 3);
     for (int step = 0; step < 3000; ++step) {
         world.advance(100ms);
         const LTECell& cell = world.servingCell();
@@ -56,7 +56,7 @@ TEST(LTEWorldTest, ValuesBelongTogether)
 
 TEST(LTEWorldTest, TransferOnlyGrows)
 {
-    LTEWorld world(3);
+    LTEWorld world(Scene::Drive, 3);
     std::uint64_t received = 0;
     for (int step = 0; step < 100; ++step) {
         world.advance(100ms);

@@ -68,7 +68,7 @@ TEST(RecordWriterTest, AntennasRecordHasTheAntennasAtOffset20)
 
 TEST(RecordWriterTest, CellInformationTellsTheServingCellFirst)
 {
-    const LTEWorld world(1);
+    const LTEWorld world(Scene::Drive, 1);
     const Bytes record = lteCellInformationRecord(world, Epoch1980);
     const auto cells = parsePropertyList(ByteView(record).subspan(13));
     ASSERT_TRUE(cells && cells->list());

@@ -237,7 +237,7 @@ public:
 class SimulatorSourceTest : public testing::Test {
 protected:
     FakeRunLoop loop;
-    SimulatorSource source {loop, loop, 1, 1};
+    SimulatorSource source {loop, loop, makeBaseband(Technology::LTE, Scene::Drive, 1), 1};
     Collector collector;
 };
 

@@ -1,0 +1,22 @@
+#include "Telephony/Simulator/Baseband.h"
+
+namespace spectrel {
+
+std::unique_ptr<Baseband> makeBaseband(Technology technology, Scene scene, std::uint32_t seed)
+{
+    switch (technology) {
+    case Technology::IFX:
+        return nullptr;
+    case Technology::GSM:
+        return nullptr;
+    case Technology::CDMA:
+        return nullptr;
+    case Technology::LTE:
+        return makeLTEBaseband(scene, seed);
+    case Technology::UTRAN:
+        return nullptr;
+    }
+    return nullptr;
+}
+
+} // namespace spectrel

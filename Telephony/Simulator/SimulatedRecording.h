@@ -1,0 +1,19 @@
+#pragma once
+
+#include "Telephony/Simulator/Baseband.h"
+
+#include <chrono>
+#include <string>
+
+namespace spectrel {
+
+/// The moment at which every simulated recording begins, so that the same options give the same bytes:
+/// 2026-01-01 08:00:00 UTC.
+constexpr Moment SimulatedRecordingStart {std::chrono::seconds(1767254400)};
+
+/// Writes as much of the baseband's life into a capture file as `duration` says, without waiting. False when the file
+/// cannot be written, with `reason` telling why (without its name).
+bool writeSimulatedRecording(
+    Baseband& baseband, const std::string& path, std::chrono::milliseconds duration, std::string& reason);
+
+} // namespace spectrel

@@ -1,0 +1,59 @@
+#include "Telephony/Simulator/Radio.h"
+
+#include <cmath>
+#include <gtest/gtest.h>
+
+namespace spectrel {
+namespace {
+
+using namespace std::chrono_literals;
+
+constexpr double RingLength = 6000;
+
+double covered(Scene scene)
+{
+    Dice dice(1);
+    Journey journey(scene, RingLength, dice);
+    const double before = journey.distanceTo(0, 0);
+    for (int step = 0; step < 100; ++step)
+        journey.advance(100ms, dice);
+    return std::fabs(journey.distanceTo(0, 0) - before);
+}
+
+TEST(JourneyTest, ScenesDifferInPace)
+{
+    EXPECT_EQ(covered(Scene::Still), 0);
+    EXPECT_GT(covered(Scene::Walk), 5);
+    EXPECT_LT(covered(Scene::Walk), 25);
+    EXPECT_GT(covered(Scene::Drive), 50);
+    EXPECT_GT(covered(Scene::Stress), 250);
+}
+
+TEST(JourneyTest, RoadIsARing)
+{
+    Dice dice(2);
+    Journey journey(Scene::Stress, RingLength, dice);
+    for (int step = 0; step < 5000; ++step) {
+        journey.advance(100ms, dice);
+        EXPECT_LE(journey.distanceTo(0, 0), RingLength / 2);
+    }
+}
+
+TEST(SceneTest, NamesAreThoseOfTheCommandLine)
+{
+    Scene scene = Scene::Drive;
+    EXPECT_TRUE(sceneNamed("still", scene));
+    EXPECT_EQ(scene, Scene::Still);
+    EXPECT_FALSE(sceneNamed("fly", scene));
+    EXPECT_EQ(scene, Scene::Still);
+}
+
+TEST(PathLossTest, FollowsTheUrbanMacroCell)
+{
+    EXPECT_DOUBLE_EQ(pathLoss(1000), 128.1);
+    EXPECT_NEAR(pathLoss(100), 90.5, 1e-9);
+    EXPECT_EQ(pathLoss(0), pathLoss(35));
+}
+
+} // namespace
+} // namespace spectrel

@@ -1,0 +1,68 @@
+#include "Telephony/Simulator/SimulatedRecording.h"
+
+#include "Tests/Fakes/ScratchFolder.h"
+
+#include <fstream>
+#include <gtest/gtest.h>
+#include <iterator>
+
+namespace spectrel {
+namespace {
+
+using namespace std::chrono_literals;
+
+class SimulatedRecordingTest : public testing::Test {
+protected:
+    std::string write(Technology technology, Scene scene, std::uint32_t seed, std::chrono::milliseconds duration)
+    {
+        const auto baseband = makeBaseband(technology, scene, seed);
+        std::string reason;
+        EXPECT_TRUE(writeSimulatedRecording(*baseband, path, duration, reason)) << reason;
+        std::ifstream file(path, std::ios::binary);
+        return {std::istreambuf_iterator<char>(file), {}};
+    }
+
+    ScratchFolder folder;
+    std::string path = folder.path() / "drive.pcap";
+};
+
+TEST_F(SimulatedRecordingTest, SameOptionsGiveTheSameBytes)
+{
+    const std::string first = write(Technology::LTE, Scene::Drive, 7, 30s);
+    EXPECT_EQ(first, write(Technology::LTE, Scene::Drive, 7, 30s));
+    EXPECT_NE(first, write(Technology::LTE, Scene::Drive, 8, 30s));
+    EXPECT_NE(first, write(Technology::LTE, Scene::Walk, 7, 30s));
+}
+
+TEST_F(SimulatedRecordingTest, ItCoversItsDurationFromTheFixedStart)
+{
+    write(Technology::LTE, Scene::Drive, 1, 60s);
+    std::string reason;
+    const auto reader = openRecording(path, reason);
+    ASSERT_TRUE(reader) << reason;
+    EXPECT_EQ(reader->technology(), Technology::LTE);
+    RecordedMessage message;
+    ASSERT_TRUE(reader->next(message));
+    EXPECT_EQ(message.time, SimulatedRecordingStart);
+    Moment last;
+    while (reader->next(message))
+        last = message.time;
+    EXPECT_EQ(last, SimulatedRecordingStart + 60s);
+}
+
+TEST_F(SimulatedRecordingTest, StressSendsEveryRecordAtEveryStep)
+{
+    EXPECT_GT(
+        write(Technology::LTE, Scene::Stress, 1, 10s).size(), 5 * write(Technology::LTE, Scene::Drive, 1, 10s).size());
+}
+
+TEST_F(SimulatedRecordingTest, FileThatCannotBeMadeIsTold)
+{
+    const auto baseband = makeBaseband(Technology::LTE, Scene::Drive, 1);
+    std::string reason;
+    EXPECT_FALSE(writeSimulatedRecording(*baseband, folder.path() / "no/such/folder", 1s, reason));
+    EXPECT_EQ(reason, "No such file or directory");
+}
+
+} // namespace
+} // namespace spectrel
