@@ -15,7 +15,7 @@ namespace {
 constexpr std::uint32_t RankedNeighborsCode = 0x4005;
 constexpr std::size_t RankedNeighborsMinimumLength = 15; // bytes, 13-byte header included
 
-/// The record counts RSCP in dBm from -21 down.
+/// The raw value is 21 above the RSCP.
 std::string_view signalCodePower(std::uint32_t value, TextBuffer& buffer)
 {
     return decimalDB(value - 21, buffer);
