@@ -39,9 +39,8 @@ SpectrelApp* shownApplication()
 
 } // namespace
 
-TerminalScreen::TerminalScreen(std::function<void()> needsDisplay, std::function<void()> quit)
-    : _needsDisplay(std::move(needsDisplay))
-    , _quit(std::move(quit))
+TerminalScreen::TerminalScreen(Terminal terminal)
+    : _terminal(std::move(terminal))
 {
 }
 
@@ -63,19 +62,29 @@ void TerminalScreen::screenDidChange(ScreenPart part, Animation)
         if (app && app->saveViewController())
             app->saveViewController()->beginEditing(); // a keyboard is at hand: typing goes into the description
     }
-    _needsDisplay();
+    _terminal.needsDisplay();
 }
 
 void TerminalScreen::showAlert(const Alert& alert)
 {
     _alerts.push_back(alert);
-    _needsDisplay();
+    _terminal.needsDisplay();
+}
+
+bool TerminalScreen::copyToClipboard(const std::string& text, std::string& reason)
+{
+    if (text.size() > MaximumCopy) {
+        reason = std::to_string(text.size()) + " bytes are too many for a terminal";
+        return false;
+    }
+    _terminal.copy(text);
+    return true;
 }
 
 void TerminalScreen::resize(int width, int height)
 {
     _grid.resize(width, height);
-    _needsDisplay();
+    _terminal.needsDisplay();
 }
 
 // ---- Input
@@ -110,7 +119,7 @@ bool TerminalScreen::handleGlobalKey(SpectrelApp& app, const KeyEvent& event)
         return false;
     switch (event.character) {
     case U'q':
-        _quit();
+        _terminal.quit();
         return true;
     case U'?':
         _showsHelp = true;
@@ -143,7 +152,7 @@ void TerminalScreen::handle(const InputEvent& event)
         mouse && mouse->action != MouseEvent::Action::Press && (_showsHelp || !_alerts.empty()))
         return; // a turn of the wheel presses nothing
     std::visit([this](const auto& given) { dispatch(given); }, event);
-    _needsDisplay();
+    _terminal.needsDisplay();
 }
 
 // ---- Drawing
@@ -204,7 +213,7 @@ bool TerminalScreen::isAnimating() const
 void TerminalScreen::advanceSpinner()
 {
     ++_spinner;
-    _needsDisplay();
+    _terminal.needsDisplay();
 }
 
 } // namespace spectrel

@@ -6,8 +6,10 @@
 #include "UI/Terminal/SaveView.h"
 #include "UI/Terminal/TerminalInput.h"
 
+#include <cstddef>
 #include <deque>
 #include <functional>
+#include <string>
 #include <vector>
 
 namespace spectrel {
@@ -18,14 +20,23 @@ class SpectrelApp;
 /// hands input to the controllers. An alert covers the help, the help the save screen, and that the panes.
 class TerminalScreen final : public ScreenToolkit {
 public:
-    /// `needsDisplay` is called whenever something may have to be drawn again; `quit` when the user wants to leave.
-    TerminalScreen(std::function<void()> needsDisplay, std::function<void()> quit);
+    /// The most that is copied: longer texts do not pass through every terminal.
+    static constexpr std::size_t MaximumCopy = 74'994; // bytes; 100,000 characters on their way
+
+    /// What the screens ask of the terminal's side.
+    struct Terminal {
+        std::function<void()> needsDisplay; // something may have to be drawn again
+        std::function<void()> quit; // the user wants to leave
+        std::function<void(const std::string&)> copy; // to the terminal's clipboard
+    };
+    explicit TerminalScreen(Terminal terminal);
 
     // For the controllers.
     Size sizeOfText(std::string_view text, const Font& font) const override;
     Size mainScreenSize() const override;
     void screenDidChange(ScreenPart part, Animation animation) override;
     void showAlert(const Alert& alert) override;
+    bool copyToClipboard(const std::string& text, std::string& reason) override;
 
     // For the terminal.
     void resize(int width, int height);
@@ -46,8 +57,7 @@ private:
     }
     void drawBox(const std::vector<std::string>& lines, std::size_t boldLine);
 
-    std::function<void()> _needsDisplay;
-    std::function<void()> _quit;
+    Terminal _terminal;
     Grid _grid;
     std::vector<PaneView> _panes; // beside the stack of panes, bottom first
     SaveView _saveView;
