@@ -46,9 +46,9 @@ std::string capability(const char* name)
 /// What stands for a character on a terminal that has only ASCII.
 char32_t inASCII(char32_t character)
 {
-    constexpr std::array<std::pair<char32_t, char32_t>, 12> Likenesses {
+    constexpr std::array<std::pair<char32_t, char32_t>, 15> Likenesses {
         {{U'‹', U'<'}, {U'›', U'>'}, {U'…', U'~'}, {U'✓', U'x'}, {U'─', U'-'}, {U'│', U'|'}, {U'┌', U'+'}, {U'┐', U'+'},
-            {U'└', U'+'}, {U'┘', U'+'}, {U'°', U'o'}, {U'–', U'-'}}};
+            {U'└', U'+'}, {U'┘', U'+'}, {U'°', U'o'}, {U'–', U'-'}, {U'━', U'='}, {U'▶', U'>'}, {U'‖', U'|'}}};
     if (character < 0x7F)
         return character;
     const auto found =

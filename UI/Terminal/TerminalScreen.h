@@ -1,8 +1,11 @@
 #pragma once
 
 #include "Platform/ScreenToolkit.h"
+#include "UI/Terminal/FindView.h"
 #include "UI/Terminal/Grid.h"
+#include "UI/Terminal/HelpView.h"
 #include "UI/Terminal/PaneView.h"
+#include "UI/Terminal/PlaybackView.h"
 #include "UI/Terminal/SaveView.h"
 #include "UI/Terminal/TerminalInput.h"
 
@@ -17,7 +20,8 @@ namespace spectrel {
 class SpectrelApp;
 
 /// Everything of the terminal front end but the terminal: draws the shared application's screens into a grid and
-/// hands input to the controllers. An alert covers the help, the help the save screen, and that the panes.
+/// hands input to the controllers. An alert covers the help, the help the save screen or the search, and those the
+/// panes.
 class TerminalScreen final : public ScreenToolkit {
 public:
     /// The most that is copied: longer texts do not pass through every terminal.
@@ -49,20 +53,21 @@ public:
 private:
     PaneView* topView(SpectrelApp& app);
     template <typename Event> void dispatch(const Event& event);
-    bool closesOverlay();
-    bool handleGlobalKey(SpectrelApp& app, const KeyEvent& event);
-    bool handleGlobalKey(SpectrelApp&, const MouseEvent&)
-    {
-        return false;
-    }
-    void drawBox(const std::vector<std::string>& lines, std::size_t boldLine);
+    bool coverTakes(const KeyEvent& event);
+    bool coverTakes(const MouseEvent& event);
+    bool handleGlobally(SpectrelApp& app, PaneView& view, const KeyEvent& event);
+    bool handleGlobally(SpectrelApp& app, PaneView& view, const MouseEvent& event);
+    int paneHeight(const SpectrelApp& app) const;
+    void drawPane(SpectrelApp& app, PaneView& view);
 
     Terminal _terminal;
     Grid _grid;
     std::vector<PaneView> _panes; // beside the stack of panes, bottom first
     SaveView _saveView;
+    FindView _findView;
+    PlaybackView _playbackView;
+    HelpView _help;
     std::deque<Alert> _alerts;
-    bool _showsHelp = false;
     std::size_t _spinner = 0;
 };
 
