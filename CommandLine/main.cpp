@@ -9,6 +9,7 @@
 #include "Platform/Syslog/FileLog.h"
 #include "Platform/Syslog/SyslogLog.h"
 
+#include <csignal>
 #include <memory>
 
 namespace {
@@ -86,6 +87,7 @@ int main(int argc, char** argv)
     if (const auto status = readArguments(argc, argv, arguments))
         return *status;
 
+    std::signal(SIGXFSZ, SIG_IGN); // a file grown too large is a failed write like any other
     const DirectoryResources resources(arguments.resources.value_or(Places::resourcesDirectory()));
     Resources::install(&resources);
     StandardErrorConsole console;

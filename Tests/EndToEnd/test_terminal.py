@@ -8,7 +8,9 @@ import unittest
 from harness import BIN, Place, capture, record, serving_cell, sim_files
 
 
-class Terminal(Place):
+class TerminalPlace(Place):
+    """A test with a terminal of its own."""
+
     def setUp(self):
         super().setUp()
         self.socket = self.path("tmux")
@@ -21,7 +23,8 @@ class Terminal(Place):
 
     def open(self, *arguments, width=80, height=24):
         """Starts a shell in a terminal and the program from it, so that what it leaves behind can be seen."""
-        self.tmux("new-session", "-d", "-x", str(width), "-y", str(height), "sh")
+        self.tmux("new-session", "-d", "-x", str(width), "-y", str(height), "sh", ";",
+                  "set-option", "-s", "set-clipboard", "on")
         program = shlex.join([os.path.join(BIN, "spectrel"), *arguments])
         self.keys(f"PS1='prompt% '; clear; {program}; echo status $?", "Enter")
 
@@ -39,6 +42,12 @@ class Terminal(Place):
         self.wait_until(shows, f"the screen never showed {texts}:\n{self.screen()}")
         return self.screen()
 
+    def buffer(self):
+        """What was copied last."""
+        return self.tmux("show-buffer").stdout
+
+
+class Terminal(TerminalPlace):
     def replay(self, *messages, technology="lte", **options):
         file = self.write(f"{len(self.processes)}.pcap", capture(messages, technology=technology, **options))
         return self.start_service("--replay", file, "--speed", "0")
