@@ -4,7 +4,9 @@
 #include "Platform/Dictionary.h"
 #include "Platform/List.h"
 
+#include <unordered_map>
 #include <utility>
+#include <vector>
 
 namespace spectrel {
 
@@ -28,14 +30,25 @@ std::string entryName(const Dictionary& entry, std::size_t place)
     return description.empty() ? date : date + "  " + description;
 }
 
-/// Rows are found by their names, so no two may be alike, and none may be the marker that sorts them.
-void addRow(Dictionary& rows, const std::string& name, Value value)
-{
-    std::string unlike = name;
-    for (int number = 2; rows.contains(unlike) || unlike == SortedMarker; ++number)
-        unlike = name + " (" + std::to_string(number) + ")";
-    rows.set(unlike, std::move(value));
-}
+/// Gathers rows. They are found by their names, so no two may be alike, and none may be the marker that sorts them.
+class Rows {
+public:
+    void add(const std::string& name, Value value)
+    {
+        std::string unlike = name;
+        while (_rows->contains(unlike) || unlike == SortedMarker)
+            unlike = name + " (" + std::to_string(++_others[name] + 1) + ")";
+        _rows->set(unlike, std::move(value));
+    }
+    const DictionaryRef& dictionary() const
+    {
+        return _rows;
+    }
+
+private:
+    DictionaryRef _rows = Dictionary::make();
+    std::unordered_map<std::string, int> _others; // rows of that name beyond the first
+};
 
 std::string binaryLogText(const Value& log)
 {
@@ -46,27 +59,27 @@ std::string binaryLogText(const Value& log)
 
 Value displayOfSnapshot(const Dictionary& snapshot)
 {
-    auto rows = Dictionary::make();
-    auto others = Dictionary::make();
+    Rows rows;
+    std::vector<std::pair<std::string, Value>> binaryLogs;
     const ListRef entries = snapshot["Data"].list();
     for (std::size_t place = entries ? entries->count() : 0; place > 0; --place) {
         const DictionaryRef entry = (*entries)[place - 1].dictionary();
         if (!entry)
-            addRow(*rows, "Entry " + std::to_string(place), "(unknown)");
+            rows.add("Entry " + std::to_string(place), "(unknown)");
         else if (entry->contains("DLF"))
-            addRow(*others, entryName(*entry, place), binaryLogText((*entry)["DLF"]));
+            binaryLogs.emplace_back(entryName(*entry, place), binaryLogText((*entry)["DLF"]));
         else if (!entry->contains("Display"))
-            addRow(*rows, entryName(*entry, place), "nothing was displayed");
+            rows.add(entryName(*entry, place), "nothing was displayed");
         else
-            addRow(*rows, entryName(*entry, place), (*entry)["Display"]);
+            rows.add(entryName(*entry, place), (*entry)["Display"]);
     }
-    for (const auto& [name, value] : others->entries())
-        addRow(*rows, name, value);
+    for (const auto& [name, value] : binaryLogs)
+        rows.add(name, value);
     for (const char* key : {"Timestamp", "Description"}) {
         if (const std::string text = textOf(snapshot, key); !text.empty())
-            addRow(*rows, key, text);
+            rows.add(key, text);
     }
-    return rows;
+    return rows.dictionary();
 }
 
 SnapshotModel::SnapshotModel(RunLoop& runLoop, SpectrelModelObserver& observer, const Dictionary& snapshot)

@@ -39,6 +39,17 @@ TEST_F(SnapshotModelTest, EntriesOfOneNameStayApart)
         "{\"10:00  a\": \"2\", \"10:00  a (2)\": \"1\"}");
 }
 
+TEST_F(SnapshotModelTest, ManyEntriesOfOneNameAreNoObstacle)
+{
+    constexpr int Count = 50'000;
+    auto data = List::make();
+    for (int number = 0; number < Count; ++number)
+        data->append(Dictionary::make({{"Description", "a"}}));
+    const Value display = displayOfSnapshot(*Dictionary::make({{"Data", data}}));
+    EXPECT_EQ(display.dictionary()->count(), std::size_t {Count});
+    EXPECT_EQ(display.dictionary()->entries().back().key, "a (50000)");
+}
+
 TEST_F(SnapshotModelTest, TheBinaryLogIsALeafBehindTheEntries)
 {
     const DataRef bytes = std::make_shared<const Bytes>(12);
