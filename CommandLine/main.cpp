@@ -1,4 +1,4 @@
-// spectrel: the application with its terminal screens, and the commands watch, decode and record.
+// spectrel: the application with its terminal screens, and the commands watch, decode, view and record.
 
 #include "CommandLine/Application.h"
 #include "CommandLine/Arguments.h"
@@ -9,6 +9,7 @@
 #include "Platform/Syslog/FileLog.h"
 #include "Platform/Syslog/SyslogLog.h"
 
+#include <csignal>
 #include <memory>
 
 namespace {
@@ -19,22 +20,27 @@ using namespace spectrel;
 constexpr int SystemLogPriority = Priority::Error;
 constexpr int EveryPriority = 7;
 
+/// A live session tells the system log, a recording that is decoded again does not.
+bool isLive(Job job)
+{
+    return job != Job::Decode && job != Job::View;
+}
+
 /// Chooses where log lines go: to a file every one of them; otherwise, for a live session, to the system log.
 class Logging {
 public:
     bool start(const Arguments& arguments)
     {
         if (arguments.logFile) {
-            const bool isLive = arguments.job != Job::Decode;
             std::string reason;
-            _file = FileLog::create(
-                *arguments.logFile, isLive ? FileLog::Writing::EachLine : FileLog::Writing::Buffered, reason);
+            _file = FileLog::create(*arguments.logFile,
+                isLive(arguments.job) ? FileLog::Writing::EachLine : FileLog::Writing::Buffered, reason);
             if (!_file) {
                 report(*arguments.logFile + ": " + reason);
                 return false;
             }
             SystemLog::install(_file.get(), EveryPriority);
-        } else if (arguments.job != Job::Decode) {
+        } else if (isLive(arguments.job)) {
             _system = std::make_unique<SyslogLog>();
             SystemLog::install(_system.get(), SystemLogPriority);
         }
@@ -63,6 +69,8 @@ int run(const Arguments& arguments)
         return watch(arguments.watch);
     case Job::Decode:
         return decode(arguments.decode);
+    case Job::View:
+        return view(arguments);
     case Job::Record:
         return record(arguments.record);
     case Job::Application:
@@ -79,6 +87,7 @@ int main(int argc, char** argv)
     if (const auto status = readArguments(argc, argv, arguments))
         return *status;
 
+    std::signal(SIGXFSZ, SIG_IGN); // a file grown too large is a failed write like any other
     const DirectoryResources resources(arguments.resources.value_or(Places::resourcesDirectory()));
     Resources::install(&resources);
     StandardErrorConsole console;
