@@ -48,7 +48,7 @@ template <auto Make> Bytes onGSM(const World& world, Moment time)
 
 template <auto Encode> Bytes gprs(const World& world, Moment time)
 {
-    return Encode(world.now().gprs, time);
+    return Encode(world.now().gprs.value_or(GPRSParameters()), time);
 }
 
 constexpr auto mm = told<&Situation::mm, mmStateRecord>;
@@ -157,6 +157,7 @@ constexpr auto Cadences = std::to_array<Cadence<World>>({
     {600ms, false, onUMTS<cellSets>},
     {100ms, false, onChange<&Situation::system, cellSets>},
     {1s, true, onUMTS<ranking>},
+    {100ms, false, onChange<&Situation::measuresGSM, onUMTS<ranking>>},
     {5s, false, onGSM<ranking>},
     {500ms, false, transmitPowerWhileSending},
     {100ms, false, onChange<&Situation::isSending, transmitPower>},
@@ -164,7 +165,7 @@ constexpr auto Cadences = std::to_array<Cadence<World>>({
     {100ms, false, onChange<&Situation::isOnDCH, blockErrors>},
     {1s, false, hsdpa},
 
-    {5s, true, rr},
+    {10s, true, rr},
     {100ms, false, onChange<&Situation::rr, rr>},
     {5s, true, gsmCell},
     {100ms, false, onChange<&Situation::gsmCell, gsmCell>},

@@ -17,7 +17,7 @@ constexpr double ValleyLoss = 45; // dB
 constexpr double NodeBDistance = 500;
 constexpr double PilotPower = 33; // dBm
 constexpr double SectorBeam = 70; // degrees (3GPP TR 25.814, table A.2.1.1-2)
-constexpr double SectorBackLoss = 20; // dB
+constexpr double SectorBackLoss = 15; // dB, what streets reflect included
 constexpr double ReceiverNoise = -99; // dBm in 3.84 MHz, noise figure 9 dB
 
 constexpr double BaseStationDistance = 800;

@@ -12,7 +12,8 @@ using namespace std::chrono_literals;
 constexpr auto SearchTime = 2500ms; // from power-on until a cell is found
 constexpr double SelectableEcno = -14; // dB
 
-constexpr auto ReselectionTime = 1s; // to GSM, Treselections
+constexpr auto ReselectionTime = 2s; // to GSM, Treselections
+constexpr auto RankedTogether = 600ms; // until the report shows both systems
 constexpr double WeakEcno = -14; // dB, event 2d in a connection
 constexpr auto WeakTime = 600ms;
 constexpr double LostEcno = -22; // dB: nothing gets through
@@ -171,10 +172,7 @@ RankingReport GSMUMTSWorld::ranking() const
 {
     if (_gsm.isOn() || !measuresGSM())
         return {_umts.ranking(), {}};
-    if (_leaving > 0ms)
-        return {_umts.ranking(), gsmRanking()};
-    const bool isGSMsTurn = _elapsed / 1s % 2 == 0;
-    return isGSMsTurn ? RankingReport {{}, gsmRanking()} : RankingReport {_umts.ranking(), {}};
+    return {_leaving >= RankedTogether ? _umts.ranking() : std::vector<RankedUMTSCell>(), gsmRanking()};
 }
 
 std::span<const PLMN> GSMUMTSWorld::equivalentNetworks() const
@@ -225,7 +223,9 @@ Situation GSMUMTSWorld::situation() const
     situation.isDedicated = _gsm.isDedicated();
     situation.usesDTX = _gsm.usesDTX();
     situation.hopping = _gsm.hopping();
-    situation.gprs = _gsm.isOn() ? _gsm.gprs() : GPRSParameters();
+    if (_gsm.isOn())
+        situation.gprs = _gsm.gprs();
+    situation.measuresGSM = measuresGSM();
     situation.hasSession = _usage.hasSession();
     return situation;
 }

@@ -8,6 +8,7 @@
 #include "Telephony/Simulator/Usage.h"
 
 #include <chrono>
+#include <optional>
 #include <span>
 
 namespace spectrel {
@@ -29,7 +30,8 @@ struct Situation {
     bool isDedicated = false; // GSM
     bool usesDTX = false;
     HoppingReport hopping;
-    GPRSParameters gprs;
+    std::optional<GPRSParameters> gprs; // on GSM
+    bool measuresGSM = false;
     bool hasSession = false;
 };
 
@@ -72,8 +74,8 @@ public:
     {
         return _traffic;
     }
-    /// The neighbours ranked for reselection. From UMTS the GSM cells are ranked where UMTS gets weak: in turn with the
-    /// UMTS cells, and both at once when the phone is about to leave.
+    /// The neighbours ranked for reselection: on UMTS its cells, or where it gets weak the GSM cells, and both when the
+    /// phone is about to leave.
     RankingReport ranking() const;
     /// The serving cell is so weak that GSM cells are measured, or serves on GSM.
     bool measuresGSM() const;

@@ -89,8 +89,8 @@ MMSubState MobilityManagement::mmSubState() const
 void MobilityManagement::advanceGMM(std::chrono::milliseconds step)
 {
     _inGMM += step;
-    const bool isLocated = _mm.state == MMState::Idle && isLocationKnown();
-    keepTime(_routingNeeded, isLocated && !isRoutingKnown(), step);
+    const bool mayUpdate = (_mm.state == MMState::Idle && isLocationKnown()) || _mm.state == MMState::ConnectionActive;
+    keepTime(_routingNeeded, mayUpdate && !isSearching() && !isSuspended() && !isRoutingKnown(), step);
     const bool isExchanging = _gmm.state == GMMState::RegisteredInitiated
         || _gmm.state == GMMState::RoutingAreaUpdateInitiated || _gmm.state == GMMState::ServiceRequestInitiated;
     keepTime(_exchange, isExchanging && _inputs.isConnected, step);
@@ -130,11 +130,10 @@ GMMState MobilityManagement::nextGMM() const
 
 GMMState MobilityManagement::afterRegistered() const
 {
-    if (isSuspended())
-        return _gmm.state;
     if (_routingNeeded >= DecisionTime)
         return GMMState::RoutingAreaUpdateInitiated;
-    if (_inputs.wantsTransfer && isRoutingKnown() && _inputs.place.system == RadioSystem::UMTS && !_inputs.isConnected)
+    if (!isSuspended() && _inputs.wantsTransfer && isRoutingKnown() && _inputs.place.system == RadioSystem::UMTS
+        && !_inputs.isConnected)
         return GMMState::ServiceRequestInitiated;
     return _gmm.state;
 }

@@ -31,8 +31,8 @@ struct UMTSCell {
 namespace UMTSThresholds {
 constexpr double MinimumEcno = -18; // dB, Qqualmin
 constexpr double MinimumRscp = -115; // dBm, Qrxlevmin
-constexpr double SearchGSMBelow = -12; // dB of Ec/No: Qqualmin + SsearchRAT
-constexpr double Hysteresis = 4; // dB, Qhyst1s
+constexpr double SearchGSMBelow = -14; // dB of Ec/No: Qqualmin + SsearchRAT
+constexpr double Hysteresis = 2; // dB, Qhyst1s
 constexpr double GSMOffset = 7; // dB, Qoffset1 of GSM neighbours
 } // namespace UMTSThresholds
 

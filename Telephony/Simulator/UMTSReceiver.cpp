@@ -9,7 +9,7 @@ namespace {
 
 using namespace std::chrono_literals;
 
-constexpr double Audible = -20; // dB of Ec/No
+constexpr double Audible = -23; // dB of Ec/No
 constexpr std::size_t SetCellsTold = 7;
 constexpr std::size_t RankedTold = 4;
 

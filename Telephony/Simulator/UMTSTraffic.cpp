@@ -115,7 +115,7 @@ void UMTSTraffic::countCarrier(std::vector<HARQProcess>& processes, double ecno,
     const std::uint32_t size = blockSize(ecno);
     for (HARQProcess& process : processes) {
         const std::uint32_t scheduled = SubFrames / Processes - dice.below(5);
-        const std::uint32_t wrong = dice.below(10) == 0 ? 1 : 0;
+        const std::uint32_t wrong = dice.below(2); // one in ten to twelve, as the network aims at
         process.newTransmissions = static_cast<std::uint16_t>(process.newTransmissions + scheduled);
         process.blockErrors = static_cast<std::uint16_t>(process.blockErrors + wrong);
         process.bits += (scheduled - wrong) * size;
