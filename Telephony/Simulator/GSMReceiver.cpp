@@ -64,9 +64,9 @@ void GSMReceiver::advance(std::chrono::milliseconds step, const Demand& demand, 
     _inCall = demand.call;
     _inSession = demand.session;
     listen(step);
-    advanceState(step, demand);
     if (!isChanging())
         reselect(step);
+    advanceState(step, demand);
     if (isDedicated())
         judgeQuality(dice);
 }

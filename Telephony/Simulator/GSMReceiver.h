@@ -38,6 +38,11 @@ public:
     {
         return _rr.state == RRState::DataTransfer;
     }
+    /// Not in the midst of a change, a setup or a release.
+    bool isSettled() const
+    {
+        return isConnected() || _rr.state == RRState::Idle;
+    }
     /// In a call, on a channel of its own.
     bool isDedicated() const
     {

@@ -140,7 +140,7 @@ void GSMUMTSWorld::considerUMTS(std::chrono::milliseconds step)
     keepTime(_leaving, isGood && !_gsm.isChanging(), step);
     const bool inCall = _gsm.isDedicated();
     const bool isBusy = _mobility.isSignalling() || (_mobility.isCalling() && !inCall);
-    if (isBusy || _leaving < (inCall ? ReturnTimeInCall : ReturnTime))
+    if (isBusy || !_gsm.isSettled() || _leaving < (inCall ? ReturnTimeInCall : ReturnTime))
         return;
     _gsm.depart(inCall ? RRState::ToUMTSByHandover : RRState::ToUMTSByReselection);
     _departing = step;
