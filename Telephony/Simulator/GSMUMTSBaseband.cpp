@@ -187,6 +187,8 @@ constexpr auto Cadences = std::to_array<Cadence<World>>({
     {100ms, false, onChange<&Situation::gprs, onGSM<gprs<gprsTimersRecord>>>},
 
     {5s, true, gsmumtsCellInformationRecord},
+    {100ms, false, onChange<&Situation::umtsCell, gsmumtsCellInformationRecord>},
+    {100ms, false, onChange<&Situation::gsmCell, gsmumtsCellInformationRecord>},
     {5s, true, packetContextsRecord},
     {100ms, false, onChange<&Situation::hasSession, packetContextsRecord>},
 });
