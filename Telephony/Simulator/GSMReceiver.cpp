@@ -199,9 +199,12 @@ HoppingReport GSMReceiver::hopping() const
 
 GPRSParameters GSMReceiver::gprs() const
 {
-    if (_onCell >= SystemInformationTime)
-        return servingCell().gprs;
-    return {};
+    return hasReadSystemInformation() ? servingCell().gprs : GPRSParameters();
+}
+
+bool GSMReceiver::hasReadSystemInformation() const
+{
+    return _onCell >= SystemInformationTime;
 }
 
 std::vector<const GSMCell*> GSMReceiver::neighbours() const

@@ -60,6 +60,7 @@ public:
     {
         return isDedicated() && servingCell().usesDTX;
     }
+    bool hasReadSystemInformation() const;
     /// The serving cell's, once its system information has been read.
     GPRSParameters gprs() const;
     GSMMeasurement measurement() const;

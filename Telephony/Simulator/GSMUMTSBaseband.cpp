@@ -51,6 +51,12 @@ template <auto Encode> Bytes gprs(const World& world, Moment time)
     return Encode(world.now().gprs.value_or(GPRSParameters()), time);
 }
 
+/// Timers and counters have no value for "not known yet".
+template <auto Encode> Bytes gprsOnceRead(const World& world, Moment time)
+{
+    return world.gsm().hasReadSystemInformation() ? gprs<Encode>(world, time) : Bytes();
+}
+
 constexpr auto mm = told<&Situation::mm, mmStateRecord>;
 constexpr auto gmm = told<&Situation::gmm, gmmStateRecord>;
 constexpr auto registration = told<&Situation::registration, registrationRecord>;
@@ -179,12 +185,12 @@ constexpr auto Cadences = std::to_array<Cadence<World>>({
     {5s, true, hoppingInCalls},
     {5s, true, onGSM<gprs<gprsSystemInformationRecord>>},
     {5s, true, onGSM<gprs<gprsAccessRecord>>},
-    {5s, true, onGSM<gprs<gprsTimersRecord>>},
-    {5s, true, onGSM<gprs<gprsBroadcastRecord>>},
-    {5s, true, onGSM<gprs<gprsStatusRecord>>},
+    {5s, true, onGSM<gprsOnceRead<gprsTimersRecord>>},
+    {5s, true, onGSM<gprsOnceRead<gprsBroadcastRecord>>},
+    {5s, true, onGSM<gprsOnceRead<gprsStatusRecord>>},
     {100ms, false, onChange<&Situation::gprs, onGSM<gprs<gprsSystemInformationRecord>>>},
     {100ms, false, onChange<&Situation::gprs, onGSM<gprs<gprsAccessRecord>>>},
-    {100ms, false, onChange<&Situation::gprs, onGSM<gprs<gprsTimersRecord>>>},
+    {100ms, false, onChange<&Situation::gprs, onGSM<gprsOnceRead<gprsTimersRecord>>>},
 
     {5s, true, gsmumtsCellInformationRecord},
     {100ms, false, onChange<&Situation::umtsCell, gsmumtsCellInformationRecord>},

@@ -48,7 +48,7 @@ GPRSParameters gprsOfCell(std::size_t number, Dice& dice)
 {
     GPRSParameters gprs;
     gprs.si13Position = number % 3 == 2 ? 1 : 0;
-    gprs.networkControlOrder = number % 4 == 3 ? 2 : 0;
+    gprs.networkControlOrder = number % 3 == 0 ? 2 : 0;
     gprs.packetFlowContexts = static_cast<std::uint8_t>(dice.below(2));
     gprs.priorityAccessThreshold = number % 4 == 1 ? 6 : 7;
     gprs.t3192 = static_cast<std::uint8_t>(dice.below(2));
@@ -143,9 +143,9 @@ void GSMUMTSRoad::addGSMCell(double position, bool is1800, Dice& dice)
     cell.bsic = static_cast<std::uint8_t>(dice.below(64));
     cell.locationArea = 1211;
     cell.routingArea = 11;
-    cell.reselectOffset = is1800 ? 12 : 0;
+    cell.reselectOffset = static_cast<std::uint8_t>(is1800 ? 12 : 2 * (number % 4));
     cell.usesDTX = number % 3 != 2;
-    if (number % 4 != 3) {
+    if (number % 3 != 1) {
         cell.hopping.sequenceNumber = static_cast<std::uint8_t>(dice.below(64));
         for (std::uint16_t hop = 0; hop < 3 + number % 3; ++hop)
             cell.hopping.arfcns.push_back(static_cast<std::uint16_t>((is1800 ? 700 : 80) + number + 7 * hop));

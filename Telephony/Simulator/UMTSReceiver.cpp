@@ -32,7 +32,7 @@ constexpr auto DedicatedPatience = 3s; // unused, until the network takes the ch
 constexpr auto SharedPatience = 5s;
 constexpr auto PagingPatience = 20s;
 constexpr auto ReleaseTime = 300ms;
-constexpr double FastPhone = 12; // metres a second: so fast a phone tells only its registration area
+constexpr double FastPhone = 14; // metres a second: so fast a phone tells only its registration area
 
 } // namespace
 

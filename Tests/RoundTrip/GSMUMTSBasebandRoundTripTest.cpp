@@ -66,7 +66,7 @@ TEST_F(GSMUMTSBasebandRoundTripTest, StressIsTakenWithoutComplaint)
 {
     LogRecorder recorder(3);
     const auto baseband = makeBaseband(Technology::GSM, Scene::Stress, 1);
-    receive(*baseband, 2min);
+    receive(*baseband, 30s);
     EXPECT_EQ(recorder.takeLog(), "") << "nothing unreadable, nothing unknown";
 }
 
