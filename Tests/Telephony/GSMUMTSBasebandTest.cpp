@@ -97,7 +97,7 @@ TEST_F(GSMUMTSBasebandTest, RatesAreNatural)
     EXPECT_GT(measured, 600u) << "the phone listens more than once a second";
     EXPECT_LT(measured, 3000u);
     EXPECT_LT(count(0xFF0000), 30u);
-    EXPECT_LT(count(0xFF0001), 150u);
+    EXPECT_LT(count(0xFF0001), 200u) << "every five seconds and with every new cell";
 }
 
 TEST_F(GSMUMTSBasebandTest, NewChannelHearsTheSlowRecordsAtOnce)
@@ -112,18 +112,20 @@ TEST_F(GSMUMTSBasebandTest, NewChannelHearsTheSlowRecordsAtOnce)
 TEST_F(GSMUMTSBasebandTest, SystemThatIsLeftFallsSilent)
 {
     std::set<bool> systems;
+    bool wasOnGSM = false;
     for (int second = 0; second < 1200; ++second) {
         records.clear();
         drive(1s);
         const bool onGSM = count(0x5137) == 2;
         const bool onUMTS = count(0x4005) > 0 && count(0x5137) == 0;
-        if (onGSM) {
+        if (onGSM && wasOnGSM) {
             EXPECT_EQ(count(0x4127) + count(0x4221), 0u) << "in second " << second;
         }
         if (onUMTS) {
             EXPECT_EQ(count(0x5134) + count(0x51FF) + count(0x51F5) + count(0x51FD), 0u) << "in second " << second;
         }
         systems.insert(onGSM);
+        wasOnGSM = onGSM;
         if (HasFailure())
             return;
     }
