@@ -134,7 +134,7 @@ void GSMUMTSWorld::considerGSM(std::chrono::milliseconds step)
 void GSMUMTSWorld::considerUMTS(std::chrono::milliseconds step)
 {
     if (_departing > 0ms)
-        return moveToUMTS();
+        return moveToUMTS(step);
     const UMTSCell& cell = _umts.strongestCell();
     const bool isGood = cell.ecno > ReturnEcno && cell.rscp > ReturnRscp;
     keepTime(_leaving, isGood && !_gsm.isChanging(), step);
@@ -147,9 +147,9 @@ void GSMUMTSWorld::considerUMTS(std::chrono::milliseconds step)
     _leaving = 0ms;
 }
 
-void GSMUMTSWorld::moveToUMTS()
+void GSMUMTSWorld::moveToUMTS(std::chrono::milliseconds step)
 {
-    _departing += 100ms;
+    _departing += step;
     if (_departing < DepartureTime)
         return;
     const bool byHandover = _gsm.rr().state == RRState::ToUMTSByHandover;

@@ -101,7 +101,7 @@ private:
     void chooseFirstSystem();
     void considerGSM(std::chrono::milliseconds step);
     void considerUMTS(std::chrono::milliseconds step);
-    void moveToUMTS();
+    void moveToUMTS(std::chrono::milliseconds step);
     bool isUMTSTooWeak() const;
     std::vector<RankedGSMCell> gsmRanking() const;
     void transfer(std::chrono::milliseconds step);

@@ -4,8 +4,6 @@
 #include "Telephony/Simulator/GSMUMTSRoad.h"
 
 #include <chrono>
-#include <optional>
-#include <span>
 #include <vector>
 
 namespace spectrel {
