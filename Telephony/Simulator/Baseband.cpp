@@ -8,7 +8,7 @@ std::unique_ptr<Baseband> makeBaseband(Technology technology, Scene scene, std::
     case Technology::IFX:
         return nullptr;
     case Technology::GSM:
-        return nullptr;
+        return makeGSMUMTSBaseband(scene, seed);
     case Technology::CDMA:
         return nullptr;
     case Technology::LTE:

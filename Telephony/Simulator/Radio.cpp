@@ -65,6 +65,11 @@ double Journey::distanceTo(double position, double offset) const
     return std::hypot(std::min(direct, _length - direct), offset);
 }
 
+double Journey::ahead(double position) const
+{
+    return std::remainder(position - _position, _length);
+}
+
 void Shadowing::advance(std::chrono::milliseconds step, Dice& dice)
 {
     const double seconds = std::chrono::duration<double>(step).count();

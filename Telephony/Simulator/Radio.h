@@ -45,6 +45,8 @@ public:
     void advance(std::chrono::milliseconds step, Dice& dice);
     /// Metres from here to a mast that stands `offset` metres beside the place `position`.
     double distanceTo(double position, double offset) const;
+    /// Metres along the road to the place `position`, the shorter way round: positive ahead, negative behind.
+    double ahead(double position) const;
     /// Metres a second.
     double speed() const
     {
