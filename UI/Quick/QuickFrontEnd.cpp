@@ -9,18 +9,29 @@
 #include <QUrl>
 #include <QVariantMap>
 
+#include <algorithm>
+#include <array>
+#include <unistd.h>
+
 void qml_register_types_Spectrel_Quick(); // made from the module's types at build time
 
 namespace spectrel {
 
 namespace {
 
+/// Where no graphics processor is, the graphics library draws on the processor, slowly and in much memory.
+bool hasGraphicsProcessor()
+{
+    static constexpr std::array Devices {"/dev/dri", "/dev/nvidiactl", "/dev/mali0", "/dev/kgsl-3d0", "/dev/pvr_sync"};
+    return std::ranges::any_of(Devices, [](const char* device) { return ::access(device, F_OK) == 0; });
+}
+
 /// Draws without a graphics processor where there is none; by itself the toolkit would end the process.
 void chooseRenderer()
 {
     if (qEnvironmentVariableIsSet("QT_QUICK_BACKEND") || qEnvironmentVariableIsSet("QSG_RHI_BACKEND"))
         return;
-    if (!QOpenGLContext().create())
+    if (!hasGraphicsProcessor() || !QOpenGLContext().create())
         QQuickWindow::setGraphicsApi(QSGRendererInterface::Software);
 }
 

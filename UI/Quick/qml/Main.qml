@@ -22,7 +22,7 @@ ApplicationWindow {
     palette.button: Theme.surface
     palette.buttonText: Theme.text
     palette.highlight: Theme.accent
-    palette.highlightedText: Theme.onAccent
+    palette.highlightedText: Theme.accentText
     palette.mid: Theme.faint
     palette.dark: Theme.faint
 

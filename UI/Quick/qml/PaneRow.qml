@@ -22,6 +22,7 @@ Item {
 
     signal tapped
 
+    objectName: "row"
     implicitHeight: 50
     Accessible.role: isInner ? Accessible.Button : Accessible.ListItem
     Accessible.name: isInner ? name : name + ", " + value
@@ -49,7 +50,7 @@ Item {
         visible: !row.isLast
         anchors.bottom: parent.bottom
         anchors.left: parent.left
-        anchors.leftMargin: Theme.margin + 10
+        anchors.leftMargin: Theme.margin / 2 + 10
         anchors.right: parent.right
         height: 1
         color: Theme.line

@@ -124,7 +124,7 @@ Popup {
             font.pixelSize: 16
             color: Theme.text
             selectionColor: Theme.accent
-            selectedTextColor: Theme.onAccent
+            selectedTextColor: Theme.accentText
             placeholderText: qsTr("What is worth keeping here?")
             placeholderTextColor: Theme.faint
             Accessible.name: qsTr("Description")

@@ -29,7 +29,7 @@ T.AbstractButton {
         textFormat: Text.PlainText
         font.pixelSize: 16
         font.bold: button.isFilled
-        color: button.isFilled ? Theme.onAccent : Theme.accent
+        color: button.isFilled ? Theme.accentText : Theme.accent
         horizontalAlignment: Text.AlignHCenter
         verticalAlignment: Text.AlignVCenter
     }

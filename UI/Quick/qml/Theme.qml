@@ -14,7 +14,7 @@ QtObject {
     readonly property color value: isDark ? "#bfd3ea" : "#2b4a6f"
     readonly property color faint: isDark ? "#94a1b1" : "#5c6a7a"
     readonly property color accent: isDark ? "#62b2ff" : "#0b63c5"
-    readonly property color onAccent: isDark ? "#06192c" : "#ffffff"
+    readonly property color accentText: isDark ? "#06192c" : "#ffffff"
     readonly property color warning: isDark ? "#ffb3a6" : "#a5321f"
     readonly property color shade: isDark ? "#a0000000" : "#66101820"
 
