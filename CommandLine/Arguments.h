@@ -3,6 +3,7 @@
 #include "CommandLine/Decode.h"
 #include "CommandLine/ExitStatus.h"
 #include "CommandLine/Record.h"
+#include "CommandLine/View.h"
 #include "CommandLine/Watch.h"
 
 #include <chrono>
@@ -13,7 +14,7 @@
 
 namespace spectrel {
 
-enum class Job : std::uint8_t { Application, Watch, Decode, Record };
+enum class Job : std::uint8_t { Application, Watch, Decode, View, Record };
 
 /// Which screens the application was told to open; by default it finds out by itself.
 enum class ScreenChoice : std::uint8_t { Automatic, Graphical, Terminal };
@@ -25,6 +26,7 @@ struct Arguments {
     std::optional<std::string> resources; // the templates' folder
     std::optional<std::string> logFile;
     DecodeOptions decode;
+    ViewOptions view;
     WatchOptions watch;
     RecordOptions record;
 };

@@ -25,6 +25,13 @@ std::optional<int> readArguments(int argc, char** argv, GraphicalArguments& argu
         ->type_name("DIR");
     program.add_option("--log", arguments.logFile, "Write every system-log line to this file: <PRIORITY>TEXT")
         ->type_name("FILE");
+    program.add_option("--view", arguments.viewedFile, "Browse this recording or snapshot, as 'spectrel view' does")
+        ->type_name("FILE");
+    program
+        .add_option_function<std::string>(
+            "--technology", [&arguments](const std::string& name) { arguments.technology = technologyNamed(name); },
+            "The file's technology, where it does not tell")
+        ->check(CLI::IsMember({"ifx", "gsm", "cdma", "lte", "utran"}));
     program
         .add_option_function<std::string>(
             "--appearance", [&arguments](const std::string& name) { arguments.appearance = Appearances.at(name); },

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Platform/Recording.h"
 #include "UI/Quick/QuickFrontEnd.h"
 
 #include <optional>
@@ -12,6 +13,8 @@ struct GraphicalArguments {
     std::optional<std::string> resources; // the templates' folder
     std::optional<std::string> logFile;
     std::optional<Appearance> appearance; // none: the desktop's
+    std::optional<std::string> viewedFile; // none: the live session
+    std::optional<Technology> technology; // of the file, where it does not tell
 };
 
 /// Reads the command line. An exit status when the program is done with that: after --help, --version or wrong usage,

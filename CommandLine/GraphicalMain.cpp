@@ -31,7 +31,7 @@ int main(int argc, char** argv)
     StandardOutputConsole console;
     Console::install(&console);
     Logging logging;
-    if (!logging.start(arguments.logFile, Logging::Use::Live))
+    if (!logging.start(arguments.logFile, arguments.viewedFile ? Logging::Use::Offline : Logging::Use::Live))
         return ExitStatus::Failed;
 
     int programOnly = 1; // the toolkit's own options are no options of this program

@@ -1,4 +1,4 @@
-// spectrel: the application with its terminal screens, and the commands watch, decode and record.
+// spectrel: the application with its terminal screens, and the commands watch, decode, view and record.
 
 #include "CommandLine/Application.h"
 #include "CommandLine/Arguments.h"
@@ -11,6 +11,12 @@ namespace {
 
 using namespace spectrel;
 
+/// A live session tells the system log, a recording that is decoded again does not.
+bool isLive(Job job)
+{
+    return job != Job::Decode && job != Job::View;
+}
+
 int run(const Arguments& arguments)
 {
     switch (arguments.job) {
@@ -18,6 +24,8 @@ int run(const Arguments& arguments)
         return watch(arguments.watch);
     case Job::Decode:
         return decode(arguments.decode);
+    case Job::View:
+        return view(arguments);
     case Job::Record:
         return record(arguments.record);
     case Job::Application:
@@ -39,7 +47,7 @@ int main(int argc, char** argv)
     StandardErrorConsole console;
     Console::install(&console);
     Logging logging;
-    if (!logging.start(arguments.logFile, arguments.job == Job::Decode ? Logging::Use::Offline : Logging::Use::Live))
+    if (!logging.start(arguments.logFile, isLive(arguments.job) ? Logging::Use::Live : Logging::Use::Offline))
         return ExitStatus::Failed;
     const int status = run(arguments);
     return logging.finish() ? status : ExitStatus::Failed;

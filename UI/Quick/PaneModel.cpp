@@ -146,6 +146,13 @@ void PaneModel::rowsDidChange()
         adoptNode();
     if (std::exchange(_selectedRow, selectedRow()) != selectedRow())
         emit selectedRowChanged();
+    emit rowToShowChanged();
+}
+
+int PaneModel::takeRowToShow()
+{
+    const auto row = _pane->tableView().takeRowToShow();
+    return row ? static_cast<int>(*row) : -1;
 }
 
 void PaneModel::adoptNode()

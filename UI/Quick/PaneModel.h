@@ -78,6 +78,8 @@ public:
     /// Moves the row's content; false when it stayed where it was.
     Q_INVOKABLE bool scrollSideways(int row, double by);
     Q_INVOKABLE void pressSaveButton();
+    /// The row that was found and is still to be brought into sight; -1 when there is none. Asked once.
+    Q_INVOKABLE int takeRowToShow();
     /// The page has left the screen for good.
     Q_INVOKABLE void didLeave();
 
@@ -89,6 +91,7 @@ signals:
     void titleChanged();
     void toolbarChanged();
     void selectedRowChanged();
+    void rowToShowChanged();
 
 private:
     bool isTop() const;

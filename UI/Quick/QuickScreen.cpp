@@ -1,10 +1,13 @@
 #include "UI/Quick/QuickScreen.h"
 
+#include "UI/AboutText.h"
 #include "UI/NavigationController.h"
 #include "UI/Quick/QuickText.h"
 #include "UI/SpectrelApp.h"
 
+#include <QClipboard>
 #include <QFontMetricsF>
+#include <QGuiApplication>
 
 #include <algorithm>
 #include <utility>
@@ -41,6 +44,7 @@ void QuickScreen::screenDidChange(ScreenPart part, Animation animation)
     switch (part) {
     case ScreenPart::Window:
         emit windowShownChanged();
+        emit _playback.changed();
         return adoptPanes(Animation::None);
     case ScreenPart::Navigation:
         return adoptPanes(animation);
@@ -55,6 +59,15 @@ void QuickScreen::screenDidChange(ScreenPart part, Animation animation)
     case ScreenPart::Text:
         if (_saveScreen)
             _saveScreen->textDidChange();
+        return;
+    case ScreenPart::Find:
+        return _find.findsDidChange();
+    case ScreenPart::Playback:
+        emit _playback.changed();
+        emit noticeChanged();
+        return;
+    case ScreenPart::Notice:
+        emit noticeChanged();
         return;
     }
 }
@@ -98,6 +111,12 @@ void QuickScreen::showAlert(const Alert& alert)
     emit alertChanged();
 }
 
+bool QuickScreen::copyToClipboard(const std::string& text, std::string&)
+{
+    QGuiApplication::clipboard()->setText(QString::fromStdString(text));
+    return true;
+}
+
 // ---- What the QML asks and tells
 
 bool QuickScreen::isWindowShown() const
@@ -127,6 +146,29 @@ QString QuickScreen::alertButton() const
     return hasAlert() ? shownText(_alerts.front().button) : QString();
 }
 
+QString QuickScreen::notice() const
+{
+    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    if (app && app->copying() && !app->copying()->message().empty())
+        return shownText(app->copying()->message());
+    return app && app->playback() ? shownText(app->playback()->notice()) : QString();
+}
+
+QString QuickScreen::aboutName()
+{
+    return shownText(AboutText::text().name);
+}
+
+QString QuickScreen::aboutVersion()
+{
+    return shownText(AboutText::text().version);
+}
+
+QString QuickScreen::aboutSummary()
+{
+    return shownText(AboutText::text().summary);
+}
+
 void QuickScreen::begin(double width, double height)
 {
     resize(width, height);
@@ -152,6 +194,27 @@ void QuickScreen::closeAlert()
         return;
     _alerts.pop_front();
     emit alertChanged();
+}
+
+void QuickScreen::copyRow(int row)
+{
+    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    if (app && app->copying() && row >= 0)
+        app->copying()->copyRow(*app->navController()->topViewController(), static_cast<std::size_t>(row));
+}
+
+void QuickScreen::copyPane()
+{
+    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    if (app && app->copying())
+        app->copying()->copyPane(*app->navController()->topViewController());
+}
+
+void QuickScreen::clearNotice()
+{
+    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    if (app && app->copying())
+        app->copying()->clearMessage();
 }
 
 void QuickScreen::quit()

@@ -43,7 +43,9 @@ ApplicationWindow {
     StackView {
         id: stack
         objectName: "stack"
-        anchors.fill: parent
+        anchors.top: parent.top
+        anchors.bottom: playbackBar.visible ? playbackBar.top : parent.bottom
+        width: parent.width
         focus: true
 
         pushEnter: Transition {
@@ -61,7 +63,28 @@ ApplicationWindow {
     }
     Component {
         id: panePage
-        PanePage { }
+        PanePage {
+            onAboutPressed: aboutBox.open()
+        }
+    }
+    PlaybackBar {
+        id: playbackBar
+        anchors.bottom: parent.bottom
+        width: parent.width
+        visible: playback.isThere
+        playback: window.screen.playback
+    }
+    Toast {
+        anchors.horizontalCenter: parent.horizontalCenter
+        anchors.bottom: stack.bottom
+        anchors.bottomMargin: 72
+        z: 1
+        screen: window.screen
+    }
+    FindSheet { find: window.screen.find }
+    AboutBox {
+        id: aboutBox
+        screen: window.screen
     }
     SaveSheet { id: saveSheet }
     AlertBox { screen: window.screen }
@@ -69,6 +92,19 @@ ApplicationWindow {
     Shortcut {
         sequences: [StandardKey.Save]
         onActivated: stack.currentItem?.pane.pressSaveButton()
+    }
+    Shortcut {
+        sequences: [StandardKey.Find]
+        enabled: !window.screen.saveScreen
+        onActivated: window.screen.find.open()
+    }
+    Shortcut {
+        sequences: [StandardKey.FindNext]
+        onActivated: window.screen.find.chooseNext()
+    }
+    Shortcut {
+        sequences: [StandardKey.FindPrevious]
+        onActivated: window.screen.find.choosePrevious()
     }
     Shortcut {
         sequences: [StandardKey.Quit]

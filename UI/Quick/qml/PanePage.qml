@@ -15,7 +15,10 @@ FocusScope {
 
     Accessible.role: Accessible.Pane
     Accessible.name: pane.title
+    Component.onCompleted: showRow(pane.takeRowToShow())
     Component.onDestruction: pane.didLeave()
+
+    signal aboutPressed
 
     Rectangle {
         anchors.fill: parent
@@ -26,6 +29,8 @@ FocusScope {
         width: parent.width
         pane: page.pane
         onBackPressed: page.screen.back()
+        onFindPressed: page.screen.find.open()
+        onMenuPressed: page.openMenu()
     }
     ListView {
         id: list
@@ -58,6 +63,10 @@ FocusScope {
                 list.currentIndex = index;
                 page.pane.tap(index);
             }
+            onHeld: at => {
+                list.currentIndex = index;
+                page.openRowMenu(this, at);
+            }
         }
 
         onContentYChanged: tellVisibleRows()
@@ -78,7 +87,19 @@ FocusScope {
         pane: page.pane
     }
 
+    ActionMenu { id: menu }
+    Connections {
+        target: page.pane
+        function onRowToShowChanged() {
+            page.showRow(page.pane.takeRowToShow());
+        }
+    }
+
     Keys.onPressed: event => {
+        if (event.matches(StandardKey.Copy)) {
+            event.accepted = true;
+            return copy();
+        }
         if (event.modifiers & (Qt.ControlModifier | Qt.AltModifier | Qt.MetaModifier))
             return;
         event.accepted = true;
@@ -91,8 +112,8 @@ FocusScope {
         case Qt.Key_Home: return moveBy(-list.count);
         case Qt.Key_End: return moveBy(list.count);
         case Qt.Key_Return:
-        case Qt.Key_Enter:
-        case Qt.Key_Space: return open();
+        case Qt.Key_Enter: return open();
+        case Qt.Key_Space: return screen.playback.isThere ? screen.playback.togglePlaying() : open();
         case Qt.Key_Right:
             if (list.currentItem?.isInner)
                 open();
@@ -107,7 +128,28 @@ FocusScope {
         case Qt.Key_Escape:
         case Qt.Key_Back: return screen.back();
         }
-        event.accepted = false;
+        event.accepted = screen.playback.isThere && playbackKey(event.text);
+    }
+
+    // The same keys as in the terminal.
+    function playbackKey(text) {
+        const playback = screen.playback;
+        switch (text) {
+        case ".": playback.stepMessage(1); return true;
+        case ",": playback.stepMessage(-1); return true;
+        case "]": playback.stepTick(1); return true;
+        case "[": playback.stepTick(-1); return true;
+        case ">": playback.seekStep(1); return true;
+        case "<": playback.seekStep(-1); return true;
+        case "+":
+        case "=": playback.changeSpeed(1); return true;
+        case "-": playback.changeSpeed(-1); return true;
+        case "$": playback.seekToFraction(1); return true;
+        }
+        if (text < "0" || text > "9")
+            return false;
+        playback.seekToFraction(parseInt(text) / 10);
+        return true;
     }
 
     // The first key only shows where the keyboard is.
@@ -116,6 +158,45 @@ FocusScope {
             list.currentIndex = Math.max(0, Math.min(list.count - 1, list.currentIndex + rows));
         showsCursor = true;
         list.positionViewAtIndex(list.currentIndex, ListView.Contain);
+    }
+
+    function showRow(row) {
+        if (row < 0)
+            return;
+        showsCursor = true;
+        list.currentIndex = row;
+        list.positionViewAtIndex(row, ListView.Contain);
+    }
+
+    // The row where the keyboard is; the whole pane where it is not in use.
+    function copy() {
+        if (showsCursor)
+            screen.copyRow(list.currentIndex);
+        else
+            screen.copyPane();
+    }
+
+    function rowActions(row, name) {
+        return [{ name: "copyRow", text: qsTr("Copy \u201c%1\u201d").arg(name), run: () => screen.copyRow(row) },
+                { name: "copyPane", text: qsTr("Copy whole pane"), run: () => screen.copyPane() }];
+    }
+
+    function openMenu() {
+        const current = showsCursor ? list.currentItem : null;
+        const copying = current ? rowActions(current.index, current.name) : rowActions(-1, "").slice(1);
+        menu.actions = [{ name: "find", text: qsTr("Find\u2026"), run: () => screen.find.open() }, ...copying,
+                        { name: "about", text: qsTr("About Spectrel"), run: () => aboutPressed() }];
+        menu.x = width - menu.width - 8;
+        menu.y = titleBar.height - 8;
+        menu.open();
+    }
+
+    function openRowMenu(row, at) {
+        const place = row.mapToItem(page, at.x, at.y);
+        menu.actions = rowActions(row.index, row.name);
+        menu.x = Math.min(place.x, width - menu.width - 8);
+        menu.y = Math.min(place.y, height - menu.implicitHeight - 8);
+        menu.open();
     }
 
     function open() {

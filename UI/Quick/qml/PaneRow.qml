@@ -21,6 +21,7 @@ Item {
     readonly property bool isPressed: tapBeside.pressed || tapWithin.pressed
 
     signal tapped
+    signal held(point at) // held down, or pressed with the right button
 
     objectName: "row"
     implicitHeight: 50
@@ -59,6 +60,12 @@ Item {
         id: tapBeside
         enabled: !row.isScrollable
         onTapped: row.tapped()
+        onLongPressed: row.held(point.position)
+    }
+    TapHandler {
+        acceptedDevices: PointerDevice.Mouse | PointerDevice.TouchPad
+        acceptedButtons: Qt.RightButton
+        onTapped: row.held(point.position)
     }
 
     Flickable {
@@ -82,6 +89,7 @@ Item {
             id: tapWithin
             enabled: row.isScrollable
             onTapped: row.tapped()
+            onLongPressed: row.held(row.mapFromItem(area, point.position))
         }
         Text {
             objectName: "name"

@@ -111,39 +111,22 @@ Popup {
             color: Theme.faint
             Accessible.ignored: true
         }
-        TextField {
+        LineField {
             id: field
             objectName: "description"
             anchors.top: descriptionTitle.bottom
             anchors.topMargin: 6
             x: Theme.margin
             width: parent.width - 2 * Theme.margin
-            height: Theme.touch
-            leftPadding: 16
-            rightPadding: 16
-            font.pixelSize: 16
-            color: Theme.text
-            selectionColor: Theme.accent
-            selectedTextColor: Theme.accentText
             placeholderText: qsTr("What is worth keeping here?")
-            placeholderTextColor: Theme.faint
-            Accessible.name: qsTr("Description")
-            Accessible.role: Accessible.EditableText
-            // A text that the input method still composes was typed, too.
-            onTextEdited: sheet.save?.edit(text)
-            onPreeditTextChanged: sheet.save?.edit(text.slice(0, cursorPosition) + preeditText + text.slice(cursorPosition))
+            Accessible.name: descriptionTitle.text
+            onTypedChanged: sheet.save?.edit(typed)
             onActiveFocusChanged: {
                 if (activeFocus)
                     sheet.save?.beginEditing();
             }
             Keys.onReturnPressed: sheet.save?.pressReturn()
             Keys.onEnterPressed: sheet.save?.pressReturn()
-            background: Rectangle {
-                radius: Theme.radius
-                color: Theme.surface
-                border.width: field.activeFocus ? 2 : 1
-                border.color: field.activeFocus ? Theme.accent : Theme.line
-            }
         }
         Text {
             id: listTitle

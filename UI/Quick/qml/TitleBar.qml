@@ -8,6 +8,8 @@ Item {
 
     required property PaneModel pane
     signal backPressed
+    signal findPressed
+    signal menuPressed
 
     implicitHeight: 60
 
@@ -60,6 +62,18 @@ Item {
                 Accessible.role: Accessible.StaticText
                 Accessible.name: text
             }
+        }
+        IconButton {
+            objectName: "findButton"
+            shape: Glyph.Search
+            text: qsTr("Find")
+            onClicked: bar.findPressed()
+        }
+        IconButton {
+            objectName: "menuButton"
+            shape: Glyph.More
+            text: qsTr("Menu")
+            onClicked: bar.menuPressed()
         }
     }
 }

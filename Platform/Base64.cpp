@@ -1,4 +1,4 @@
-#include "Platform/Expat/Base64.h"
+#include "Platform/Base64.h"
 
 #include <array>
 #include <cstddef>
