@@ -79,6 +79,10 @@ Drawing drawingOf(Glyph::Shape shape)
         return drawing.arc(12, 12, 9, 90, -270);
     case Shape::Mark:
         return drawing.bar(2.5, 14, 3.4, 7).bar(7.7, 9.5, 3.4, 11.5).bar(12.9, 3, 3.4, 18).bar(18.1, 11.5, 3.4, 9.5);
+    case Shape::Plus:
+        return drawing.line({{12, 5}, {12, 19}}).line({{5, 12}, {19, 12}});
+    case Shape::Minus:
+        return drawing.line({{5, 12}, {19, 12}});
     case Shape::Play:
         return drawing.area({{7, 4}, {20, 12}, {7, 20}});
     case Shape::Pause:

@@ -25,6 +25,8 @@ public:
         Clear,
         Arc, // of the loading indicator
         Mark, // the application's own
+        Plus,
+        Minus,
         Play,
         Pause,
         StepBack,

@@ -31,13 +31,28 @@ Rectangle {
             Accessible.role: Accessible.StaticText
             Accessible.name: text
         }
-        Item { Layout.fillWidth: true }
         Text {
             objectName: "playbackMessages"
+            visible: bar.width >= 420
+            Layout.fillWidth: true
             text: bar.playback.messagesText
             font.pixelSize: 13
             color: Theme.faint
             elide: Text.ElideRight
+            horizontalAlignment: Text.AlignHCenter
+            Accessible.role: Accessible.StaticText
+            Accessible.name: text
+        }
+        Item {
+            visible: bar.width < 420
+            Layout.fillWidth: true
+        }
+        Text {
+            objectName: "playbackState"
+            text: bar.playback.stateText
+            font.pixelSize: 13
+            font.bold: true
+            color: Theme.accent
             Accessible.role: Accessible.StaticText
             Accessible.name: text
         }
@@ -92,20 +107,15 @@ Rectangle {
         anchors.bottom: parent.bottom
         anchors.horizontalCenter: parent.horizontalCenter
         height: Theme.touch
-        width: Math.min(parent.width, 480) - 16
         spacing: 0
 
-        Text {
-            objectName: "playbackState"
-            Layout.preferredWidth: 72
-            leftPadding: 12
-            text: bar.playback.stateText
-            font.pixelSize: 13
-            color: Theme.faint
-            Accessible.role: Accessible.StaticText
-            Accessible.name: text
+        IconButton {
+            objectName: "slower"
+            shape: Glyph.Minus
+            size: 20
+            text: qsTr("Slower")
+            onClicked: bar.playback.changeSpeed(-1)
         }
-        Item { Layout.fillWidth: true }
         IconButton {
             objectName: "seekBack"
             shape: Glyph.SkipBack
@@ -141,10 +151,10 @@ Rectangle {
             text: qsTr("Ten seconds on")
             onClicked: bar.playback.seekStep(1)
         }
-        Item { Layout.fillWidth: true }
-        SheetButton {
+        IconButton {
             objectName: "faster"
-            Layout.preferredWidth: 72
+            shape: Glyph.Plus
+            size: 20
             text: qsTr("Faster")
             onClicked: bar.playback.changeSpeed(1)
         }
