@@ -11,6 +11,7 @@
 #include <QIcon>
 
 #include <clocale>
+#include <csignal>
 
 namespace {
 
@@ -26,6 +27,7 @@ int main(int argc, char** argv)
     if (const auto status = readArguments(argc, argv, arguments))
         return *status;
 
+    std::signal(SIGXFSZ, SIG_IGN); // a file grown too large is a failed write like any other
     const DirectoryResources resources(arguments.resources.value_or(Places::resourcesDirectory()));
     Resources::install(&resources);
     StandardOutputConsole console;
