@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CommandLine/Decode.h"
+#include "CommandLine/ExitStatus.h"
 #include "CommandLine/Record.h"
 #include "CommandLine/View.h"
 #include "CommandLine/Watch.h"
@@ -29,13 +30,6 @@ struct Arguments {
     WatchOptions watch;
     RecordOptions record;
 };
-
-/// Exit statuses of every program.
-namespace ExitStatus {
-inline constexpr int Done = 0;
-inline constexpr int Failed = 1;
-inline constexpr int WrongUsage = 2;
-} // namespace ExitStatus
 
 /// Reads the command line. An exit status when the program is done with that: after --help, --version or wrong usage,
 /// each told on the stream where it belongs.
