@@ -46,16 +46,16 @@ Value registration(const IFXWorld& world)
     });
 }
 
-/// The carrier of a connection: hopping ones have a list, others a single channel.
+/// Calls hop over some channels; the list is empty but for its heading otherwise.
 Value carrier(const IFXWorld& world)
 {
     const std::string channel = std::to_string(world.serving().channel);
-    if (!world.isTalking())
-        return Dictionary::make({{"ARFCN", channel}});
-    return Dictionary::make({
-        {"ARFCN", channel},
-        {"Hopping", List::make({"ARFCN", channel, std::to_string(world.serving().channel + 6), "118"})},
-    });
+    auto hopping = List::make({"ARFCN"});
+    if (world.isTalking()) {
+        for (const std::string& hop : {channel, std::to_string(world.serving().channel + 6), std::string("118")})
+            hopping->append(hop);
+    }
+    return Dictionary::make({{"ARFCN", channel}, {"Hopping", hopping}});
 }
 
 Value servingCell(const IFXWorld& world)
@@ -90,14 +90,15 @@ Value neighbourCells(const IFXWorld& world)
     return list;
 }
 
-Value calls(const IFXWorld& world)
+/// Every value is wrapped once or twice, as this baseband does it where a value might have company.
+Value call(const IFXWorld& world)
 {
-    if (!world.isTalking())
-        return Dictionary::make({{"State", "No call"}});
+    const bool isTalking = world.isTalking();
     return Dictionary::make({
-        {"State", "Active"},
-        {"Duration", std::to_string(world.talkingFor().count()) + " s"},
-        {"Channel", Dictionary::make({{"Type", "TCH/F"}, {"Codec", Dictionary::make({{"Rate", "AMR 12.2"}})}})},
+        {"State", isTalking ? "Active" : "No call"},
+        {"Duration", Dictionary::make({{"Seconds", std::to_string(world.talkingFor().count())}})},
+        {"Channel", Dictionary::make({{"Type", isTalking ? "TCH/F" : "None"}})},
+        {"Codec", Dictionary::make({{"Speech", Dictionary::make({{"Mode", isTalking ? "AMR 12.2" : "None"}})}})},
     });
 }
 
@@ -124,7 +125,7 @@ Value ifxState(const IFXWorld& world)
         {"Registration", registration(world)},
         {"Serving Cell", servingCell(world)},
         {"Neighbour Cells", neighbourCells(world)},
-        {"Call", calls(world)},
+        {"Call", call(world)},
         {"Packet Data", packetData(world)},
         {"SIM", Dictionary::make({{"State", Dictionary::make({{"Card", "Ready"}})}})},
     });

@@ -51,7 +51,7 @@ double inDecibels(double ratio)
 CDMASector sectorOf(std::size_t site)
 {
     CDMASector sector;
-    sector.pn = static_cast<std::uint16_t>(4 * (site * 37 % 128)); // neighbours far apart, PN_INC 4
+    sector.pn = static_cast<std::uint16_t>(4 * ((11 + site * 37) % 128)); // neighbours far apart, PN_INC 4
     sector.isHome = site < Sites / 2;
     sector.systemId = sector.isHome ? 16420 : 16422;
     sector.networkId = static_cast<std::uint16_t>(1 + site / 4);

@@ -98,10 +98,12 @@ TEST_F(IFXReportTest, StateIsShownAsItIs)
         ASSERT_EQ(list->count(), neighbours.size()) << "without the heading";
         for (std::size_t index = 0; index < neighbours.size(); ++index)
             EXPECT_EQ((*(*list)[index].dictionary())["ARFCN"], Value(std::to_string(neighbours[index]->channel)));
-        if (world.isTalking())
-            EXPECT_EQ(shown({"Call", "State"}), Value("Active"));
-        else
-            EXPECT_EQ(shown({"Call"}), Value("No call")) << "its only entry";
+        EXPECT_EQ(displayText(shown({"Call"})),
+            world.isTalking()
+                ? "{\"State\": \"Active\", \"Duration\": \"" + std::to_string(world.talkingFor().count())
+                    + "\", \"Channel\": \"TCH/F\", \"Codec\": \"AMR 12.2\"}"
+                : "{\"State\": \"No call\", \"Duration\": \"0\", \"Channel\": \"None\", \"Codec\": \"None\"}");
+        EXPECT_EQ(shown({"Serving Cell", "Carrier", "Hopping"}).list()->count(), world.isTalking() ? 3u : 0u);
         const auto& contexts = shown({"Packet Data", "Contexts"}).list();
         ASSERT_EQ(contexts->count(), 1u);
         EXPECT_EQ((*(*contexts)[0].dictionary())["Bytes Received"], Value(std::to_string(world.bytesReceived())));
