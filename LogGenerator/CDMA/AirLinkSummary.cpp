@@ -4,7 +4,6 @@
 #include "Platform/SystemLog.h"
 
 #include <array>
-#include <cstdio>
 
 namespace spectrel {
 
@@ -19,12 +18,14 @@ std::string_view pilotOffset(std::uint32_t value, TextBuffer& buffer)
     return value == 0xFFFF ? "Invalid Value" : buffer.decimal(value).text(" \u00D7 64chips").view();
 }
 
-/// "0x%06x".
+/// "0x%06x" of a field of 24 bits.
 std::string_view sixHexDigits(std::uint32_t value, TextBuffer& buffer)
 {
-    char text[16];
-    const int length = std::snprintf(text, sizeof text, "0x%06x", value);
-    return buffer.text({text, static_cast<std::size_t>(length)}).view();
+    constexpr std::string_view Digits = "0123456789abcdef";
+    buffer.text("0x");
+    for (int shift = 20; shift >= 0; shift -= 4)
+        buffer.text(Digits.substr(value >> shift & 0xF, 1));
+    return buffer.view();
 }
 
 constexpr std::array<Field, 4> AnyStateFields {{

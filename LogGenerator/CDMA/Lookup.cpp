@@ -14,13 +14,13 @@ constexpr std::string_view HolderKey = "dict";
 template <typename Store> void atEachPosition(std::string_view variable, const Value& lookup, Store store)
 {
     const auto& variables = lookup.dictionary();
-    const ListRef positions = variables ? (*variables)[variable].list() : nullptr;
+    const List* positions = variables ? (*variables)[variable].list().get() : nullptr;
     if (!positions)
         return;
     for (const Value& element : positions->elements()) {
         const auto& position = element.dictionary();
         const std::string* label = position ? (*position)[LabelKey].string() : nullptr;
-        const DictionaryRef holder = position ? (*position)[HolderKey].dictionary() : nullptr;
+        Dictionary* holder = position ? (*position)[HolderKey].dictionary().get() : nullptr;
         if (!label || !holder)
             return;
         store(*holder, *label);
