@@ -1,5 +1,5 @@
 #!/usr/bin/env python3
-"""Writes the seeds of the property-list, recording and GSM/UMTS corpora beside itself; found inputs stay as they are."""
+"""Writes the seeds of the corpora (but for LTE's) beside itself; found inputs stay as they are."""
 import datetime
 import pathlib
 import plistlib
@@ -76,7 +76,38 @@ def seeds():
         "history.bin.spectrel": snapshot([entry, refused], plistlib.FMT_BINARY),
         "reports.spectrel": snapshot([{"DisplayState": {"Cell": {"ARFCN": "12"}}, "Date": "never"}], plistlib.FMT_XML),
     }
-    return {"fuzz_property_list": lists, "fuzz_recording": recordings, "fuzz_update_gsm": gsm_records()}
+    return {"fuzz_property_list": lists, "fuzz_recording": recordings, "fuzz_update_gsm": gsm_records(),
+            "fuzz_update_cdma": cdma(), "fuzz_update_ifx": ifx()}
+
+
+def messages(golden):
+    data = (HERE / "../../Tests/Golden" / golden).read_bytes()
+    place = 24
+    while place < len(data):
+        size = struct.unpack_from("<I", data, place + 8)[0]
+        yield data[place + 16:place + 16 + size]
+        place += 16 + size
+
+
+def cdma():
+    seeds = {}
+    for message in messages("cdma-drive.pcap"):  # the last of each code
+        seeds[f"{struct.unpack_from('<H', message, 3)[0]:04x}"] = message
+    chain = struct.pack("<BBH", 1, 255, 0)
+    seeds["endless"] = record(0x119C, chain + struct.pack("<BBH", 1, 0, 0) + bytes(20))
+    seeds["escaping"] = record(0x119D, chain + struct.pack("<BBH", 9, 0, 0xFFFF))
+    seeds["at-bound"] = record(0x119D, struct.pack("<BBH", 1, 1, 0) + struct.pack("<BBH", 11, 0, 21))
+    seeds["missing"] = record(0x119C, struct.pack("<BBH", 1, 1, 0) + struct.pack("<BBHI", 1, 0, 8, 8))
+    seeds["wrapped"] = b"\x81\x00" + seeds["1183"]
+    seeds["wrong-type"] = b"\x02" + seeds["1183"][1:]
+    return seeds
+
+
+def ifx():
+    whole = next(messages("ifx-drive.pcap"))
+    nested = [["h", {"a": {"b": {"c": "x"}}}, []], {"n": 5, "d": b"x", "t": True}, "text"]
+    return {"report": whole, "binary": plistlib.dumps(plistlib.loads(whole), fmt=plistlib.FMT_BINARY),
+            "nested": plistlib.dumps(nested), "number": plistlib.dumps(5), "text": plistlib.dumps("x"), "cut": whole[:200]}
 
 
 for target, inputs in seeds().items():
