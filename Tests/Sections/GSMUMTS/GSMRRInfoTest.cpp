@@ -85,6 +85,15 @@ TEST_F(GSMRRInfoTest, DRXIsShownInSeconds)
     EXPECT_EQ(display(), "{\"DRX Used\": \"255 sec\"}");
 }
 
+TEST_F(GSMRRInfoTest, BytesAreUnsigned)
+{
+    deliver(0x512C, RecordBuilder(0x512C, 17).u8(14, 254).u8(15, 255));
+    deliver(0x5137, RecordBuilder(0x5137, 29).u8(15, 253));
+    EXPECT_EQ(shown("RR Sub State"), "\"254\"");
+    EXPECT_EQ(shown("RR Status"), "\"255\"");
+    EXPECT_EQ(shown("Serving Rx Level"), "\"253\"");
+}
+
 TEST_F(GSMRRInfoTest, OtherCodeIsLoggedAsUnknown)
 {
     deliver(0x51F5, RecordBuilder(0x51F5, 60));
