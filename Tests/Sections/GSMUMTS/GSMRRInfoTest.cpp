@@ -61,8 +61,9 @@ TEST_F(GSMRRInfoTest, MeasurementIsShownInOrder)
 {
     deliver(0x5137, RecordBuilder(0x5137, 28).u8(15, 63));
     EXPECT_EQ(display(), "{}");
-    deliver(0x5137, RecordBuilder(0x5137, 29).u8(15, 63).u32(16, 7).u32(20, 0xFFFFFFFF));
-    EXPECT_EQ(display(), "{\"Serving Rx Level\": \"63\", \"Rx Quality Full\": \"7\", \"Rx Quality Sub\": \"-1\"}");
+    deliver(0x5137, RecordBuilder(0x5137, 29).u8(15, 63).u32(16, 0x12345678).u32(20, 0xFFFFFFFF));
+    EXPECT_EQ(
+        display(), "{\"Serving Rx Level\": \"63\", \"Rx Quality Full\": \"305419896\", \"Rx Quality Sub\": \"-1\"}");
     EXPECT_EQ(log(), std::string(Trace) + Trace);
 }
 
