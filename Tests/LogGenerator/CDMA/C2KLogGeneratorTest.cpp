@@ -223,7 +223,7 @@ TEST(LookupTest, ValueIsLostWithoutALookupOrItsVariable)
 TEST(LookupTest, FirstPositionThatIsNoneEndsTheLoop)
 {
     auto shown = Dictionary::make();
-    const auto position = [&shown](const Value& key, const Value& holder) {
+    const auto position = [](const Value& key, const Value& holder) {
         return Dictionary::make({{"key", key}, {"dict", holder}});
     };
     const std::initializer_list<Value> broken {
