@@ -144,6 +144,8 @@ Bytes simFiles(const World& world, Moment time)
 
 constexpr auto Cadences = std::to_array<Cadence<World>>({
     {30s, true, simFiles},
+    {100ms, false, onChange<&Situation::knownLocation, simFiles>},
+    {100ms, false, onChange<&Situation::knownRouting, simFiles>},
     {10s, true, registration},
     {100ms, false, onChange<&Situation::registration, registration>},
     {10s, true, mm},
@@ -153,6 +155,7 @@ constexpr auto Cadences = std::to_array<Cadence<World>>({
     {10s, true, network},
     {100ms, false, onChange<&Situation::network, network>},
     {30s, true, equivalents},
+    {100ms, false, onChange<&Situation::knownLocation, equivalents>}, // the update's answer tells them
 
     {10s, true, onUMTS<rrc>},
     {100ms, false, onChange<&Situation::rrc, rrc>},

@@ -213,6 +213,8 @@ Situation GSMUMTSWorld::situation() const
     situation.gmm = _mobility.gmm();
     situation.registration = _mobility.registration();
     situation.network = network();
+    situation.knownLocation = _mobility.knownLocation();
+    situation.knownRouting = _mobility.knownRouting();
     situation.rrc = _umts.state();
     situation.isCiphering = _umts.isCiphering();
     situation.rr = _gsm.rr();

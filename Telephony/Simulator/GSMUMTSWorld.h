@@ -20,6 +20,8 @@ struct Situation {
     GMMReport gmm;
     RegistrationReport registration;
     NetworkReport network;
+    Place knownLocation; // registered for calls
+    Place knownRouting; // and for packets
     RRCState rrc = RRCState::Disconnected;
     bool isCiphering = false;
     RRReport rr;

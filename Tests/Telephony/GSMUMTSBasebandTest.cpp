@@ -96,7 +96,7 @@ TEST_F(GSMUMTSBasebandTest, RatesAreNatural)
     const std::size_t measured = count(0x417A) + count(0x4005) + count(0x5137);
     EXPECT_GT(measured, 600u) << "the phone listens more than once a second";
     EXPECT_LT(measured, 3000u);
-    EXPECT_LT(count(0xFF0000), 30u);
+    EXPECT_LT(count(0xFF0000), 60u) << "twice a minute and with every registered area";
     EXPECT_LT(count(0xFF0001), 200u) << "every five seconds and with every new cell";
 }
 
@@ -179,6 +179,14 @@ TEST_F(GSMUMTSBasebandTest, CardKnowsTheAreasThatThePhoneIsRegisteredIn)
     EXPECT_TRUE(areas.contains("04B1 01"));
     EXPECT_TRUE(areas.contains("04B2 02"));
     EXPECT_TRUE(areas.contains("04BB 0B"));
+}
+
+TEST_F(GSMUMTSBasebandTest, UpdateIsAnsweredWithTheEquivalentNetworks)
+{
+    start(Scene::Drive, 28);
+    drive(20s);
+    ASSERT_GE(count(0x7150), 1u);
+    EXPECT_GT(records.at(0x7150).back()[16], 0) << "none before the first update, some after it";
 }
 
 TEST_F(GSMUMTSBasebandTest, ContextsAreThereOnlyDuringASession)
