@@ -6,6 +6,7 @@
 #include "Platform/Console.h"
 #include "Platform/Environment.h"
 #include "Platform/Resources.h"
+#include "Platform/Syslog/DiagnosticFile.h"
 #include "Platform/Syslog/FileLog.h"
 #include "Platform/Syslog/SyslogLog.h"
 
@@ -24,6 +25,33 @@ class Logging {
 public:
     bool start(const Arguments& arguments)
     {
+        return startDiagnostics() && startLog(arguments);
+    }
+
+    /// False when a line could not be written.
+    bool finish(const Arguments& arguments)
+    {
+        SystemLog::install(nullptr, -1);
+        if (!_file || _file->flush())
+            return true;
+        report(*arguments.logFile + ": the log could not be written whole");
+        return false;
+    }
+
+private:
+    bool startDiagnostics()
+    {
+        const std::string path = Places::diagnosticLog();
+        std::string reason;
+        if (!path.empty() && !(_diagnostics = DiagnosticFile::create(path, reason))) {
+            report(path + ": " + reason);
+            return false;
+        }
+        return true;
+    }
+
+    bool startLog(const Arguments& arguments)
+    {
         if (arguments.logFile) {
             const bool isLive = arguments.job != Job::Decode;
             std::string reason;
@@ -41,17 +69,7 @@ public:
         return true;
     }
 
-    /// False when a line could not be written.
-    bool finish(const Arguments& arguments)
-    {
-        SystemLog::install(nullptr, -1);
-        if (!_file || _file->flush())
-            return true;
-        report(*arguments.logFile + ": the log could not be written whole");
-        return false;
-    }
-
-private:
+    std::unique_ptr<DiagnosticFile> _diagnostics;
     std::unique_ptr<FileLog> _file;
     std::unique_ptr<SyslogLog> _system;
 };

@@ -27,13 +27,7 @@ DetectedCells::DetectedCells(ClassDictionary& dict, CodeDictionary& codeDict)
 void DetectedCells::decode(RecordView record)
 {
     clearList();
-    const ConnectedModeRecord measurement(record);
-    if (measurement.detectedCount() == 0)
-        return;
-    List cells;
-    for (std::size_t index = 0; index < measurement.detectedCount(); ++index)
-        cells.append(entryWithFields(record, EntryFields, measurement.detectedCell(index)));
-    replaceList(cells);
+    replaceList(*entriesWithFields(record, ConnectedModeRecord::detectedCells(record), EntryFields));
 }
 
 } // namespace spectrel

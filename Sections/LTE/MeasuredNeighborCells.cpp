@@ -29,13 +29,7 @@ MeasuredNeighborCells::MeasuredNeighborCells(ClassDictionary& dict, CodeDictiona
 void MeasuredNeighborCells::decode(RecordView record)
 {
     clearList();
-    const ConnectedModeRecord measurement(record);
-    if (measurement.measuredCount() == 0)
-        return;
-    List cells;
-    for (std::size_t index = 0; index < measurement.measuredCount(); ++index)
-        cells.append(entryWithFields(record, EntryFields, measurement.measuredNeighbour(index)));
-    replaceList(cells);
+    replaceList(*entriesWithFields(record, ConnectedModeRecord::measuredNeighbours(record), EntryFields));
 }
 
 } // namespace spectrel

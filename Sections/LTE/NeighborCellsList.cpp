@@ -59,16 +59,12 @@ NeighborCellsList::NeighborCellsList(ClassDictionary& dict, CodeDictionary& code
 void NeighborCellsList::decode(RecordView record)
 {
     clearList();
-    const IdleNeighbourRecord measurement(record);
-    SPECTREL_LOG(Priority::Warning, "Number of neighboring cells being reported: %d\n",
-        static_cast<int>(measurement.last() + 1));
-    List cells;
-    for (std::size_t index = 0; index <= measurement.last(); ++index) {
-        const std::size_t start = measurement.neighbour(index);
-        logNeighbour(record, start);
-        cells.append(entryWithFields(record, EntryFields, start));
-    }
-    replaceList(cells);
+    const RepeatedGroup neighbours = IdleNeighbourRecord::neighbours(record);
+    SPECTREL_LOG(
+        Priority::Warning, "Number of neighboring cells being reported: %d\n", static_cast<int>(neighbours.count));
+    for (std::size_t index = 0; index < neighbours.count; ++index)
+        logNeighbour(record, neighbours.entry(index));
+    replaceList(*entriesWithFields(record, neighbours, EntryFields));
 }
 
 } // namespace spectrel

@@ -13,8 +13,6 @@ namespace {
 constexpr RecordKind OwnRecord =
     lteKind("Reselection Candidates List", ReselectionRecord::Code, ReselectionRecord::MinimumLength);
 
-using View = ReselectionRecord::View;
-
 // Offsets from a candidate's start.
 constexpr std::array<Field, 1> CommonFields {{
     {0, Width::U16, "Candidate Priority", decimal},
@@ -38,32 +36,43 @@ constexpr std::array<Field, 3> CDMAFields {{
     {10, Width::U16, "Pilot", decimal},
 }};
 
+/// A candidate's further fields; technologies `first` to `last` have them.
+struct View {
+    std::uint16_t first;
+    std::uint16_t last;
+    std::span<const Field> fields;
+};
+constexpr View LTEView {0, 0, LTEFields};
+constexpr View UTRANView {1, 1, UTRANFields};
+constexpr View GERANView {2, 2, GERANFields};
+constexpr View CDMAView {3, 4, CDMAFields};
+
 struct CandidateTechnology {
     std::string_view name;
-    View view;
-    std::span<const Field> fields;
+    const View& view;
 };
 
 /// By the technology's number; any other is "??" and has no further fields.
 constexpr std::array<CandidateTechnology, 5> Technologies {{
-    {"LTE", View::LTE, LTEFields},
-    {"UTRAN", View::UTRAN, UTRANFields},
-    {"GERAN", View::GERAN, GERANFields},
-    {"CDMA1XRTT", View::CDMA, CDMAFields},
-    {"CDMAHRPD", View::CDMA, CDMAFields},
+    {"LTE", LTEView},
+    {"UTRAN", UTRANView},
+    {"GERAN", GERANView},
+    {"CDMA1XRTT", CDMAView},
+    {"CDMAHRPD", CDMAView},
 }};
 
-DictionaryRef candidateEntry(RecordView record, const ReselectionRecord& candidates, std::size_t index)
+DictionaryRef candidateEntry(RecordView record, std::size_t index)
 {
-    const DictionaryRef entry = entryWithFields(record, CommonFields, candidates.candidate(index));
-    const std::size_t number = candidates.technology(index);
+    const DictionaryRef entry =
+        entryWithFields(record, CommonFields, ReselectionRecord::candidates(record).entry(index));
+    const std::size_t number = ReselectionRecord::technology(record, index);
     if (number >= Technologies.size()) {
         entry->setText("Candidate RAT Type", "??");
         return entry;
     }
-    const CandidateTechnology& technology = Technologies[number];
-    entry->setText("Candidate RAT Type", technology.name);
-    storeFields(record, technology.fields, entry, candidates.candidateAs(technology.view, index));
+    const auto& [name, view] = Technologies[number];
+    entry->setText("Candidate RAT Type", name);
+    storeFields(record, view.fields, entry, ReselectionRecord::candidateAs(record, index, view.first, view.last));
     return entry;
 }
 
@@ -77,12 +86,9 @@ ReselectionCandidatesList::ReselectionCandidatesList(ClassDictionary& dict, Code
 void ReselectionCandidatesList::decode(RecordView record)
 {
     clearList();
-    const ReselectionRecord reselection(record);
-    if (reselection.candidatesToRead() == 0)
-        return;
     List candidates;
-    for (std::size_t index = 0; index < reselection.candidatesToRead(); ++index)
-        candidates.append(candidateEntry(record, reselection, index));
+    for (std::size_t index = 0; index < ReselectionRecord::candidatesToRead(record); ++index)
+        candidates.append(candidateEntry(record, index));
     replaceList(candidates);
 }
 

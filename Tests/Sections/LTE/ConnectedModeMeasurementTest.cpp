@@ -242,11 +242,12 @@ TEST_F(DetectedCellsTest, OtherCodeIsLoggedAsUnknown)
 TEST(ConnectedModeRecordTest, IndexNotBelowItsCountIsRaised)
 {
     const RecordBuilder bytes = twoMeasuredOneDetected();
-    const ConnectedModeRecord record {RecordView(bytes)};
-    EXPECT_EQ(record.measuredNeighbour(1), 35u);
-    EXPECT_THROW(record.measuredNeighbour(2), ArrayOutOfBoundsException);
-    EXPECT_EQ(record.detectedCell(0), 41u);
-    EXPECT_THROW(record.detectedCell(1), ArrayOutOfBoundsException);
+    const RepeatedGroup measured = ConnectedModeRecord::measuredNeighbours(ByteView(bytes));
+    EXPECT_EQ(measured.entry(1), 35u);
+    EXPECT_THROW(measured.entry(2), ArrayOutOfBoundsException);
+    const RepeatedGroup detected = ConnectedModeRecord::detectedCells(ByteView(bytes));
+    EXPECT_EQ(detected.entry(0), 41u);
+    EXPECT_THROW(detected.entry(1), ArrayOutOfBoundsException);
 }
 
 } // namespace

@@ -199,9 +199,9 @@ TEST_F(NeighborCellsListTest, OtherCodeIsLoggedAsUnknown)
 TEST(IdleNeighbourRecordTest, IndexAboveTheLastIsRaised)
 {
     const RecordBuilder bytes = RecordBuilder(Code, 21).u16(19, 1 << 6);
-    const IdleNeighbourRecord record {RecordView(bytes)};
-    EXPECT_EQ(record.neighbour(1), 41u);
-    EXPECT_THROW(record.neighbour(2), ArrayOutOfBoundsException);
+    const RepeatedGroup neighbours = IdleNeighbourRecord::neighbours(ByteView(bytes));
+    EXPECT_EQ(neighbours.entry(1), 41u);
+    EXPECT_THROW(neighbours.entry(2), ArrayOutOfBoundsException);
 }
 
 } // namespace

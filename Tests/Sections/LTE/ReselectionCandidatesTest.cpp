@@ -184,24 +184,23 @@ TEST_F(ReselectionCandidatesListTest, OtherCodeIsLoggedAsUnknown)
 TEST(ReselectionRecordTest, IndexNotBelowTheWholeCountIsRaised)
 {
     const RecordBuilder bytes = RecordBuilder(Code, 21).u16(19, 0x0101);
-    const ReselectionRecord record {RecordView(bytes)};
-    EXPECT_EQ(record.candidatesToRead(), 1u);
-    EXPECT_EQ(record.candidate(256), 21u + 4 * 256);
-    EXPECT_THROW(record.candidate(257), ArrayOutOfBoundsException);
+    const RecordView record = ByteView(bytes);
+    EXPECT_EQ(ReselectionRecord::candidatesToRead(record), 1u);
+    EXPECT_EQ(ReselectionRecord::candidates(record).entry(256), 21u + 4 * 256);
+    EXPECT_THROW(ReselectionRecord::candidates(record).entry(257), ArrayOutOfBoundsException);
 }
 
 TEST(ReselectionRecordTest, ViewOfAnotherTechnologyIsRaised)
 {
-    using View = ReselectionRecord::View;
-    constexpr View Views[] {View::LTE, View::UTRAN, View::GERAN, View::CDMA};
-    for (std::uint32_t technology = 0; technology < 6; ++technology) {
+    constexpr std::pair<std::uint16_t, std::uint16_t> Views[] {{0, 0}, {1, 1}, {2, 2}, {3, 4}};
+    for (std::uint16_t technology = 0; technology < 6; ++technology) {
         const RecordBuilder bytes = RecordBuilder(Code, 40).u16(19, 1).u16(23, technology);
-        const ReselectionRecord record {RecordView(bytes)};
-        for (std::uint32_t view = 0; view < 4; ++view) {
-            if (view == std::min(technology, 3u) && technology < 5)
-                EXPECT_EQ(record.candidateAs(Views[view], 0), 21u) << technology;
+        for (const auto& [first, last] : Views) {
+            if (technology == first || technology == last)
+                EXPECT_EQ(ReselectionRecord::candidateAs(ByteView(bytes), 0, first, last), 21u) << technology;
             else
-                EXPECT_THROW(record.candidateAs(Views[view], 0), ArrayOutOfBoundsException) << technology << view;
+                EXPECT_THROW(ReselectionRecord::candidateAs(ByteView(bytes), 0, first, last), ArrayOutOfBoundsException)
+                    << technology << first;
         }
     }
 }
