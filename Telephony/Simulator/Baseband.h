@@ -89,5 +89,6 @@ std::unique_ptr<Baseband> makeBaseband(Technology technology, Scene scene, std::
 
 // One for each technology that can be simulated.
 std::unique_ptr<Baseband> makeLTEBaseband(Scene scene, std::uint32_t seed);
+std::unique_ptr<Baseband> makeUTRANBaseband(Scene scene, std::uint32_t seed);
 
 } // namespace spectrel

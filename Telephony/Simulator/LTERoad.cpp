@@ -2,16 +2,13 @@
 
 #include <array>
 #include <cmath>
-#include <numbers>
 
 namespace spectrel {
 
 namespace {
 
 constexpr double SiteDistance = 500;
-constexpr double ValleyFrom = 2500; // metres; the sites at both ends stand
-constexpr double ValleyTo = 4500;
-constexpr double ValleyLoss = 16; // dB, in its middle
+constexpr Valley SiteLess {2500, 4500, 16}; // the sites at both ends stand
 
 constexpr double ResourceBlockElements = 12; // subcarriers of a resource block
 constexpr double Noise = -125; // dBm in one subcarrier of 15 kHz, noise figure 7 dB
@@ -79,15 +76,6 @@ double decibels(double milliwatts)
     return 10 * std::log10(milliwatts);
 }
 
-/// What the hills take where the phone is.
-double valleyLoss(const Journey& journey)
-{
-    constexpr double Middle = (ValleyFrom + ValleyTo) / 2;
-    constexpr double HalfWidth = (ValleyTo - ValleyFrom) / 2;
-    const double out = journey.distanceTo(Middle, 0) / HalfWidth;
-    return out >= 1 ? 0 : ValleyLoss * (1 + std::cos(out * std::numbers::pi)) / 2;
-}
-
 void filter(double& average, double measured)
 {
     average += (measured - average) * FilterGain;
@@ -105,7 +93,7 @@ LTERoad::LTERoad(Dice& dice)
 {
     std::uint32_t site = 4096;
     for (double position = 0; position < Length; position += SiteDistance, ++site) {
-        if (position <= ValleyFrom || position >= ValleyTo)
+        if (position <= SiteLess.from || position >= SiteLess.to)
             buildSite(site, position, dice);
     }
     for (std::size_t cell = 0; cell < _cells.size(); ++cell)
@@ -157,7 +145,7 @@ void LTERoad::advance(std::chrono::milliseconds step, const Journey& journey, Di
 
 void LTERoad::receive(const Journey& journey, Dice& dice)
 {
-    const double loss = valleyLoss(journey);
+    const double loss = SiteLess.lossAt(journey);
     for (std::size_t index = 0; index < _cells.size(); ++index) {
         LTECell& cell = _cells[index];
         const double distance = journey.distanceTo(cell.position, cell.offset);
