@@ -53,7 +53,7 @@ std::optional<std::size_t> LTEIdleMode::cycle()
         if (const auto cell = strongestSuitable())
             return cell;
     }
-    return bestOf(ReselectionTime);
+    return bestOf(ReselectionTime + Cycle); // seen at both ends of the time
 }
 
 void LTEIdleMode::judgeServing()
