@@ -1,5 +1,5 @@
 #!/usr/bin/env python3
-"""Writes the seeds of the property-list and recording corpora beside itself; found inputs stay as they are."""
+"""Writes the seeds of the property-list, recording and GSM/UMTS corpora beside itself; found inputs stay as they are."""
 import datetime
 import pathlib
 import plistlib
@@ -34,6 +34,30 @@ def snapshot(entries, form):
     return plistlib.dumps({"Timestamp": "2024-03-05 14:07:31 +0000", "Data": entries}, fmt=form, sort_keys=False)
 
 
+def gsm_records():
+    """One record of each code; where it holds lists, with two entries, and once with counts past its end."""
+    lengths = {0x4005: 32, 0x4031: 44, 0x4116: 34, 0x4125: 14, 0x4127: 29, 0x4157: 19, 0x417A: 134, 0x4221: 360, 0x5072: 20, 0x5076: 17, 0x512C: 17,
+               0x5134: 26, 0x5137: 57, 0x51F4: 15, 0x51F5: 18, 0x51F6: 24, 0x51F8: 19, 0x51FB: 34, 0x51FD: 35, 0x51FF: 23, 0x7130: 16, 0x7131: 16,
+               0x7132: 16, 0x7135: 32, 0x7150: 26}
+    counts = {0x4005: (13, 14), 0x4031: (14,), 0x4116: (13,), 0x417A: (15,), 0x4221: (16, 17), 0x5137: (28,), 0x51F8: (14,), 0x51FF: (14,), 0x7150: (16,)}
+    inputs = {}
+    for code, length in lengths.items():
+        content = bytearray(record(code, bytes(i % 256 for i in range(1, length - 12))))
+        for name, count in (("", 2), ("-past-its-end", 255)):
+            for offset in counts.get(code, ()):
+                content[offset] = count
+            if not name or code in counts:
+                inputs[f"{code:04x}{name}"] = bytes(content)
+    cell = "kRKCellMonitor"
+    numbers = {cell + key: i for i, key in enumerate(("MCC", "MNC", "LAC", "CellId", "UARFCN", "ARFCN", "SCN", "RSCP", "ECN0", "RSSI"))}
+    cells = [numbers | {cell + "CellRadioAccessTechnology": cell + "RadioAccessTechnology" + technology, cell + "CellType": cell + "CellType" + kind}
+             for technology in ("UMTS", "GSM") for kind in ("Serving", "Neighbor")]
+    inputs["cells"] = record(1, plistlib.dumps(cells, fmt=plistlib.FMT_BINARY), 0xFF)
+    inputs["sim"] = record(0, plistlib.dumps({"kSimFile_ICCID": "89"}, fmt=plistlib.FMT_BINARY), 0xFF)
+    inputs["contexts"] = b"\x81\x00" + record(2, plistlib.dumps([{"APN": "internet"}], fmt=plistlib.FMT_BINARY), 0xFF)
+    return inputs
+
+
 def seeds():
     lists = {"everything.xml": plistlib.dumps(EVERYTHING, sort_keys=False), "everything.bin": plistlib.dumps(EVERYTHING, fmt=plistlib.FMT_BINARY, sort_keys=False)}
     lists["one.bin"] = plistlib.dumps(True, fmt=plistlib.FMT_BINARY)
@@ -52,7 +76,7 @@ def seeds():
         "history.bin.spectrel": snapshot([entry, refused], plistlib.FMT_BINARY),
         "reports.spectrel": snapshot([{"DisplayState": {"Cell": {"ARFCN": "12"}}, "Date": "never"}], plistlib.FMT_XML),
     }
-    return {"fuzz_property_list": lists, "fuzz_recording": recordings}
+    return {"fuzz_property_list": lists, "fuzz_recording": recordings, "fuzz_update_gsm": gsm_records()}
 
 
 for target, inputs in seeds().items():

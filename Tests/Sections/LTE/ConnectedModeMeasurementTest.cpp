@@ -164,12 +164,11 @@ TEST_F(MeasuredNeighborCellsTest, RecordOf28BytesKeepsTheList)
 TEST_F(MeasuredNeighborCellsTest, CountBeyondTheRecordReadsZeros)
 {
     deliver(Code, RecordBuilder(Code, 31).u8(27, 255).u16(29, 7));
-    const std::string shown = display();
-    EXPECT_EQ(shown.find("[{\"Physical Cell ID\": \"7\", \"Filtered RSRP\": \"-140.00 dBm\", "), 0u) << shown;
-    std::size_t entries = 0;
-    for (std::size_t at = shown.find('{'); at != std::string::npos; at = shown.find('{', at + 1))
-        ++entries;
-    EXPECT_EQ(entries, 255u);
+    EXPECT_EQ(shownCount(), 255u);
+    EXPECT_EQ(shownEntry(0),
+        "{\"Physical Cell ID\": \"7\", \"Filtered RSRP\": \"-140.00 dBm\", \"Filtered RSRQ\": \"-20.00 dB\"}");
+    EXPECT_EQ(shownEntry(254),
+        "{\"Physical Cell ID\": \"0\", \"Filtered RSRP\": \"-140.00 dBm\", \"Filtered RSRQ\": \"-20.00 dB\"}");
 }
 
 TEST_F(MeasuredNeighborCellsTest, EveryBitOfTheSecondEntryShowsInItsOwnField)
