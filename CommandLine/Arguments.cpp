@@ -18,6 +18,7 @@ constexpr const char* Environment =
     "  SPECTREL_PORT_DIR       where the telephony service is met (default: $XDG_RUNTIME_DIR/spectrel)\n"
     "  SPECTREL_CRASH_LOG_DIR  where snapshots go (default: $XDG_STATE_HOME/spectrel/CrashReporter)\n"
     "  SPECTREL_DEVICE_ROOT    prefix of the device's absolute paths (default: /)\n"
+    "  SPECTREL_DIAGNOSTIC_LOG file for what the decoders tell their developers (default: none)\n"
     "  NO_COLOR                no colours in the terminal screens\n"
     "Exit status: 0 done, 1 something could not be done, 2 wrong usage.";
 

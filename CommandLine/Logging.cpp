@@ -1,6 +1,7 @@
 #include "CommandLine/Logging.h"
 
 #include "CommandLine/Report.h"
+#include "Platform/Environment.h"
 #include "Platform/SystemLog.h"
 
 namespace spectrel {
@@ -14,6 +15,22 @@ constexpr int EveryPriority = 7;
 } // namespace
 
 bool Logging::start(const std::optional<std::string>& file, Use use)
+{
+    return startDiagnostics() && startLog(file, use);
+}
+
+bool Logging::startDiagnostics()
+{
+    const std::string path = Places::diagnosticLog();
+    std::string reason;
+    if (!path.empty() && !(_diagnostics = DiagnosticFile::create(path, reason))) {
+        report(path + ": " + reason);
+        return false;
+    }
+    return true;
+}
+
+bool Logging::startLog(const std::optional<std::string>& file, Use use)
 {
     if (file) {
         _path = *file;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Platform/Syslog/DiagnosticFile.h"
 #include "Platform/Syslog/FileLog.h"
 #include "Platform/Syslog/SyslogLog.h"
 
@@ -10,7 +11,8 @@
 namespace spectrel {
 
 /// Chooses where log lines go: to a file every one of them; otherwise, for a live session, the urgent ones to the
-/// system log. Failures are told on standard error.
+/// system log. Diagnostic lines go to their own file, where the environment names one. Failures are told on standard
+/// error.
 class Logging {
 public:
     enum class Use { Live, Offline };
@@ -20,7 +22,11 @@ public:
     bool finish();
 
 private:
+    bool startDiagnostics();
+    bool startLog(const std::optional<std::string>& file, Use use);
+
     std::string _path;
+    std::unique_ptr<DiagnosticFile> _diagnostics;
     std::unique_ptr<FileLog> _file;
     std::unique_ptr<SyslogLog> _system;
 };

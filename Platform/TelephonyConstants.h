@@ -16,6 +16,7 @@ SPECTREL_TELEPHONY_CONSTANT(kRKLogChannelTechnology_Zephyr_UTRAN2);
 // Cell-information records (code 0xFF0001): one dictionary a cell.
 SPECTREL_TELEPHONY_CONSTANT(kRKCellMonitorCellRadioAccessTechnology);
 SPECTREL_TELEPHONY_CONSTANT(kRKCellMonitorRadioAccessTechnologyLTE);
+SPECTREL_TELEPHONY_CONSTANT(kRKCellMonitorRadioAccessTechnologyUTRAN2);
 SPECTREL_TELEPHONY_CONSTANT(kRKCellMonitorCellType);
 SPECTREL_TELEPHONY_CONSTANT(kRKCellMonitorCellTypeServing);
 SPECTREL_TELEPHONY_CONSTANT(kRKCellMonitorCellTypeNeighbor);

@@ -34,20 +34,41 @@ def snapshot(entries, form):
     return plistlib.dumps({"Timestamp": "2024-03-05 14:07:31 +0000", "Data": entries}, fmt=form, sort_keys=False)
 
 
-def gsm_records():
-    """One record of each code; where it holds lists, with two entries, and once with counts past its end."""
-    lengths = {0x4005: 32, 0x4031: 44, 0x4116: 34, 0x4125: 14, 0x4127: 29, 0x4157: 19, 0x417A: 134, 0x4221: 360, 0x5072: 20, 0x5076: 17, 0x512C: 17,
-               0x5134: 26, 0x5137: 57, 0x51F4: 15, 0x51F5: 18, 0x51F6: 24, 0x51F8: 19, 0x51FB: 34, 0x51FD: 35, 0x51FF: 23, 0x7130: 16, 0x7131: 16,
-               0x7132: 16, 0x7135: 32, 0x7150: 26}
-    counts = {0x4005: (13, 14), 0x4031: (14,), 0x4116: (13,), 0x417A: (15,), 0x4221: (16, 17), 0x5137: (28,), 0x51F8: (14,), 0x51FF: (14,), 0x7150: (16,)}
+def binary_records(lengths, counts):
+    """One record of each code; where it holds lists, with two entries, and once with counts past its end. `counts`: each code's (offset, unit of the count)."""
     inputs = {}
     for code, length in lengths.items():
         content = bytearray(record(code, bytes(i % 256 for i in range(1, length - 12))))
         for name, count in (("", 2), ("-past-its-end", 255)):
-            for offset in counts.get(code, ()):
-                content[offset] = count
+            for offset, unit in counts.get(code, ()):
+                content[offset] = 255 if name else count * unit & 255
             if not name or code in counts:
                 inputs[f"{code:04x}{name}"] = bytes(content)
+    return inputs
+
+
+def lte_records():
+    lengths = {0xB0C1: 22, 0xB0C2: 38, 0xB179: 45, 0xB17F: 33, 0xB180: 61, 0xB186: 37}
+    return binary_records(lengths, {0xB179: ((27, 1), (28, 1)), 0xB180: ((19, 64), (20, 0)), 0xB186: ((19, 1), (20, 0))})
+
+
+def utran_records():
+    lengths = {0xD0E0: 15, 0xD0E2: 26, 0xD00A: 200, 0xD00E: 33, 0xD00C: 373}
+    inputs = binary_records(lengths, {0xD00A: ((16, 2),), 0xD00E: ((16, 1),), 0xD00C: ((14, 64), (15, 16))})
+    cell = "kRKCellMonitor"
+    cells = [{cell + key: i for i, key in enumerate(("LAC", "CellId", "BandInfo", "SCN", "UARFCN"))}
+             | {cell + "CellRadioAccessTechnology": cell + "RadioAccessTechnologyUTRAN2", cell + "CellType": cell + "CellType" + kind} for kind in ("Serving", "Serving", "Neighbor")]
+    inputs["cells"] = record(1, plistlib.dumps(cells, fmt=plistlib.FMT_BINARY), 0xFF)
+    inputs["d0e0-short"] = b"\x81\x00" + record(0xD0E0, b"")
+    return inputs
+
+
+def gsm_records():
+    lengths = {0x4005: 32, 0x4031: 44, 0x4116: 34, 0x4125: 14, 0x4127: 29, 0x4157: 19, 0x417A: 134, 0x4221: 360, 0x5072: 20, 0x5076: 17, 0x512C: 17,
+               0x5134: 26, 0x5137: 57, 0x51F4: 15, 0x51F5: 18, 0x51F6: 24, 0x51F8: 19, 0x51FB: 34, 0x51FD: 35, 0x51FF: 23, 0x7130: 16, 0x7131: 16,
+               0x7132: 16, 0x7135: 32, 0x7150: 26}
+    counts = {0x4005: (13, 14), 0x4031: (14,), 0x4116: (13,), 0x417A: (15,), 0x4221: (16, 17), 0x5137: (28,), 0x51F8: (14,), 0x51FF: (14,), 0x7150: (16,)}
+    inputs = binary_records(lengths, {code: [(offset, 1) for offset in offsets] for code, offsets in counts.items()})
     cell = "kRKCellMonitor"
     numbers = {cell + key: i for i, key in enumerate(("MCC", "MNC", "LAC", "CellId", "UARFCN", "ARFCN", "SCN", "RSCP", "ECN0", "RSSI"))}
     cells = [numbers | {cell + "CellRadioAccessTechnology": cell + "RadioAccessTechnology" + technology, cell + "CellType": cell + "CellType" + kind}
@@ -77,6 +98,7 @@ def seeds():
         "reports.spectrel": snapshot([{"DisplayState": {"Cell": {"ARFCN": "12"}}, "Date": "never"}], plistlib.FMT_XML),
     }
     return {"fuzz_property_list": lists, "fuzz_recording": recordings, "fuzz_update_gsm": gsm_records(),
+            "fuzz_update_lte": lte_records(), "fuzz_update_utran": utran_records(),
             "fuzz_update_cdma": cdma(), "fuzz_update_ifx": ifx()}
 
 

@@ -14,7 +14,7 @@ std::unique_ptr<Baseband> makeBaseband(Technology technology, Scene scene, std::
     case Technology::LTE:
         return makeLTEBaseband(scene, seed);
     case Technology::UTRAN:
-        return nullptr;
+        return makeUTRANBaseband(scene, seed);
     }
     return nullptr;
 }

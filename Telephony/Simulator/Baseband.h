@@ -92,5 +92,6 @@ std::unique_ptr<Baseband> makeCDMABaseband(Scene scene, std::uint32_t seed);
 std::unique_ptr<Baseband> makeIFXBaseband(Scene scene, std::uint32_t seed);
 std::unique_ptr<Baseband> makeLTEBaseband(Scene scene, std::uint32_t seed);
 std::unique_ptr<Baseband> makeGSMUMTSBaseband(Scene scene, std::uint32_t seed);
+std::unique_ptr<Baseband> makeUTRANBaseband(Scene scene, std::uint32_t seed);
 
 } // namespace spectrel

@@ -81,7 +81,7 @@ class Terminal(TerminalPlace):
         self.see("Physical Cell ID", "321", "10 MHz")
         self.keys("Left")
         self.see("SIM Info", "PDP Context Info")
-        self.keys("Down", "Enter")
+        self.keys("End", "Enter")
         self.see("EF-ICCID", "890011")
         self.keys("BSpace")
         self.see("Serving Cell Info")

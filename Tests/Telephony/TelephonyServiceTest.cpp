@@ -253,10 +253,10 @@ TEST_F(SimulatorSourceTest, RecordsComeSteadily)
 {
     const auto stream = source.start(collector);
     collector.messages.clear();
-    loop.advance(20s);
-    EXPECT_EQ(collector.count(0x01, 0xC2), 50u);
-    EXPECT_EQ(collector.count(0x01, 0xC1), 25u);
-    EXPECT_EQ(collector.count(0xFF, 1), 10u);
+    loop.advance(60s);
+    EXPECT_EQ(collector.count(0x01, 0xC2), 150u);
+    EXPECT_EQ(collector.count(0x01, 0xC1), 75u);
+    EXPECT_EQ(collector.count(0xFF, 1), 12u);
     EXPECT_EQ(collector.count(0xFF, 0), 2u);
 }
 

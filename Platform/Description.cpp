@@ -1,4 +1,4 @@
-#include "Tests/Fakes/DisplayText.h"
+#include "Platform/Description.h"
 
 #include "Platform/Dictionary.h"
 #include "Platform/List.h"
@@ -31,7 +31,7 @@ std::string dictionaryText(const Dictionary& dictionary)
 {
     std::string text = "{";
     for (const auto& [key, value] : dictionary.entries())
-        text += (text.size() > 1 ? ", \"" : "\"") + key + "\": " + displayText(value);
+        text += (text.size() > 1 ? ", \"" : "\"") + key + "\": " + describe(value);
     return text + "}";
 }
 
@@ -39,13 +39,13 @@ std::string listText(const List& list)
 {
     std::string text = "[";
     for (const Value& element : list.elements())
-        text += (text.size() > 1 ? ", " : "") + displayText(element);
+        text += (text.size() > 1 ? ", " : "") + describe(element);
     return text + "]";
 }
 
 } // namespace
 
-std::string displayText(const Value& value)
+std::string describe(const Value& value)
 {
     switch (value.kind()) {
     case Kind::Absent:
