@@ -57,12 +57,6 @@ void describeReplay(CLI::App& program, CLI::Option& replay, ReplayOptions& optio
         ->check(CLI::NonNegativeNumber)
         ->needs(&replay);
     program.add_flag("--loop", options.loop, "With --replay: begin anew at the end")->needs(&replay);
-    program
-        .add_option_function<std::string>(
-            "--technology", [&options](const std::string& name) { options.technology = technologyNamed(name); },
-            "With --replay: the technology, where a file does not tell")
-        ->check(IsTechnology)
-        ->needs(&replay);
 }
 
 void describe(CLI::App& program, ServiceOptions& options)
@@ -78,9 +72,20 @@ void describe(CLI::App& program, ServiceOptions& options)
             ->check(IsTechnology);
     auto* replay = source->add_option("--replay", options.replay.files,
         "Recordings (captures, snapshots, DLF files), one after the other, to each channel from their start");
+    source
+        ->add_option("--relay", options.relay,
+            "A live stream of capture (pcap) or DLF bytes: - (standard input), a FIFO, unix:PATH or "
+            "tcp:HOST:PORT to listen there (tcp:PORT: this machine alone)")
+        ->type_name("ADDRESS");
     source->require_option(1);
     describeSimulation(program, *simulate, options.simulate);
     describeReplay(program, *replay, options.replay);
+    program
+        .add_option_function<std::string>(
+            "--technology", [&options](const std::string& name) { options.technology = technologyNamed(name); },
+            "With --replay and --relay: the technology, where a file or the stream does not tell")
+        ->check(IsTechnology)
+        ->excludes(simulate);
     program
         .add_option("--ready-fd", options.readyDescriptor, "Write a line to this descriptor once the port is served")
         ->type_name("N");

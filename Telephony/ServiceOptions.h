@@ -25,6 +25,8 @@ struct SimulateOptions {
 struct ServiceOptions {
     SimulateOptions simulate;
     ReplayOptions replay;
+    std::string relay; // the stream's address
+    std::optional<Technology> technology; // where a recording or a stream does not tell
     int readyDescriptor = -1;
 };
 

@@ -68,6 +68,8 @@ Bytes TelephonyService::handleRequest(std::int32_t id, ByteView body)
         : nullptr;
     if (!clientPort || clientPort->empty())
         return answer(ChannelError::MalformedRequest);
+    if (!_source.isReady())
+        return answer(ChannelError::NotReady);
     if (_channels.size() >= MostChannels)
         return answer(ChannelError::TooManyChannels);
     const unsigned number = ++_lastChannel;

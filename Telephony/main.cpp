@@ -4,7 +4,9 @@
 #include "Platform/Qt/QtClock.h"
 #include "Platform/Qt/QtRunLoop.h"
 #include "Platform/Qt/TerminationSignals.h"
+#include "Platform/Sockets/OpenStreamInput.h"
 #include "Platform/Sockets/SocketMessagePorts.h"
+#include "Telephony/RelaySource.h"
 #include "Telephony/ReplaySource.h"
 #include "Telephony/ServiceOptions.h"
 #include "Telephony/Simulator/SimulatedRecording.h"
@@ -35,8 +37,15 @@ std::unique_ptr<Baseband> makeBaseband(const SimulateOptions& options, std::stri
 }
 
 std::unique_ptr<LogSource> makeSource(
-    ServiceOptions& options, RunLoop& runLoop, const Clock& clock, std::string& reason)
+    ServiceOptions& options, QtRunLoop& runLoop, const Clock& clock, std::string& reason)
 {
+    if (!options.relay.empty()) {
+        auto input = openStreamInput(options.relay, reason);
+        return input ? std::make_unique<RelaySource>(
+                   runLoop, std::move(input), options.technology, [&runLoop] { runLoop.quit(ExitFailed); })
+                     : nullptr;
+    }
+    options.replay.technology = options.technology;
     if (!options.simulate.technology)
         return ReplaySource::open(runLoop, clock, std::move(options.replay), reason);
     auto baseband = makeBaseband(options.simulate, reason);
@@ -74,8 +83,7 @@ int serve(ServiceOptions& options)
             return fail("--ready-fd: the descriptor cannot be written");
         ::close(options.readyDescriptor);
     }
-    runLoop.run();
-    return 0;
+    return runLoop.run();
 }
 
 } // namespace
