@@ -4,6 +4,7 @@
 
 #include <CLI/CLI.hpp>
 #include <iostream>
+#include <tuple>
 
 namespace spectrel {
 
@@ -21,6 +22,13 @@ const CLI::Validator IsScene(
         return sceneNamed(name, scene) ? std::string() : "'" + name + "' is not one of still, walk, drive, stress";
     },
     "still|walk|drive|stress");
+
+std::optional<ReplayPoint> parseReplayPoint(const std::string& text)
+{
+    if (const auto offset = parseDuration(text))
+        return ReplayPoint::after(*offset);
+    return ReplayPoint::wallClock(text);
+}
 
 void describeSimulation(CLI::App& program, CLI::Option& simulate, SimulateOptions& options)
 {
@@ -49,12 +57,33 @@ void describeSimulation(CLI::App& program, CLI::Option& simulate, SimulateOption
         ->needs(write);
 }
 
+const CLI::Validator IsReplayPoint(
+    [](std::string& text) {
+        return parseReplayPoint(text) ? std::string()
+                                      : "'" + text
+                + "' is neither a time into the recording such as 90s nor a time such as '2024-03-05 14:07:31'";
+    },
+    "TIME");
+
 void describeReplay(CLI::App& program, CLI::Option& replay, ReplayOptions& options)
 {
     program
         .add_option("--speed", options.speed,
             "With --replay: times as fast as recorded; 0 is as fast as a client takes it (default: 1)")
         ->check(CLI::NonNegativeNumber)
+        ->needs(&replay);
+    program
+        .add_option_function<std::string>(
+            "--from", [&options](const std::string& text) { options.from = parseReplayPoint(text); },
+            "With --replay: begin here: a time into the recording (90s, 5m), or a time of day (14:07:31) or a date and "
+            "time, local or with a zone (2024-03-05T13:07:31Z)")
+        ->check(IsReplayPoint)
+        ->needs(&replay);
+    program
+        .add_option_function<std::string>(
+            "--to", [&options](const std::string& text) { options.to = parseReplayPoint(text); },
+            "With --replay: end here, told likewise")
+        ->check(IsReplayPoint)
         ->needs(&replay);
     program.add_flag("--loop", options.loop, "With --replay: begin anew at the end")->needs(&replay);
 }
@@ -99,6 +128,9 @@ std::optional<int> readServiceOptions(int argc, char** argv, ServiceOptions& opt
     describe(program, options);
     try {
         program.parse(argc, argv);
+        const auto& [from, to] = std::tie(options.replay.from, options.replay.to);
+        if (from && to && from->isOffset() && to->isOffset() && from->offset() > to->offset())
+            throw CLI::ValidationError("--to", "lies before --from");
     } catch (const CLI::Success& answered) {
         return program.exit(answered);
     } catch (const CLI::ParseError& error) {
