@@ -21,6 +21,7 @@ public:
 
     const std::string& name() const override;
     void serve() override;
+    void setPaused(bool isPaused) override;
     void setInvalidationHandler(InvalidationHandler handler) override;
     void invalidate() override;
     bool isValid() const override;
