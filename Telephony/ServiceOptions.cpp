@@ -116,6 +116,13 @@ void describe(CLI::App& program, ServiceOptions& options)
         ->check(IsTechnology)
         ->excludes(simulate);
     program
+        .add_option_function<std::string>(
+            "--status", [&options](const std::string& text) { options.statusInterval = parseDuration(text); },
+            "Tell on standard error every so often, such as 10s, what is streamed to whom, when anything is; the "
+            "signal "
+            "USR1 asks for it at any time")
+        ->check(IsDuration);
+    program
         .add_option("--ready-fd", options.readyDescriptor, "Write a line to this descriptor once the port is served")
         ->type_name("N");
 }

@@ -28,6 +28,7 @@ struct ServiceOptions {
     std::string relay; // the stream's address
     std::optional<Technology> technology; // where a recording or a stream does not tell
     int readyDescriptor = -1;
+    std::optional<std::chrono::milliseconds> statusInterval;
 };
 
 /// Reads the command line. An exit status when the program is done with that: after --help, --version or wrong usage,

@@ -58,6 +58,21 @@ void TelephonyService::endChannels()
     if (!_channels.empty())
         tell("ending " + std::to_string(_channels.size()) + " channel(s): their technology has changed");
     _channels.clear();
+    tellChange();
+}
+
+void TelephonyService::tellChange()
+{
+    if (_changeHandler)
+        _changeHandler();
+}
+
+std::vector<ChannelStatus> TelephonyService::status() const
+{
+    std::vector<ChannelStatus> status;
+    for (const auto& [number, channel] : _channels)
+        status.push_back(channel->status());
+    return status;
 }
 
 Bytes TelephonyService::handleRequest(std::int32_t id, ByteView body)
@@ -73,12 +88,15 @@ Bytes TelephonyService::handleRequest(std::int32_t id, ByteView body)
     if (_channels.size() >= MostChannels)
         return answer(ChannelError::TooManyChannels);
     const unsigned number = ++_lastChannel;
-    const std::string name = std::string(Protocol::ServicePort) + ".LogChannel." + std::to_string(number);
-    auto channel =
-        LogChannel::open(_runLoop, _ports, _source, name, *clientPort, [this, number] { _channels.erase(number); });
+    auto channel = LogChannel::open(_runLoop, _ports, _source, number, *clientPort, [this, number] {
+        _channels.erase(number);
+        tellChange();
+    });
     if (!channel)
         return answer(ChannelError::NoSuchPort);
+    const std::string name = channel->portName();
     _channels.emplace(number, std::move(channel));
+    tellChange();
     return answer(ChannelError::None, name);
 }
 

@@ -5,15 +5,20 @@
 #include "Platform/Qt/QtRunLoop.h"
 #include "Platform/Qt/TerminationSignals.h"
 #include "Platform/Sockets/OpenStreamInput.h"
+#include "Platform/Sockets/ServiceManager.h"
 #include "Platform/Sockets/SocketMessagePorts.h"
+#include "Platform/TelephonyProtocol.h"
 #include "Telephony/RelaySource.h"
 #include "Telephony/ReplaySource.h"
 #include "Telephony/ServiceOptions.h"
 #include "Telephony/Simulator/SimulatedRecording.h"
 #include "Telephony/Simulator/SimulatorSource.h"
+#include "Telephony/StatusReport.h"
 #include "Telephony/TelephonyService.h"
+#include "Telephony/Tell.h"
 
-#include <iostream>
+#include <csignal>
+#include <optional>
 #include <unistd.h>
 
 namespace {
@@ -24,7 +29,7 @@ constexpr int ExitFailed = 1;
 
 int fail(const std::string& line)
 {
-    std::cerr << "spectrel-telephonyd: " << line << '\n';
+    tell(line);
     return ExitFailed;
 }
 
@@ -64,12 +69,61 @@ int writeRecording(const SimulateOptions& options)
         : fail(options.file + ": " + reason);
 }
 
+/// Serves the socket that the service manager has passed on, if it has.
+bool adoptSocket(ServiceManager& manager, SocketMessagePorts& ports, std::string& reason)
+{
+    FileDescriptor socket = manager.takeListeningSocket(reason);
+    return socket ? ports.adopt(TelephonyProtocol::ServicePort, std::move(socket), reason) : reason.empty();
+}
+
+bool tellReady(int descriptor)
+{
+    if (descriptor < 0)
+        return true;
+    const bool isTold = ::write(descriptor, "ready\n", 6) == 6;
+    ::close(descriptor);
+    return isTold;
+}
+
+/// Keeps the service manager's status line true.
+class ManagerStatus {
+public:
+    ManagerStatus(
+        RunLoop& runLoop, const ServiceManager& manager, TelephonyService& service, const StatusReport& report)
+        : _manager(manager)
+        , _report(report)
+    {
+        if (!manager.isListening())
+            return;
+        service.setChangeHandler([this] { tellManager(); });
+        _timer = runLoop.repeat(Interval, [this] { tellManager(); });
+    }
+    void tellManager(const std::string& before = "")
+    {
+        const std::string headline = _report.headline();
+        if (!before.empty() || headline != _told)
+            _manager.notify(before + "STATUS=" + headline + "\n");
+        _told = headline;
+    }
+
+private:
+    static constexpr std::chrono::seconds Interval {10};
+    const ServiceManager& _manager;
+    const StatusReport& _report;
+    std::unique_ptr<Timer> _timer;
+    std::string _told;
+};
+
 int serve(ServiceOptions& options)
 {
+    ServiceManager manager;
     QtRunLoop runLoop;
-    const QtClock clock;
+    QtClock clock;
+    Clock::install(&clock);
     SocketMessagePorts ports(Places::portDirectory());
     std::string reason;
+    if (!adoptSocket(manager, ports, reason))
+        return fail(reason);
     const auto source = makeSource(options, runLoop, clock, reason);
     if (!source)
         return fail(reason);
@@ -77,13 +131,21 @@ int serve(ServiceOptions& options)
     if (!service.start())
         return fail("cannot take the telephony service's port in " + Places::portDirectory()
             + ": another service runs there, or the folder is not this user's own");
-    const TerminationSignals terminationSignals([&runLoop](int) { runLoop.quit(); });
-    if (options.readyDescriptor >= 0) {
-        if (::write(options.readyDescriptor, "ready\n", 6) != 6)
-            return fail("--ready-fd: the descriptor cannot be written");
-        ::close(options.readyDescriptor);
-    }
-    return runLoop.run();
+    StatusReport report(clock, service, *source);
+    const TerminationSignals signals(
+        [&](int signal) { signal == SIGUSR1 ? tellStatus(report) : runLoop.quit(); }, {SIGUSR1});
+    std::optional<RegularReport> regularReport;
+    if (options.statusInterval)
+        regularReport.emplace(runLoop, report, *options.statusInterval);
+    ManagerStatus managerStatus(runLoop, manager, service, report);
+    tell("serving " + source->status() + " in " + Places::portDirectory());
+    if (!tellReady(options.readyDescriptor))
+        return fail("--ready-fd: the descriptor cannot be written");
+    managerStatus.tellManager("READY=1\n");
+    const int status = runLoop.run();
+    manager.notify("STOPPING=1\n");
+    service.setChangeHandler({});
+    return status;
 }
 
 } // namespace

@@ -100,7 +100,8 @@ void SocketLocalPort::Core::close()
         return;
     _acceptNotifier.reset();
     _connections.clear();
-    ::unlink(_path.c_str());
+    if (!_path.empty())
+        ::unlink(_path.c_str());
     _socket.close();
     _lock.reset(); // last: until here nobody else can bind the path
 }
