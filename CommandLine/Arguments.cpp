@@ -118,7 +118,24 @@ void addRecord(CLI::App& program, Arguments& arguments)
     CLI::App* command = program.add_subcommand("record", "Record the live session into a capture file (pcap)");
     command->callback([&arguments] { arguments.job = Job::Record; });
     addCommon(*command, arguments);
-    command->add_option("FILE", arguments.record.file, "The capture file; an existing one is overwritten")->required();
+    RecordingFilesOptions& files = arguments.record.files;
+    command
+        ->add_option("FILE", files.target,
+            "The capture file; an existing one is overwritten. A folder (or a new one: FOLDER/) takes numbered files, "
+            "on from those that are there")
+        ->required();
+    command
+        ->add_option_function<std::string>(
+            "--rollover", [&files](const std::string& text) { files.largestFile = parseSize(text); },
+            "Begin a further file before one has more bytes than this, such as 100M")
+        ->check(IsSize);
+    command
+        ->add_option_function<std::string>(
+            "--rollover-time", [&files](const std::string& text) { files.longestFile = parseDuration(text); },
+            "Begin a further file after this time, such as 1h")
+        ->check(IsDuration);
+    command->add_option("--keep", files.keep, "Of the numbered files keep the last so many, remove the older ones")
+        ->check(CLI::PositiveNumber);
     addLimits(command, arguments.record.count, "End after this many messages", arguments.record.duration);
 }
 
@@ -140,6 +157,9 @@ std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
         program.parse(argc, argv);
         if (arguments.decode.each && arguments.decode.format != OutputFormat::Json)
             throw CLI::ValidationError("--each", "goes with --format json only");
+        const RecordingFilesOptions& files = arguments.record.files;
+        if (files.target == "-" && (files.largestFile || files.longestFile || files.keep))
+            throw CLI::ValidationError("--rollover", "standard output is one stream");
     } catch (const CLI::Success& answered) {
         return program.exit(answered); // --help and --version, on standard output
     } catch (const CLI::ParseError& error) {

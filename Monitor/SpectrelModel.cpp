@@ -264,10 +264,16 @@ void SpectrelModel::updateWithData(ByteView data)
         _messageInProgress = {};
     }
     _updated = true;
+    _intake += data.size();
+    if (_intake >= LargestIntake && _recvPort && _displayUpdateTimer)
+        _recvPort->setPaused(true);
 }
 
 void SpectrelModel::refresh()
 {
+    if (_intake >= LargestIntake && _recvPort)
+        _recvPort->setPaused(false);
+    _intake = 0;
     if (_sendPort && _recvPort && !_sendPort->isValid()) {
         const auto port = _recvPort; // the handler, still installed, restarts the session and lets go of the port
         port->invalidate();

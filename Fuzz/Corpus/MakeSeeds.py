@@ -97,7 +97,14 @@ def seeds():
         "history.bin.spectrel": snapshot([entry, refused], plistlib.FMT_BINARY),
         "reports.spectrel": snapshot([{"DisplayState": {"Cell": {"ARFCN": "12"}}, "Date": "never"}], plistlib.FMT_XML),
     }
-    return {"fuzz_property_list": lists, "fuzz_recording": recordings, "fuzz_update_gsm": gsm_records(),
+    cap = capture(150, [a, b, c])
+    streams = {
+        "capture": b"\x06" + cap, "two-captures": b"\x11" + cap + capture(148, [c, b"short", a], ">"), "lost": b"\x00" + cap[:30] + cap[37:] + cap[24:],
+        "noise": b"\x03" + cap + b"noise between the packets" + cap[24:], "dlf": b"\x05" + dlf, "messages": b"\x40" + 3 * (a + b + c),
+        "damaged-dlf": b"\x02" + dlf + bytes(30) + 3 * (a + b + c), "pcapng": b"\x01\x0a\x0d\x0d\x0a",
+    }
+    return {"fuzz_property_list": lists, "fuzz_recording": recordings, "fuzz_stream": streams,
+            "fuzz_update_gsm": gsm_records(),
             "fuzz_update_lte": lte_records(), "fuzz_update_utran": utran_records(),
             "fuzz_update_cdma": cdma(), "fuzz_update_ifx": ifx()}
 
