@@ -3,6 +3,7 @@
 #include "Platform/Bytes.h"
 #include "Platform/Recording.h"
 
+#include <functional>
 #include <memory>
 
 namespace spectrel {
@@ -31,6 +32,12 @@ public:
     virtual Technology technology() const = 0;
     /// Starts streaming to one channel; the sink outlives the stream.
     virtual std::unique_ptr<LogStream> start(MessageSink& sink) = 0;
+    /// `handler` is called from the main queue when `technology` has become another one; the channels then end, so that
+    /// their clients ask for it again. Sources of a fixed technology never call it.
+    virtual void setTechnologyHandler(std::function<void()> handler)
+    {
+        static_cast<void>(handler);
+    }
 };
 
 } // namespace spectrel

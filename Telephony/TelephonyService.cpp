@@ -3,6 +3,7 @@
 #include "Platform/Dictionary.h"
 #include "Platform/PropertyList.h"
 #include "Platform/TelephonyProtocol.h"
+#include "Telephony/Tell.h"
 
 namespace spectrel {
 
@@ -33,8 +34,10 @@ TelephonyService::TelephonyService(RunLoop& runLoop, MessagePorts& ports, LogSou
 TelephonyService::~TelephonyService()
 {
     _channels.clear();
-    if (_port)
-        _port->invalidate();
+    if (!_port)
+        return;
+    _source.setTechnologyHandler({});
+    _port->invalidate();
 }
 
 bool TelephonyService::start()
@@ -45,7 +48,16 @@ bool TelephonyService::start()
         return false;
     _port = port;
     _port->serve();
+    _source.setTechnologyHandler([this] { endChannels(); });
     return true;
+}
+
+/// The source's technology is another one now: the clients are to ask for it, and choose their codes, anew.
+void TelephonyService::endChannels()
+{
+    if (!_channels.empty())
+        tell("ending " + std::to_string(_channels.size()) + " channel(s): their technology has changed");
+    _channels.clear();
 }
 
 Bytes TelephonyService::handleRequest(std::int32_t id, ByteView body)

@@ -31,6 +31,7 @@ public:
 
 private:
     Bytes handleRequest(std::int32_t id, ByteView body);
+    void endChannels();
 
     RunLoop& _runLoop;
     MessagePorts& _ports;

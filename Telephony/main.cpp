@@ -5,6 +5,8 @@
 #include "Platform/Qt/QtRunLoop.h"
 #include "Platform/Qt/TerminationSignals.h"
 #include "Platform/Sockets/SocketMessagePorts.h"
+#include "Telephony/Modem/ModemManager/ModemManagerService.h"
+#include "Telephony/Modem/ModemSource.h"
 #include "Telephony/ReplaySource.h"
 #include "Telephony/Simulator/SimulatorSource.h"
 #include "Telephony/TelephonyService.h"
@@ -22,11 +24,13 @@ constexpr int ExitFailed = 1;
 constexpr int ExitWrongUsage = 2;
 
 constexpr const char* Description =
-    "The telephony service: opens log channels and streams log messages from a simulated baseband or a recording.\n"
+    "The telephony service: opens log channels and streams log messages from a simulated baseband, a recording\n"
+    "or a modem.\n"
     "Ports are met in $SPECTREL_PORT_DIR (default: $XDG_RUNTIME_DIR/spectrel).";
 
 struct Options {
     std::string simulate;
+    std::optional<std::string> modem; // which one; empty: any
     std::uint32_t seed = 1;
     double rate = 1;
     ReplayOptions replay;
@@ -47,6 +51,13 @@ void describe(CLI::App& program, Options& options)
                          ->check(IsTechnology);
     auto* replay = source->add_option("--replay", options.replay.files,
         "Recordings (captures, snapshots, DLF files), one after the other, to each channel from their start");
+    source
+        ->add_option_function<std::string>(
+            "--modem", [&options](const std::string& wish) { options.modem = wish; },
+            "The modem that ModemManager has: its number, object path, model or control port (default: one that is "
+            "registered)")
+        ->expected(0, 1)
+        ->type_name("[NAME]");
     source->require_option(1);
     program.add_option("--seed", options.seed, "With --simulate: the same seed gives the same drive (default: 1)")
         ->needs(simulate);
@@ -78,6 +89,10 @@ int fail(const std::string& line)
 
 std::unique_ptr<LogSource> makeSource(Options& options, RunLoop& runLoop, const Clock& clock, std::string& reason)
 {
+    if (options.modem) {
+        auto service = ModemManagerService::open(reason);
+        return service ? std::make_unique<ModemSource>(runLoop, clock, std::move(service), *options.modem) : nullptr;
+    }
     if (options.simulate.empty())
         return ReplaySource::open(runLoop, clock, std::move(options.replay), reason);
     if (options.simulate == technologyName(Technology::LTE))
