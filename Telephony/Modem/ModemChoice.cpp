@@ -35,8 +35,7 @@ int rank(const ModemFacts& modem)
 
 } // namespace
 
-const ModemFacts* chooseModem(
-    const std::vector<ModemFacts>& modems, std::string_view wish, std::string_view current)
+const ModemFacts* chooseModem(const std::vector<ModemFacts>& modems, std::string_view wish, std::string_view current)
 {
     const ModemFacts* best = nullptr;
     for (const ModemFacts& modem : modems) {

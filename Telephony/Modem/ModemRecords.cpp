@@ -9,6 +9,7 @@
 #include <algorithm>
 #include <cmath>
 #include <string>
+#include <utility>
 
 namespace spectrel {
 
@@ -17,6 +18,7 @@ namespace {
 constexpr std::string_view NotKnown = "-";
 constexpr std::int32_t NotMeasured = 32767; // how a cell monitor tells a power or ratio that it has not
 constexpr double WeakestLevel = -111; // dBm, the lower end of RXLEV 0; each level is 1 dB (3GPP TS 45.008, 8.1.4)
+constexpr std::size_t LongestRecord = 65536; // type byte and the 65535 bytes that an item length can tell
 constexpr double LargestMeasurement = 1000; // beyond it there is no dBm or dB
 
 std::string joined(const std::vector<std::string>& parts)
@@ -159,6 +161,20 @@ DictionaryRef contextDictionary(const BearerFacts& bearer)
     return dictionary;
 }
 
+/// A record of a list; its length has 16 bits, so the last elements go if it would be longer.
+Bytes listRecord(std::uint32_t code, std::vector<DictionaryRef> elements, Moment time)
+{
+    for (;;) {
+        auto list = List::make();
+        for (const DictionaryRef& element : elements)
+            list->append(element);
+        Bytes record = propertyListRecord(code, list, time);
+        if (record.size() <= LongestRecord || elements.empty())
+            return record;
+        elements.pop_back();
+    }
+}
+
 } // namespace
 
 Bytes modemSimRecord(const std::optional<SimFacts>& sim, Moment time)
@@ -176,18 +192,18 @@ Bytes modemSimRecord(const std::optional<SimFacts>& sim, Moment time)
 
 Bytes modemCellsRecord(const std::vector<CellFacts>& cells, const SignalFacts& signal, Moment time)
 {
-    auto list = List::make();
-    for (std::size_t place = 0; place < std::min(cells.size(), MostModemCells); ++place)
-        list->append(cellDictionary(cells[place], signal));
-    return propertyListRecord(0xFF0001, list, time);
+    std::vector<DictionaryRef> told;
+    for (std::size_t place = 0; place < std::min(cells.size(), MostModemElements); ++place)
+        told.push_back(cellDictionary(cells[place], signal));
+    return listRecord(0xFF0001, std::move(told), time);
 }
 
 Bytes modemContextsRecord(const std::vector<BearerFacts>& bearers, Moment time)
 {
-    auto list = List::make();
-    for (std::size_t place = 0; place < std::min(bearers.size(), MostModemContexts); ++place)
-        list->append(contextDictionary(bearers[place]));
-    return propertyListRecord(0xFF0002, list, time);
+    std::vector<DictionaryRef> told;
+    for (std::size_t place = 0; place < std::min(bearers.size(), MostModemElements); ++place)
+        told.push_back(contextDictionary(bearers[place]));
+    return listRecord(0xFF0002, std::move(told), time);
 }
 
 } // namespace spectrel

@@ -17,8 +17,8 @@ enum class ModemOutcome : std::uint8_t {
     Failed, // not now: try again later
 };
 
-/// What keeps track of the system's modems. Nothing here blocks, but for the destructor, which sees the last wishes off;
-/// handlers run from the run loop and may be dropped when the service object ends.
+/// What keeps track of the system's modems. Nothing here blocks, but for the destructor, which sees the last wishes
+/// off; handlers run from the run loop and may be dropped when the service object ends.
 class ModemService {
 public:
     using ChangeHandler = std::function<void()>;

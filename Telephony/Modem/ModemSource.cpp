@@ -43,8 +43,7 @@ private:
 };
 
 /// An action that is dropped once the listening that it belongs to has ended.
-template <typename Action>
-auto ModemSource::whileListening(Action action)
+template <typename Action> auto ModemSource::whileListening(Action action)
 {
     return [listening = std::weak_ptr(_listening), action = std::move(action)](auto&&... arguments) {
         if (!listening.expired())
@@ -52,8 +51,7 @@ auto ModemSource::whileListening(Action action)
     };
 }
 
-ModemSource::ModemSource(
-    RunLoop& runLoop, const Clock& clock, std::unique_ptr<ModemService> service, std::string wish)
+ModemSource::ModemSource(RunLoop& runLoop, const Clock& clock, std::unique_ptr<ModemService> service, std::string wish)
     : _runLoop(runLoop)
     , _clock(clock)
     , _service(std::move(service))
@@ -63,11 +61,7 @@ ModemSource::ModemSource(
     lookAround();
 }
 
-ModemSource::~ModemSource()
-{
-    _service->setChangeHandler({});
-    endListening();
-}
+ModemSource::~ModemSource() = default;
 
 void ModemSource::setTechnologyHandler(std::function<void()> handler)
 {
@@ -113,7 +107,8 @@ void ModemSource::tellPresence()
 {
     std::string presence;
     if (_modem)
-        presence = "using " + modemName(*_modem) + (_modem->sim ? "" : ", which has no SIM");
+        presence = "using " + modemName(*_modem) + (_modem->sim ? "" : ", without a SIM")
+            + (_modem->isEnabled ? "" : ", not enabled");
     else if (!_service->isRunning())
         presence = "no ModemManager on the system bus; waiting for it";
     else
@@ -226,10 +221,9 @@ void ModemSource::askForCells()
     if (!_canListCells)
         return askForLocation();
     _isAsking = true;
-    _service->listCells(_modem->id,
-        whileListening([this](ModemOutcome outcome, std::vector<CellFacts> cells) {
-            takeCells(outcome, std::move(cells));
-        }));
+    _service->listCells(_modem->id, whileListening([this](ModemOutcome outcome, std::vector<CellFacts> cells) {
+        takeCells(outcome, std::move(cells));
+    }));
 }
 
 void ModemSource::takeCells(ModemOutcome outcome, std::vector<CellFacts> cells)
@@ -256,10 +250,9 @@ void ModemSource::askForLocation()
     if (!_canLocate)
         return takeLocation(ModemOutcome::Failed, std::nullopt);
     _isAsking = true;
-    _service->locate(_modem->id,
-        whileListening([this](ModemOutcome outcome, std::optional<LocationFacts> location) {
-            takeLocation(outcome, std::move(location));
-        }));
+    _service->locate(_modem->id, whileListening([this](ModemOutcome outcome, std::optional<LocationFacts> location) {
+        takeLocation(outcome, std::move(location));
+    }));
 }
 
 void ModemSource::takeLocation(ModemOutcome outcome, std::optional<LocationFacts> location)

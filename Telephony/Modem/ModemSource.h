@@ -59,8 +59,7 @@ private:
     void send(Kind kind);
     void tellOnce(bool& isTold, const std::string& line);
     void remove(Stream& stream);
-    template <typename Action>
-    auto whileListening(Action action);
+    template <typename Action> auto whileListening(Action action);
 
     RunLoop& _runLoop;
     const Clock& _clock;

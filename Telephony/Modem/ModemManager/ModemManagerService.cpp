@@ -60,8 +60,7 @@ ModemOutcome outcomeOf(const QDBusMessage& answer)
 }
 
 /// An answer's only argument, when it is of the type that was asked for.
-template <typename Content>
-std::optional<Content> contentOf(const QDBusMessage& answer, const char* signature)
+template <typename Content> std::optional<Content> contentOf(const QDBusMessage& answer, const char* signature)
 {
     if (answer.type() != QDBusMessage::ReplyMessage || answer.signature() != QLatin1String(signature))
         return std::nullopt;
@@ -130,8 +129,8 @@ bool ModemManagerService::attach(std::string& reason)
         SLOT(interfacesRemoved(QDBusMessage)));
     _bus.connect(ServiceName, QString(), PropertiesInterface, QStringLiteral("PropertiesChanged"), this,
         SLOT(propertiesChanged(QDBusMessage)));
-    _bus.connect(QString(), QStringLiteral("/org/freedesktop/DBus/Local"),
-        QStringLiteral("org.freedesktop.DBus.Local"), QStringLiteral("Disconnected"), this, SLOT(busLost()));
+    _bus.connect(QString(), QStringLiteral("/org/freedesktop/DBus/Local"), QStringLiteral("org.freedesktop.DBus.Local"),
+        QStringLiteral("Disconnected"), this, SLOT(busLost()));
     listObjects();
     return true;
 }
@@ -245,8 +244,7 @@ void ModemManagerService::interfacesAdded(const QDBusMessage& message)
 {
     if (message.signature() != QLatin1String("oa{sa{sv}}"))
         return;
-    adopt(message.arguments().at(0).value<QDBusObjectPath>().path(),
-        qdbus_cast<Interfaces>(message.arguments().at(1)));
+    adopt(message.arguments().at(0).value<QDBusObjectPath>().path(), qdbus_cast<Interfaces>(message.arguments().at(1)));
     changed();
 }
 
