@@ -9,6 +9,13 @@
 
 namespace spectrel {
 
+namespace {
+
+const std::string HowToPermit = "to permit it, have spectrel-modem.conf and spectrel-modem.rules in place and join the "
+                                "group spectrel, as docs/modem.md tells";
+
+} // namespace
+
 /// One channel's share. A record tells a state: for a client that is busy, only the newest of each kind waits.
 class ModemSource::Stream final : public LogStream {
 public:
@@ -201,7 +208,8 @@ void ModemSource::raiseSignalRate()
         if (outcome == ModemOutcome::Denied)
             tellOnce(_isSignalDenialTold,
                 "this user may not set how often the modem measures (Signal.Setup): signal values are shown only where "
-                "another program has set it; docs/modem.md tells how to permit it");
+                "another program has set it; "
+                    + HowToPermit);
     }));
 }
 
@@ -234,8 +242,8 @@ void ModemSource::takeCells(ModemOutcome outcome, std::vector<CellFacts> cells)
     if (outcome == ModemOutcome::Denied)
         tellOnce(_isDenialTold,
             "this user may not list the modem's cells (GetCellInfo): only the serving cell is shown, from location and "
-            "signal; to permit it, install spectrel-modem.conf into /etc/dbus-1/system.d and join its group, as "
-            "docs/modem.md tells");
+            "signal; "
+                + HowToPermit);
     if (outcome == ModemOutcome::Unsupported)
         tellOnce(_isShortcomingTold,
             modemName(*_modem) + " cannot list its cells: only the serving cell is shown, from location and signal");
@@ -265,7 +273,7 @@ void ModemSource::takeLocation(ModemOutcome outcome, std::optional<LocationFacts
     if (outcome == ModemOutcome::Denied)
         tellOnce(_isLocationDenialTold,
             "this user may not ask where the modem is registered (GetLocation): the serving cell has its network only; "
-            "docs/modem.md tells how to permit it");
+                + HowToPermit);
     send(Cells);
 }
 

@@ -3,18 +3,17 @@
 
 Each line is {"do": COMMAND, ...}; each is answered by one line of JSON once it is done. Commands:
 
-    add      a modem: "number", "technology" (gsm, umts, lte, cdma), "sim", "cells" (listed, denied, unsupported),
-             "registered"; "model"
+    add      a modem: "number", "technology" (gsm, umts, lte, cdma), "sim", "cells" (listed, denied, unsupported,
+             hanging: from then on the whole service answers nothing), "registered", "model", "rate"
     remove   the modem "number", as when it is unplugged
     become   the modem "number" changes to "technology"
-    set      properties of the modem "number": "interface", "properties"
     signal   the modem "number" measures "values" on "technology"
     traffic  the bearer of the modem "number" has "received" and "sent" so many bytes
     calls    answers the methods called on the modem "number", with their arguments
-    leave    the service leaves the bus; "return" takes it again
 """
 
 import json
+import signal
 import sys
 
 import dbus
@@ -61,25 +60,11 @@ LOCATIONS = {
 }
 
 
-def typed(value):
-    """A property's value from JSON; whole numbers are unsigned there, but for the modem's state."""
-    if isinstance(value, bool):
-        return dbus.Boolean(value)
-    if isinstance(value, int):
-        return dbus.UInt32(value)
-    return value
-
-
 class Mock:
     def __init__(self):
-        self.bus = dbus.SystemBus()
-        self.root = None
         self.technologies = {}  # of the modems, by number
-        self.take_name()
-
-    def take_name(self):
-        self.name = dbus.service.BusName(NAME, self.bus, do_not_queue=True)
-        self.root = DBusMockObject(self.name, ROOT, NAME, {}, logfile="/dev/null", is_object_manager=True)
+        name = dbus.service.BusName(NAME, dbus.SystemBus(), do_not_queue=True)
+        self.root = DBusMockObject(name, ROOT, NAME, {}, logfile="/dev/null", is_object_manager=True)
         objects[ROOT] = self.root
 
     @staticmethod
@@ -97,7 +82,7 @@ class Mock:
                                  [interface, changed, dbus.Array([], signature="s")])
 
     def add(self, number=0, technology="lte", sim=True, cells="listed", registered=True, model="MOCK-1",
-            rate=0, own_numbers=("+10015550100",)):
+            rate=0):
         self.technologies[number] = technology
         modem_path, sim_path, bearer_path = (self.path(kind, number) for kind in ("Modem", "SIM", "Bearer"))
         if sim:
@@ -117,7 +102,7 @@ class Mock:
             "Model": model, "PrimaryPort": f"cdc-wdm{number}", "State": dbus.Int32(8 if registered else 6),
             "EquipmentIdentifier": "350000000000001",
             "AccessTechnologies": dbus.UInt32(TECHNOLOGIES[technology]),
-            "OwnNumbers": dbus.Array(own_numbers, signature="s"),
+            "OwnNumbers": dbus.Array(["+10015550100"], signature="s"),
             "Sim": dbus.ObjectPath(sim_path if sim else "/"),
             "Bearers": dbus.Array([dbus.ObjectPath(bearer_path)], signature="o"),
         }, signature="sv"), [])
@@ -143,6 +128,8 @@ class Mock:
             raise dbus.exceptions.DBusException("operation not allowed", name=NAME + ".Error.Core.Unauthorized")
         if cells == "unsupported":
             raise dbus.exceptions.DBusException("not supported", name=NAME + ".Error.Core.Unsupported")
+        if cells == "hanging":
+            signal.pause()
         return dbus.Array([dbus.Dictionary(cell, signature="sv") for cell in CELLS[self.technologies[number]]],
                           signature="a{sv}")
 
@@ -150,7 +137,7 @@ class Mock:
         self.change(self.path("Modem", number), MODEM + ".Signal", Rate=dbus.UInt32(rate))
         if rate:
             technology = self.technologies[number]
-            self.signal(number, technology, SIGNALS[technology])
+            self.signal(technology, SIGNALS[technology], number)
 
     def locate(self, number):
         place = LOCATIONS.get(self.technologies[number])
@@ -166,13 +153,7 @@ class Mock:
         self.technologies[number] = technology
         self.change(self.path("Modem", number), MODEM, AccessTechnologies=dbus.UInt32(TECHNOLOGIES[technology]))
 
-    def set(self, interface, properties, number=0):
-        values = {key: typed(value) for key, value in properties.items()}
-        if "State" in values:
-            values["State"] = dbus.Int32(values["State"])
-        self.change(self.path("Modem", number), interface, **values)
-
-    def signal(self, number, technology, values):
+    def signal(self, technology, values, number=0):
         self.change(self.path("Modem", number), MODEM + ".Signal",
                     **{technology.capitalize(): dbus.Dictionary(values, signature="sv")})
 
@@ -184,15 +165,7 @@ class Mock:
         return [[str(name), [int(argument) for argument in arguments]]
                 for _, name, arguments in self.modem(number).call_log if name != "GetAll"]
 
-    def leave(self):
-        for path in list(objects):
-            objects.pop(path).remove_from_connection()
-        self.bus.release_name(NAME)
-        del self.name
-
     def do(self, do, **arguments):
-        if do == "return":
-            do = "take_name"
         return getattr(self, do)(**arguments)
 
 
