@@ -86,7 +86,7 @@ struct ModemFacts {
     std::string operatorId; // digits: where it is registered
     SignalFacts signal;
     std::optional<std::uint32_t> signalRate; // seconds, 0 for never, shared by all clients; none: it measures nothing
-    std::optional<SimFacts> sim;
+    std::optional<SimFacts> sim; // none: there is none; nothing in it: not known yet
     std::vector<BearerFacts> bearers;
 };
 

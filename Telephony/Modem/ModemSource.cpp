@@ -148,13 +148,26 @@ void ModemSource::takeModem(const ModemFacts& modem)
 void ModemSource::update(const ModemFacts& modem)
 {
     const ModemFacts before = *std::exchange(_modem, modem);
+    if (_listening && modem.isEnabled && !before.isEnabled)
+        tryEverything();
     if (before.sim != modem.sim)
         send(Sim);
     if (before.bearers != modem.bearers)
         send(Contexts);
-    if (_hasAnswer && before.signal != modem.signal)
-        send(Cells);
     followTechnology();
+    if (_listening && before.cellKind != modem.cellKind)
+        forgetCells();
+    else if (_hasAnswer && before.signal != modem.signal)
+        send(Cells);
+}
+
+/// Other cells serve now; they need not wait for their turn.
+void ModemSource::forgetCells()
+{
+    _hasAnswer = false;
+    _cells.clear();
+    _location.reset();
+    askForCells();
 }
 
 /// Channels live with one technology: a change ends them, and their clients ask anew.
@@ -175,9 +188,7 @@ void ModemSource::beginListening()
     if (_listening || !_modem || _streams.empty())
         return;
     _listening = std::make_shared<bool>(true);
-    _canListCells = true;
-    _canLocate = true;
-    raiseSignalRate();
+    tryEverything();
     _cellTimer = _runLoop.repeat(CellInterval, [this] { askForCells(); });
     askForCells();
 }
@@ -195,10 +206,18 @@ void ModemSource::endListening()
     _location.reset();
 }
 
+/// What the modem can do, and this user may, shows by trying; a modem can more once it is enabled.
+void ModemSource::tryEverything()
+{
+    _canListCells = true;
+    _canLocate = true;
+    raiseSignalRate();
+}
+
 void ModemSource::raiseSignalRate()
 {
     const auto rate = _modem->signalRate;
-    if (!rate || (*rate > 0 && *rate <= SignalRate))
+    if (_previousSignalRate || !rate || (*rate > 0 && *rate <= SignalRate))
         return;
     _previousSignalRate = rate;
     _service->setSignalRate(_modem->id, SignalRate, whileListening([this](ModemOutcome outcome) {

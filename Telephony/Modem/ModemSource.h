@@ -44,10 +44,12 @@ private:
     void leaveModem();
     void takeModem(const ModemFacts& modem);
     void update(const ModemFacts& modem);
+    void forgetCells();
     void followTechnology();
 
     void beginListening();
     void endListening();
+    void tryEverything();
     void raiseSignalRate();
     void putSignalRateBack();
     void askForCells();

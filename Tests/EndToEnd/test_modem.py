@@ -472,7 +472,8 @@ class RealDaemon(ModemPlace):
         self.obey("plug")
         self.wait_told("using modem 0 (AT-1), not enabled")
         channel = Channel(self)
-        self.assertEqual(channel.payload(SIM)["kSimFile_ICCID"], "8990010100000000017")
+        files = channel.wait_for(SIM, lambda files: files["kSimFile_ICCID"] != "-")
+        self.assertEqual(files["kSimFile_ICCID"], "8990010100000000017")
         self.obey("enable")
         cells = channel.wait_for(CELLS, lambda cells: cells and "kRKCellMonitorCellId" in cells[0])
         self.assertEqual(cell(cells), {

@@ -325,11 +325,8 @@ std::vector<ModemFacts> ModemManagerService::modems() const
     std::vector<ModemFacts> all;
     for (const QString& path : std::as_const(paths)) {
         const Interfaces& modem = *_modems.find(path);
-        const QString sim = simPath(modem);
-        if (_awaited.contains(sim))
-            continue; // it is told once its SIM is known
         ModemFacts facts = modemFacts(path, modem);
-        if (!sim.isEmpty())
+        if (const QString sim = simPath(modem); !sim.isEmpty())
             facts.sim = simFacts(_related.value(sim), modem);
         for (const QString& bearer : bearerPaths(modem)) {
             if (_related.contains(bearer))

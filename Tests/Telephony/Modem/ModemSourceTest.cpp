@@ -270,6 +270,20 @@ TEST_F(ModemSourceTest, NewMeasurementIsToldInTheServingCell)
     EXPECT_EQ(listener.cell(1, kRKCellMonitorRSRP), Value::integer(-100));
 }
 
+TEST_F(ModemSourceTest, OtherKindOfCellIsAskedForAtOnce)
+{
+    openWithModem();
+    const auto stream = source->start(listener);
+    ledger.cellsOutcome = ModemOutcome::Failed;
+    modem.cellKind = CellKind::UMTS;
+    modem.signal.rscp = -85;
+    plug();
+    EXPECT_EQ(ledger.cellsAsked, 2);
+    EXPECT_EQ(
+        listener.cell(0, kRKCellMonitorCellRadioAccessTechnology), Value(kRKCellMonitorRadioAccessTechnologyUMTS));
+    EXPECT_EQ(listener.cell(0, kRKCellMonitorRSCP), Value::integer(-85));
+}
+
 TEST_F(ModemSourceTest, ChangeOfNothingTellsNothing)
 {
     openWithModem();
@@ -339,6 +353,25 @@ TEST_F(ModemSourceTest, ModemWithoutCellListIsToldOnce)
     loop.advance(20s);
     EXPECT_EQ(ledger.cellsAsked, 1);
     EXPECT_EQ(occurrences(told(), "cannot list its cells"), 1u);
+}
+
+TEST_F(ModemSourceTest, ModemThatIsEnabledLaterIsAskedForEverythingAnew)
+{
+    modem.isEnabled = false;
+    modem.signalRate.reset();
+    ledger.cellsOutcome = ModemOutcome::Unsupported;
+    ledger.locationOutcome = ModemOutcome::Unsupported;
+    ledger.location.reset();
+    openWithModem();
+    const auto stream = source->start(listener);
+    EXPECT_TRUE(ledger.rates.empty());
+    ledger.cellsOutcome = ModemOutcome::Done;
+    modem.isEnabled = true;
+    modem.signalRate = 0;
+    plug();
+    loop.advance(5s);
+    EXPECT_EQ(ledger.rates.size(), 1u);
+    EXPECT_EQ(listener.cell(0, kRKCellMonitorPID), Value::integer(416));
 }
 
 TEST_F(ModemSourceTest, FailedListFallsBackAndIsTriedAgain)
