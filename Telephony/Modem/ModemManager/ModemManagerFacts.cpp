@@ -77,15 +77,13 @@ std::optional<CellKind> cellKindOf(std::uint32_t technologies)
 
 std::optional<Technology> technologyOf(std::uint32_t technologies)
 {
+    if (const auto kind = cellKindOf(technologies))
+        return *kind == CellKind::LTE ? Technology::LTE : Technology::GSM;
     if (technologies == AnyTechnology)
         return std::nullopt;
-    if (technologies & (TechnologiesOfLTE | Technology5G))
+    if (technologies & Technology5G)
         return Technology::LTE;
-    if (technologies & (TechnologiesOfUMTS | TechnologiesOfGSM))
-        return Technology::GSM;
-    if (technologies & TechnologiesOfCDMA)
-        return Technology::CDMA;
-    return std::nullopt;
+    return technologies & TechnologiesOfCDMA ? std::optional(Technology::CDMA) : std::nullopt;
 }
 
 SignalFacts signalFacts(const QVariantMap& properties, std::optional<CellKind> kind)
