@@ -55,8 +55,13 @@ public:
     {
         return std::make_unique<Stream>(*this, sink);
     }
+    void setTechnologyHandler(std::function<void()> handler) override
+    {
+        technologyHandler = std::move(handler);
+    }
     std::vector<Bytes> messages;
     int streams = 0;
+    std::function<void()> technologyHandler;
 };
 
 class TelephonyServiceTest : public testing::Test {
@@ -203,6 +208,17 @@ TEST_F(TelephonyServiceTest, FullClientStopsTheStreamUntilThereIsRoom)
     isFull = false;
     ports.makeRoom();
     EXPECT_EQ(ports.sent.size(), 4u);
+}
+
+TEST_F(TelephonyServiceTest, ChangeOfTechnologyEndsAllChannelsAndTheServiceStays)
+{
+    start(openChannel(), nullptr, nullptr);
+    openChannel("other");
+    source.technologyHandler();
+    EXPECT_EQ(service.channels(), 0u);
+    EXPECT_EQ(source.streams, 0);
+    EXPECT_EQ(ports.localPorts(), 1u) << "the service's own";
+    EXPECT_EQ(openChannel(), "org.spectrel.Telephony.LogChannel.3");
 }
 
 TEST_F(TelephonyServiceTest, SecondServiceIsRefused)
