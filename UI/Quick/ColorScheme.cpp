@@ -3,7 +3,6 @@
 #include <QEvent>
 #include <QGuiApplication>
 #include <QPalette>
-#include <QtDBus/QDBusConnection>
 #include <QtDBus/QDBusMessage>
 
 #include <utility>
@@ -29,11 +28,9 @@ QVariant unwrapped(QVariant value)
 
 } // namespace
 
-ColorScheme::ColorScheme(QObject* parent)
-    : QObject(parent)
+ColorScheme::ColorScheme(QDBusConnection bus)
 {
     QGuiApplication::instance()->installEventFilter(this);
-    QDBusConnection bus = QDBusConnection::sessionBus();
     if (!bus.isConnected())
         return;
     bus.connect(

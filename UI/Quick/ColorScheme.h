@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QObject>
+#include <QtDBus/QDBusConnection>
 #include <QtDBus/QDBusVariant>
 
 namespace spectrel {
@@ -11,7 +12,8 @@ class ColorScheme final : public QObject {
     Q_OBJECT
 
 public:
-    explicit ColorScheme(QObject* parent = nullptr);
+    /// `bus` is where the portal is met.
+    explicit ColorScheme(QDBusConnection bus = QDBusConnection::sessionBus());
 
     bool isDark() const;
     bool eventFilter(QObject* watched, QEvent* event) override;

@@ -270,7 +270,10 @@ TEST_F(PaneScreenTest, VerticalDragOverALongValueScrollsTheList)
     drag(row(8), {0, -200});
     settle();
     EXPECT_GT(contentY(), 50);
-    EXPECT_EQ(itemIn(*row(8), "area")->property("contentX").toDouble(), 0);
+    for (int index = 0; index < 100; ++index) {
+        const QQuickItem* shown = row(index);
+        EXPECT_TRUE(!shown || itemIn(*shown, "area")->property("contentX").toDouble() == 0) << index;
+    }
 }
 
 TEST_F(PaneScreenTest, TouchingALongValueIsATouchOfItsRow)

@@ -104,6 +104,15 @@ bool QuickFixture::waitFor(const std::function<bool()>& condition)
         Patience);
 }
 
+void QuickFixture::waitForFrame()
+{
+    bool isDrawn = false;
+    const auto drawing = QObject::connect(&window(), &QQuickWindow::frameSwapped, [&isDrawn] { isDrawn = true; });
+    window().update();
+    EXPECT_TRUE(waitFor([&isDrawn] { return isDrawn; }));
+    QObject::disconnect(drawing);
+}
+
 void QuickFixture::settle()
 {
     EXPECT_TRUE(waitFor([this] {

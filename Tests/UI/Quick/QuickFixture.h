@@ -32,6 +32,8 @@ protected:
     void openAllowingSave();
     /// Turns the event loop, and what the controllers have queued, until the condition holds.
     bool waitFor(const std::function<bool()>& condition);
+    /// The window is drawn once more: what was placed before has its place then.
+    void waitForFrame();
     /// Nothing slides or flicks any more.
     void settle();
 

@@ -30,6 +30,7 @@ protected:
     void chooseFromMenu(const char* action)
     {
         ASSERT_TRUE(waitFor([this, action] { return item(action); }));
+        waitForFrame();
         touch(item(action));
     }
     void waitUntilFindIsClosed()

@@ -18,9 +18,17 @@ Popup {
     focus: true
     padding: 0
     closePolicy: Popup.NoAutoClose
-    visible: find.isOpen
-    onAboutToShow: field.clear()
-    onOpened: field.forceActiveFocus()
+    onClosed: field.clear()
+
+    readonly property bool isWanted: find.isOpen
+    onIsWantedChanged: {
+        if (isWanted) {
+            open();
+            field.forceActiveFocus();
+        } else {
+            close();
+        }
+    }
 
     enter: Transition {
         NumberAnimation { property: "opacity"; from: 0; to: 1; duration: Theme.fade }
