@@ -34,7 +34,7 @@ ColorScheme::ColorScheme(QDBusConnection bus)
     if (!bus.isConnected())
         return;
     bus.connect(
-        QString(), Path, Interface, "SettingChanged", this, SLOT(settingDidChange(QString, QString, QDBusVariant)));
+        Service, Path, Interface, "SettingChanged", this, SLOT(settingDidChange(QString, QString, QDBusVariant)));
     QDBusMessage question = QDBusMessage::createMethodCall(Service, Path, Interface, "Read");
     question << Group << Key;
     const QDBusMessage answer = bus.call(question, QDBus::Block, Patience);
