@@ -81,6 +81,16 @@ void print(const char* what, std::vector<double> times)
         at(0.5), at(0.99), at(1), at(0.5) / Frame * 100, times.size());
 }
 
+QQuickItem* itemNamed(const QQuickItem& parent, const QString& name)
+{
+    for (QQuickItem* child : parent.childItems()) {
+        QQuickItem* const found = child->objectName() == name ? child : itemNamed(*child, name);
+        if (found)
+            return found;
+    }
+    return nullptr;
+}
+
 class Benchmark {
 public:
     explicit Benchmark(int rows)
@@ -162,7 +172,7 @@ private:
 
     bool measureScrolling(SpectrelApp& app)
     {
-        QQuickItem* const list = _frontEnd.window()->contentItem()->findChild<QQuickItem*>("rows");
+        QQuickItem* const list = itemNamed(*_frontEnd.window()->contentItem(), "rows");
         const double end = list->property("contentHeight").toDouble() - list->height();
         std::vector<double> times;
         for (int step = 0; step < 600; ++step) {

@@ -45,14 +45,6 @@ public:
         const QVariant value = QVariant::fromValue(QDBusVariant(_scheme));
         return question.member() == "Read" && bus.send(question.createReply(QVariant::fromValue(QDBusVariant(value))));
     }
-    static void tell(uint scheme)
-    {
-        QDBusMessage news = QDBusMessage::createSignal(
-            "/org/freedesktop/portal/desktop", "org.freedesktop.portal.Settings", "SettingChanged");
-        news << "org.freedesktop.appearance"
-             << "color-scheme" << QVariant::fromValue(QDBusVariant(scheme));
-        QDBusConnection(PortalConnection).send(news);
-    }
 
 private:
     QThread _thread;
@@ -98,19 +90,13 @@ TEST_F(ColorSchemeTest, WithoutAPortalThePaletteTells)
     EXPECT_TRUE(colors.isDark());
 }
 
-TEST_F(ColorSchemeTest, PortalOverrulesThePaletteAndIsFollowed)
+TEST_F(ColorSchemeTest, PortalOverrulesThePalette)
 {
     startBus();
     const Portal portal(bus->address(), 1);
     setPalette(Qt::white, Qt::black);
     const ColorScheme colors(desktop());
     EXPECT_TRUE(colors.isDark());
-    Portal::tell(2);
-    EXPECT_TRUE(waitFor([&colors] { return !colors.isDark(); }));
-    Portal::tell(1);
-    EXPECT_TRUE(waitFor([&colors] { return colors.isDark(); }));
-    Portal::tell(0); // no preference: the palette again
-    EXPECT_TRUE(waitFor([&colors] { return !colors.isDark(); }));
 }
 
 TEST_F(ColorSchemeTest, BusWithoutAPortalLeavesItToThePalette)
