@@ -6,6 +6,8 @@
 #include "Tests/Sections/GSMUMTS/UMTSCellSetsRecord.h"
 #include "Tests/Sections/SectionFixture.h"
 
+#include <type_traits>
+
 namespace spectrel {
 namespace {
 

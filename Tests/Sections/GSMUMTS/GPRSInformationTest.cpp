@@ -132,6 +132,17 @@ TEST_F(GPRSInformationTest, OperatingModeOneIsClass2AndThreeIsUnknown)
         textsForEachByte({"Class 1", "Class 2", "Class 3"}, "Unknown"));
 }
 
+TEST_F(GPRSInformationTest, BytesAreUnsigned)
+{
+    deliver(0x51F6, RecordBuilder(0x51F6, 24).u8(16, 250));
+    deliver(0x51FD, RecordBuilder(0x51FD, 35).u8(13, 251).u8(14, 252).u8(15, 253).u8(16, 254));
+    EXPECT_EQ(shown("DRX Timer Max"), "\"250\"");
+    EXPECT_EQ(shown("Packet PSI Status"), "\"251\"");
+    EXPECT_EQ(shown("Count LR"), "\"252\"");
+    EXPECT_EQ(shown("Count HR"), "\"253\"");
+    EXPECT_EQ(shown("Ext Measurement Order"), "\"254\"");
+}
+
 TEST_F(GPRSInformationTest, ItsNeighbourCodesAreLoggedAsUnknown)
 {
     for (const std::uint32_t code : {0x51F7u, 0x51F8u, 0x51F9u, 0x51FAu, 0x51FCu, 0x4005u}) {

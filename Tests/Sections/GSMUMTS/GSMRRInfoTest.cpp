@@ -61,8 +61,9 @@ TEST_F(GSMRRInfoTest, MeasurementIsShownInOrder)
 {
     deliver(0x5137, RecordBuilder(0x5137, 28).u8(15, 63));
     EXPECT_EQ(display(), "{}");
-    deliver(0x5137, RecordBuilder(0x5137, 29).u8(15, 63).u32(16, 7).u32(20, 0xFFFFFFFF));
-    EXPECT_EQ(display(), "{\"Serving Rx Level\": \"63\", \"Rx Quality Full\": \"7\", \"Rx Quality Sub\": \"-1\"}");
+    deliver(0x5137, RecordBuilder(0x5137, 29).u8(15, 63).u32(16, 0x12345678).u32(20, 0xFFFFFFFF));
+    EXPECT_EQ(
+        display(), "{\"Serving Rx Level\": \"63\", \"Rx Quality Full\": \"305419896\", \"Rx Quality Sub\": \"-1\"}");
     EXPECT_EQ(log(), std::string(Trace) + Trace);
 }
 
@@ -83,6 +84,15 @@ TEST_F(GSMRRInfoTest, DRXIsShownInSeconds)
     EXPECT_EQ(display(), "{\"DRX Used\": \"2 sec\"}");
     deliver(0x51F6, RecordBuilder(0x51F6, 24).u8(16, 255));
     EXPECT_EQ(display(), "{\"DRX Used\": \"255 sec\"}");
+}
+
+TEST_F(GSMRRInfoTest, BytesAreUnsigned)
+{
+    deliver(0x512C, RecordBuilder(0x512C, 17).u8(14, 254).u8(15, 255));
+    deliver(0x5137, RecordBuilder(0x5137, 29).u8(15, 253));
+    EXPECT_EQ(shown("RR Sub State"), "\"254\"");
+    EXPECT_EQ(shown("RR Status"), "\"255\"");
+    EXPECT_EQ(shown("Serving Rx Level"), "\"253\"");
 }
 
 TEST_F(GSMRRInfoTest, OtherCodeIsLoggedAsUnknown)

@@ -60,6 +60,14 @@ TEST_F(GSMServingCellTest, MeasurementOf28BytesChangesNothing)
     EXPECT_EQ(log(), Trace);
 }
 
+TEST_F(GSMServingCellTest, NumbersOfItsRecordsAreUnsigned)
+{
+    deliver(0x5134, RecordBuilder(0x5134, 26).u16(13, 65533).u16(15, 65534).u16(17, 65535));
+    EXPECT_EQ(display(), "{\"Cell ID\": \"65535\", \"ARFCN\": \"65533\", \"BSIC\": \"65534\"}");
+    deliver(0x5076, RecordBuilder(0x5076, 17).u16(13, 0xFFFE));
+    EXPECT_EQ(shown("MA Dedicated ARFCN"), "\"254\"");
+}
+
 TEST_F(GSMServingCellTest, FirstServingGSMCellOfTheCellInformationIsShown)
 {
     const auto umts = informationOfCell(kRKCellMonitorRadioAccessTechnologyUMTS, kRKCellMonitorCellTypeServing,

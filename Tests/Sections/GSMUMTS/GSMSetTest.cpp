@@ -26,11 +26,11 @@ TEST_F(GSMSetTest, CellsAreListedWithTheirKeysInOrder)
     RecordBuilder record(0x4005, 15 + 2 * 7);
     record.u8(14, 2);
     record.u16(15, 62).u16(17, 41).u8(19, 0x100 - 83).u16(20, 0x10000 - 12);
-    record.u16(22, 1023).u16(24, 65535).u8(26, 5).u16(27, 300);
+    record.u16(22, 65534).u16(24, 65535).u8(26, 5).u16(27, 300);
     deliver(0x4005, record);
     EXPECT_EQ(display(),
         "[{\"ARFCN\": \"62\", \"BSIC\": \"41\", \"RSSI\": \"-83 dBm\", \"Ranking Value\": \"-12\"}, "
-        "{\"ARFCN\": \"1023\", \"BSIC\": \"65535\", \"RSSI\": \"5 dBm\", \"Ranking Value\": \"300\"}]");
+        "{\"ARFCN\": \"65534\", \"BSIC\": \"65535\", \"RSSI\": \"5 dBm\", \"Ranking Value\": \"300\"}]");
     EXPECT_EQ(log(), Trace);
 }
 

@@ -98,8 +98,12 @@ TEST_F(HSDPAInformationTest, RecordWithoutProcessesLeavesTheirLists)
 
 TEST_F(HSDPAInformationTest, NumbersAreUnsigned)
 {
-    deliver(0x4221, RecordBuilder(0x4221, 27).u8(16, 1).u32(19, 0xFFFFFFFF));
-    EXPECT_NE(shown("Primary HARQ Process").find("\"No Rx Bits\": \"4294967295\""), std::string::npos);
+    deliver(0x4221,
+        RecordBuilder(0x4221, 27).u8(13, 255).u8(16, 1).u8(18, 254).u32(19, 0xFFFFFFFF).u16(23, 65533).u16(25, 65532));
+    EXPECT_EQ(shown("Version"), "\"255\"");
+    EXPECT_EQ(shown("Primary HARQ Process"),
+        "[{\"Process ID\": \"254\", \"No Rx Bits\": \"4294967295\", \"New Tx\": \"65533\", "
+        "\"Block Errors\": \"65532\"}]");
 }
 
 TEST_F(HSDPAInformationTest, ProcessesPastTheEndOfTheRecordReadAsZeros)
