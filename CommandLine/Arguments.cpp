@@ -18,6 +18,7 @@ constexpr const char* Environment =
     "  SPECTREL_PORT_DIR       where the telephony service is met (default: $XDG_RUNTIME_DIR/spectrel)\n"
     "  SPECTREL_CRASH_LOG_DIR  where snapshots go (default: $XDG_STATE_HOME/spectrel/CrashReporter)\n"
     "  SPECTREL_DEVICE_ROOT    prefix of the device's absolute paths (default: /)\n"
+    "  SPECTREL_DIAGNOSTIC_LOG file for what the decoders tell their developers (default: none)\n"
     "  NO_COLOR                no colours in the terminal screens\n"
     "Exit status: 0 done, 1 something could not be done, 2 wrong usage.";
 
@@ -56,6 +57,25 @@ void addCommon(CLI::App& command, Arguments& arguments)
         ->type_name("FILE");
 }
 
+void addScreens(CLI::App& command, Arguments& arguments)
+{
+    auto* graphical = command.add_flag_callback(
+        "--gui", [&arguments] { arguments.screens = ScreenChoice::Graphical; }, "Open the graphical screens");
+    command
+        .add_flag_callback(
+            "--terminal", [&arguments] { arguments.screens = ScreenChoice::Terminal; }, "Open the terminal screens")
+        ->excludes(graphical);
+}
+
+template <typename Set> void addTechnology(CLI::App* command, Set set)
+{
+    command
+        ->add_option_function<std::string>(
+            "--technology", [set](const std::string& name) { set(technologyNamed(name)); },
+            "The technology, where the file does not tell")
+        ->check(IsTechnology);
+}
+
 void addWatch(CLI::App& program, Arguments& arguments)
 {
     CLI::App* command = program.add_subcommand("watch", "Print the live session, once at each refresh");
@@ -75,14 +95,22 @@ void addDecode(CLI::App& program, Arguments& arguments)
     command->add_option("FILE", decode.files, "The recordings, decoded one after the other")->required();
     addFormat(command, [&decode](OutputFormat format) { decode.format = format; });
     command->add_flag("--each", decode.each, "With --format json: one line for each message");
-    command
-        ->add_option_function<std::string>(
-            "--technology", [&decode](const std::string& name) { decode.technology = technologyNamed(name); },
-            "The technology, where the file does not tell")
-        ->check(IsTechnology);
+    addTechnology(command, [&decode](std::optional<Technology> technology) { decode.technology = technology; });
     command->add_option("--snapshot", decode.snapshotDirectory, "Write a snapshot file into this folder at the end")
         ->type_name("DIR");
     command->add_flag("--keep-going", decode.keepGoing, "Go on after a message that would end the program");
+}
+
+void addView(CLI::App& program, Arguments& arguments)
+{
+    ViewOptions& view = arguments.view;
+    CLI::App* command = program.add_subcommand(
+        "view", "Browse a recording or a snapshot in the screens; a recording plays, pauses, steps and seeks");
+    command->callback([&arguments] { arguments.job = Job::View; });
+    addCommon(*command, arguments);
+    addScreens(*command, arguments);
+    command->add_option("FILE", view.file, "A capture, a snapshot or a DLF file")->required();
+    addTechnology(command, [&view](std::optional<Technology> technology) { view.technology = technology; });
 }
 
 void addRecord(CLI::App& program, Arguments& arguments)
@@ -90,7 +118,24 @@ void addRecord(CLI::App& program, Arguments& arguments)
     CLI::App* command = program.add_subcommand("record", "Record the live session into a capture file (pcap)");
     command->callback([&arguments] { arguments.job = Job::Record; });
     addCommon(*command, arguments);
-    command->add_option("FILE", arguments.record.file, "The capture file; an existing one is overwritten")->required();
+    RecordingFilesOptions& files = arguments.record.files;
+    command
+        ->add_option("FILE", files.target,
+            "The capture file; an existing one is overwritten. A folder (or a new one: FOLDER/) takes numbered files, "
+            "on from those that are there")
+        ->required();
+    command
+        ->add_option_function<std::string>(
+            "--rollover", [&files](const std::string& text) { files.largestFile = parseSize(text); },
+            "Begin a further file before one has more bytes than this, such as 100M")
+        ->check(IsSize);
+    command
+        ->add_option_function<std::string>(
+            "--rollover-time", [&files](const std::string& text) { files.longestFile = parseDuration(text); },
+            "Begin a further file after this time, such as 1h")
+        ->check(IsDuration);
+    command->add_option("--keep", files.keep, "Of the numbered files keep the last so many, remove the older ones")
+        ->check(CLI::PositiveNumber);
     addLimits(command, arguments.record.count, "End after this many messages", arguments.record.duration);
 }
 
@@ -103,19 +148,18 @@ std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
     program.set_version_flag("--version", "spectrel " SPECTREL_VERSION);
     program.require_subcommand(0, 1);
     addCommon(program, arguments);
-    auto* graphical = program.add_flag_callback(
-        "--gui", [&arguments] { arguments.screens = ScreenChoice::Graphical; }, "Open the graphical screens");
-    program
-        .add_flag_callback(
-            "--terminal", [&arguments] { arguments.screens = ScreenChoice::Terminal; }, "Open the terminal screens")
-        ->excludes(graphical);
+    addScreens(program, arguments);
     addWatch(program, arguments);
     addDecode(program, arguments);
+    addView(program, arguments);
     addRecord(program, arguments);
     try {
         program.parse(argc, argv);
         if (arguments.decode.each && arguments.decode.format != OutputFormat::Json)
             throw CLI::ValidationError("--each", "goes with --format json only");
+        const RecordingFilesOptions& files = arguments.record.files;
+        if (files.target == "-" && (files.largestFile || files.longestFile || files.keep))
+            throw CLI::ValidationError("--rollover", "standard output is one stream");
     } catch (const CLI::Success& answered) {
         return program.exit(answered); // --help and --version, on standard output
     } catch (const CLI::ParseError& error) {

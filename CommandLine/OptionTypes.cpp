@@ -18,6 +18,29 @@ const CLI::Validator IsDuration(
     },
     "TIME");
 
+const CLI::Validator IsSize(
+    [](std::string& text) {
+        return parseSize(text) ? std::string() : "'" + text + "' is no size such as 500k, 100M or 2G";
+    },
+    "SIZE");
+
+std::optional<std::uint64_t> parseSize(std::string_view text)
+{
+    static constexpr std::array<std::pair<std::string_view, double>, 4> Units {
+        {{"", 1.0}, {"k", 1e3}, {"M", 1e6}, {"G", 1e9}}};
+    constexpr double Smallest = 1000;
+    const std::size_t digits = std::min(text.find_first_not_of("0123456789."), text.size());
+    double number = 0;
+    const auto result = std::from_chars(text.data(), text.data() + digits, number);
+    if (digits == 0 || result.ec != std::errc() || result.ptr != text.data() + digits)
+        return std::nullopt;
+    for (const auto& [unit, bytes] : Units) {
+        if (text.substr(digits) == unit && number * bytes >= Smallest && number * bytes < 1e15)
+            return static_cast<std::uint64_t>(std::llround(number * bytes));
+    }
+    return std::nullopt;
+}
+
 std::optional<std::chrono::milliseconds> parseDuration(std::string_view text)
 {
     static constexpr std::array<std::pair<std::string_view, double>, 5> Units {

@@ -5,11 +5,6 @@
 #include "Platform/Qt/TerminationSignals.h"
 #include "Platform/Recording.h"
 
-#include <cerrno>
-#include <cstring>
-#include <filesystem>
-#include <unistd.h>
-
 namespace spectrel {
 
 namespace {
@@ -21,15 +16,15 @@ class Recorder final : public SpectrelModelObserver {
 public:
     explicit Recorder(const RecordOptions& options)
         : _options(options)
+        , _files(options.files)
         , _model(_live.services(), *this, LiveServices::portPrefixFor("Record"))
     {
     }
 
     int run()
     {
-        if (const std::filesystem::path folder = std::filesystem::path(_options.file).parent_path();
-            _options.file != "-" && ::access(folder.empty() ? "." : folder.c_str(), W_OK) != 0) {
-            fail(_options.file + ": " + std::strerror(errno));
+        if (!_files.prepare()) {
+            fail(_files.error());
             return _status;
         }
         const TerminationSignals terminationSignals([this](int) { _live.runLoop().quit(); });
@@ -39,24 +34,27 @@ public:
         _live.runLoop().run();
         _model.destroyPorts();
         flush();
-        if (!_writer && _status == 0)
-            fail(_options.file + ": nothing was recorded, for no session was opened");
+        if (_files.count() == 0 && _status == 0)
+            fail(_options.files.target + ": nothing was recorded, for no session was opened");
         else if (_status == 0)
-            report(_path + ": " + std::to_string(_messages) + " messages");
+            report(_files.path() + ": " + std::to_string(_messages) + " messages"
+                + (_files.count() > 1 ? " in " + std::to_string(_files.count()) + " files, this one being the last"
+                                      : ""));
         return _status;
     }
 
     bool modelShouldApply(ByteView body) override
     {
-        if (_status == 0 && openWriter())
-            write(body);
+        if (const auto technology = technologyOfConstant(_model.technology());
+            technology && _status == 0 && _messages != _options.count)
+            write(*technology, body);
         return false;
     }
     void updateViewControllerFromModel() override { }
     void sessionDidChange() override
     {
         if (_model.isConnected())
-            openWriter();
+            begin();
         else if (!_model.lostReason().empty())
             report("Connecting... (" + _model.lostReason() + ")");
     }
@@ -69,44 +67,21 @@ private:
         _live.runLoop().quit();
     }
 
-    /// The capture's link type tells the technology, so another technology needs another file.
-    bool openWriter()
+    /// The file is there from the session's start on, before the first message.
+    void begin()
     {
         const auto technology = technologyOfConstant(_model.technology());
-        if (!technology)
-            return false;
-        if (_writer && technology == _technology)
-            return true;
-        flush();
-        if (_writer)
-            ++_files;
-        _path = pathOfFile();
-        std::string reason;
-        _writer = createRecording(_path, *technology, reason);
-        _technology = *technology;
-        if (!_writer) {
-            fail(_path + ": " + reason);
-            return false;
-        }
-        if (_files > 1)
-            report("the technology is now " + std::string(technologyName(*technology)) + "; recording into " + _path);
-        return true;
+        if (technology && _status == 0 && !_files.begin(*technology, Clock::installed().now()))
+            fail(_files.error());
     }
 
-    /// FILE, then FILE-2, FILE-3, ... with the extension kept.
-    std::string pathOfFile() const
+    void write(Technology technology, ByteView body)
     {
-        const std::filesystem::path path(_options.file);
-        if (_files == 1)
-            return _options.file;
-        return (path.parent_path() / (path.stem().string() + "-" + std::to_string(_files) + path.extension().string()))
-            .string();
-    }
-
-    void write(ByteView body)
-    {
-        if (!_writer->write(Clock::installed().now(), body))
-            return fail(_path + ": " + _writer->error());
+        const std::size_t before = _files.count();
+        if (!_files.write(technology, Clock::installed().now(), body))
+            return fail(_files.error());
+        if (before > 0 && _files.count() > before)
+            report("recording into " + _files.path());
         if (!_flushIsDue) {
             _flushIsDue = true;
             _live.runLoop().after(FlushDelay, [this] { flush(); });
@@ -118,17 +93,14 @@ private:
     void flush()
     {
         _flushIsDue = false;
-        if (_writer && !_writer->flush() && _status == 0)
-            fail(_path + ": " + _writer->error());
+        if (!_files.flush() && _status == 0)
+            fail(_files.error());
     }
 
     const RecordOptions& _options;
+    RecordingFiles _files;
     LiveServices _live;
     SpectrelModel _model;
-    std::unique_ptr<RecordingWriter> _writer;
-    std::string _path;
-    Technology _technology = Technology::LTE;
-    int _files = 1;
     std::uint64_t _messages = 0;
     bool _flushIsDue = false;
     int _status = 0;

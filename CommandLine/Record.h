@@ -1,21 +1,22 @@
 #pragma once
 
+#include "CommandLine/RecordingFiles.h"
+
 #include <chrono>
 #include <cstdint>
 #include <optional>
-#include <string>
 
 namespace spectrel {
 
 /// What `spectrel record` was asked for.
 struct RecordOptions {
-    std::string file;
+    RecordingFilesOptions files;
     std::optional<std::uint64_t> count; // messages
     std::optional<std::chrono::milliseconds> duration;
 };
 
-/// Records a live session into a capture file, as delivered, until interrupted or until what was asked for is recorded.
-/// A baseband that changes its technology goes on in a further file. Answers the program's exit status.
+/// Records a live session into capture files, as delivered, until interrupted or until what was asked for is recorded.
+/// Messages reach the file at most half a second after they came. Answers the program's exit status.
 int record(const RecordOptions& options);
 
 } // namespace spectrel

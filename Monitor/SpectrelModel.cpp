@@ -264,10 +264,16 @@ void SpectrelModel::updateWithData(ByteView data)
         _messageInProgress = {};
     }
     _updated = true;
+    _intake += data.size();
+    if (_intake >= LargestIntake && _recvPort && _displayUpdateTimer)
+        _recvPort->setPaused(true);
 }
 
 void SpectrelModel::refresh()
 {
+    if (_intake >= LargestIntake && _recvPort)
+        _recvPort->setPaused(false);
+    _intake = 0;
     if (_sendPort && _recvPort && !_sendPort->isValid()) {
         const auto port = _recvPort; // the handler, still installed, restarts the session and lets go of the port
         port->invalidate();
@@ -299,10 +305,7 @@ NodeRef SpectrelModel::nodeAtPath(std::string_view path)
 {
     if (!_nodesByPath)
         topLevelNodes();
-    if (!_nodesByPath)
-        return nullptr;
-    const auto found = _nodesByPath->find(std::string(path));
-    return found == _nodesByPath->end() ? nullptr : found->second;
+    return _nodesByPath ? nodeInIndex(*_nodesByPath, path) : nullptr;
 }
 
 ListRef SpectrelModel::getSaveContents()

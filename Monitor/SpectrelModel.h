@@ -26,6 +26,8 @@ public:
     virtual void updateViewControllerFromModel() = 0;
     /// The session was opened or lost, or the reason why there is none has changed.
     virtual void sessionDidChange() { }
+    /// The place on the time line, or how it moves, has changed.
+    virtual void playbackDidChange() { }
     /// One inbound message body. False keeps it from being applied: a recorder wants the bytes alone.
     virtual bool modelShouldApply(ByteView)
     {
@@ -47,6 +49,9 @@ public:
     static constexpr std::chrono::milliseconds RefreshInterval {2000};
     static constexpr std::chrono::seconds RetryDelay {5};
     static constexpr std::chrono::seconds RequestTimeout {1};
+    /// Message bytes applied between two refreshes; a faster service has to wait for the next one. The history keeps
+    /// what came between refreshes, so that this bounds the memory. A radio sends a hundredth of it.
+    static constexpr std::size_t LargestIntake = 8 * 1024 * 1024;
     /// The application's name on the message ports; other programs take one of their own in its place.
     static constexpr std::string_view ApplicationPrefix = "org.spectrel.Spectrel";
 
@@ -126,6 +131,7 @@ private:
     std::shared_ptr<RemoteMessagePort> _sendPort;
     std::unique_ptr<Timer> _displayUpdateTimer;
     bool _updated = false;
+    std::size_t _intake = 0; // bytes applied since the last refresh
     GeneratorSlot _logGenerator;
     DictionaryRef _state;
     NodeRef _nodes;

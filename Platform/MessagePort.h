@@ -40,6 +40,9 @@ public:
     virtual const std::string& name() const = 0;
     /// Starts the delivery of messages on the main queue.
     virtual void serve() = 0;
+    /// A paused port takes no messages: its senders' queues fill, and they have to wait. Safe within the handler, which
+    /// is then not called again until the pause is over.
+    virtual void setPaused(bool isPaused) = 0;
     /// Called once when the port becomes invalid, from outside or through `invalidate`; an empty handler removes it.
     virtual void setInvalidationHandler(InvalidationHandler handler) = 0;
     /// Closes the port and frees its name at once; a second call does nothing. Safe within the port's own handlers.

@@ -21,6 +21,7 @@ inline constexpr std::string_view PortNameKey = "PortName";
 enum class ChannelError : std::int32_t {
     None = 0,
     MalformedRequest = 22, // no dictionary with a local port name
+    NotReady = 11, // the baseband is not known yet
     NoSuchPort = 2, // nobody serves the local port
     TooManyChannels = 24,
 };

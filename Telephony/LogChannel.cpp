@@ -15,6 +15,9 @@ namespace {
 
 namespace Protocol = TelephonyProtocol;
 
+/// Behind the program's own name in the local port of each of this system's programs.
+constexpr const char* EveryClientsSuffix = ".BasebandStateReport.LogChannel";
+
 Bytes serialised(const Value& value)
 {
     const std::string text = serialisePropertyList(value).value_or(std::string());
@@ -64,19 +67,20 @@ bool Subscription::wants(ByteView message) const
     return _wantsEverything || !routedCode(message, code) || _codes.contains(code);
 }
 
-LogChannel::LogChannel(RunLoop& runLoop, LogSource& source, std::string name, std::function<void()> onEnd)
+LogChannel::LogChannel(RunLoop& runLoop, LogSource& source, unsigned number, std::function<void()> onEnd)
     : _runLoop(runLoop)
     , _source(source)
-    , _name(std::move(name))
     , _onEnd(std::move(onEnd))
     , _alive(std::make_shared<bool>(true))
 {
+    _status.name = "channel " + std::to_string(number);
 }
 
-std::unique_ptr<LogChannel> LogChannel::open(RunLoop& runLoop, MessagePorts& ports, LogSource& source,
-    const std::string& name, const std::string& clientPort, std::function<void()> onEnd)
+std::unique_ptr<LogChannel> LogChannel::open(RunLoop& runLoop, MessagePorts& ports, LogSource& source, unsigned number,
+    const std::string& clientPort, std::function<void()> onEnd)
 {
-    std::unique_ptr<LogChannel> channel(new LogChannel(runLoop, source, name, std::move(onEnd)));
+    const std::string name = std::string(Protocol::ServicePort) + ".LogChannel." + std::to_string(number);
+    std::unique_ptr<LogChannel> channel(new LogChannel(runLoop, source, number, std::move(onEnd)));
     LogChannel* self = channel.get();
     channel->_client = ports.createRemote(clientPort);
     if (!channel->_client)
@@ -91,7 +95,8 @@ std::unique_ptr<LogChannel> LogChannel::open(RunLoop& runLoop, MessagePorts& por
         if (self->_stream)
             self->_stream->resume();
     });
-    tell(name + " opened for " + clientPort);
+    channel->_status.client = clientPort.substr(0, clientPort.find(EveryClientsSuffix));
+    tell(channel->_status.name + " opened for " + channel->_status.client);
     return channel;
 }
 
@@ -110,7 +115,7 @@ LogChannel::~LogChannel()
 std::optional<Bytes> LogChannel::handleRequest(std::int32_t id, ByteView body)
 {
     if (id != Protocol::LogChannelId) {
-        tell(_name + ": a request of unknown id " + std::to_string(id));
+        tell(_status.name + ": a request of unknown id " + std::to_string(id));
         return errorAnswer("unknown message id");
     }
     const auto request = parsePropertyList(body);
@@ -120,7 +125,7 @@ std::optional<Bytes> LogChannel::handleRequest(std::int32_t id, ByteView body)
     }
     auto subscription = request ? Subscription::fromStartCommand(*request) : std::nullopt;
     if (!subscription) {
-        tell(_name + ": a request that cannot be understood");
+        tell(_status.name + ": a request that cannot be understood");
         return errorAnswer("the request cannot be understood");
     }
     startStreaming(std::move(*subscription));
@@ -129,9 +134,9 @@ std::optional<Bytes> LogChannel::handleRequest(std::int32_t id, ByteView body)
 
 void LogChannel::startStreaming(Subscription subscription)
 {
-    tell(_name + ": streaming "
-        + (subscription.wantsEverything() ? std::string("everything")
-                                          : std::to_string(subscription.count()) + " codes"));
+    const std::string client = _status.client;
+    _status = {_status.name, client, subscription.description(), true, false, Clock::installed().now(), 0, 0, 0, 0};
+    tell(_status.name + ": streaming " + _status.wish + " to " + client);
     _stream.reset();
     _subscription = std::move(subscription);
     _stream = _source.start(*this);
@@ -139,13 +144,28 @@ void LogChannel::startStreaming(Subscription subscription)
 
 bool LogChannel::deliver(ByteView message)
 {
-    if (!_subscription || !_subscription->wants(message))
+    if (!_subscription || !_subscription->wants(message)) {
+        ++_status.notAskedFor;
         return true;
+    }
     const SendStatus status = _client->sendRequest(Protocol::LogChannelId, message, std::chrono::nanoseconds::zero(),
         std::chrono::nanoseconds::zero(), ReplyMode::None, nullptr);
     if (status == SendStatus::TransportError)
-        tell(_name + ": a message of " + std::to_string(message.size()) + " bytes cannot be sent");
-    return status != SendStatus::SendTimeout;
+        tell(_status.name + ": a message of " + std::to_string(message.size()) + " bytes cannot be sent");
+    _status.isFull = status == SendStatus::SendTimeout;
+    if (status == SendStatus::Success)
+        ++_status.sent;
+    return !_status.isFull;
+}
+
+ChannelStatus LogChannel::status() const
+{
+    ChannelStatus status = _status;
+    if (_stream) {
+        status.waiting = _stream->waiting();
+        status.lost = _stream->lost();
+    }
+    return status;
 }
 
 /// The client is gone. Its end may be noticed in the middle of a delivery, so it is dealt with from the queue.
@@ -154,7 +174,8 @@ void LogChannel::end()
     _runLoop.async([this, alive = std::weak_ptr(_alive)] {
         if (alive.expired())
             return;
-        tell(_name + " closed");
+        tell(_status.name + " closed: " + _status.client + " is gone, after " + std::to_string(_status.sent)
+            + " messages");
         const auto onEnd = std::move(_onEnd);
         onEnd(); // destroys this channel
     });

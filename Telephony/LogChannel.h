@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Platform/Clock.h"
 #include "Platform/MessagePort.h"
 #include "Platform/RunLoop.h"
 #include "Platform/Value.h"
@@ -23,13 +24,10 @@ public:
 
     /// Messages that have no code are wanted by everybody.
     bool wants(ByteView message) const;
-    std::size_t count() const
+    /// "12 codes", "everything".
+    std::string description() const
     {
-        return _codes.size();
-    }
-    bool wantsEverything() const
-    {
-        return _wantsEverything;
+        return _wantsEverything ? "everything" : std::to_string(_codes.size()) + " codes";
     }
 
 private:
@@ -37,26 +35,47 @@ private:
     bool _wantsEverything = false;
 };
 
+/// How one channel is doing.
+struct ChannelStatus {
+    std::string name; // "channel 1"
+    std::string client; // its port, without what every client's has behind its name
+    std::string wish; // "12 codes"
+    bool isStreaming = false;
+    bool isFull = false; // the client has no room
+    Moment started {}; // with the latest start command
+    std::uint64_t sent = 0;
+    std::uint64_t notAskedFor = 0;
+    std::size_t waiting = 0;
+    std::uint64_t lost = 0;
+};
+
 /// One client's log channel: answers its requests and streams what it asked for to its local port.
 class LogChannel final : public MessageSink {
 public:
     /// `onEnd` is called from the main queue once the client has gone; it may destroy the channel.
     /// Null when the port cannot be made or nobody serves the client's.
-    static std::unique_ptr<LogChannel> open(RunLoop& runLoop, MessagePorts& ports, LogSource& source,
-        const std::string& name, const std::string& clientPort, std::function<void()> onEnd);
+    static std::unique_ptr<LogChannel> open(RunLoop& runLoop, MessagePorts& ports, LogSource& source, unsigned number,
+        const std::string& clientPort, std::function<void()> onEnd);
     ~LogChannel() override;
 
     bool deliver(ByteView message) override;
 
+    /// Of the port for requests.
+    const std::string& portName() const
+    {
+        return _requests->name();
+    }
+    ChannelStatus status() const;
+
 private:
-    LogChannel(RunLoop& runLoop, LogSource& source, std::string name, std::function<void()> onEnd);
+    LogChannel(RunLoop& runLoop, LogSource& source, unsigned number, std::function<void()> onEnd);
     std::optional<Bytes> handleRequest(std::int32_t id, ByteView body);
     void startStreaming(Subscription subscription);
     void end();
 
     RunLoop& _runLoop;
     LogSource& _source;
-    std::string _name;
+    ChannelStatus _status; // but for what the stream knows
     std::function<void()> _onEnd;
     std::shared_ptr<bool> _alive;
     std::shared_ptr<LocalMessagePort> _requests;

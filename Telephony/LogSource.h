@@ -3,7 +3,11 @@
 #include "Platform/Bytes.h"
 #include "Platform/Recording.h"
 
+#include <cstddef>
+#include <cstdint>
+#include <functional>
 #include <memory>
+#include <string>
 
 namespace spectrel {
 
@@ -22,6 +26,16 @@ public:
     virtual ~LogStream() = default;
     /// There is room again after `deliver` had refused a message.
     virtual void resume() = 0;
+    /// Messages that wait for the client to have room.
+    virtual std::size_t waiting() const
+    {
+        return 0;
+    }
+    /// Messages that the client was too slow for.
+    virtual std::uint64_t lost() const
+    {
+        return 0;
+    }
 };
 
 /// A baseband: real, recorded or simulated.
@@ -29,8 +43,24 @@ class LogSource {
 public:
     virtual ~LogSource() = default;
     virtual Technology technology() const = 0;
+    /// False while the technology is not known yet; no channel is opened then.
+    virtual bool isReady() const
+    {
+        return true;
+    }
+    /// What it is and how far it has come, in one line for people.
+    virtual std::string status() const
+    {
+        return std::string(technologyName(technology()));
+    }
     /// Starts streaming to one channel; the sink outlives the stream.
     virtual std::unique_ptr<LogStream> start(MessageSink& sink) = 0;
+    /// `handler` is called from the main queue when `technology` has become another one; the channels then end, so that
+    /// their clients ask for it again. Sources of a fixed technology never call it.
+    virtual void setTechnologyHandler(std::function<void()> handler)
+    {
+        static_cast<void>(handler);
+    }
 };
 
 } // namespace spectrel

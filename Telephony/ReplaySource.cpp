@@ -11,6 +11,10 @@ namespace {
 
 /// Messages delivered in one turn of the run loop, so that other channels have theirs.
 constexpr int MessagesPerTurn = 64;
+/// Messages passed over in one turn.
+constexpr int PassedPerTurn = 20'000;
+/// Of the time between two files, what is waited for.
+constexpr std::chrono::seconds LongestGap {10};
 
 } // namespace
 
@@ -34,12 +38,22 @@ public:
     }
 
 private:
+    enum class Reading : std::uint8_t { Done, Busy, Over };
+
     /// Delivers what is due, up to a turn's worth.
     void play()
     {
         for (int count = 0; count < MessagesPerTurn; ++count) {
-            if (!_message && !readNext())
-                return;
+            if (!_message) {
+                switch (readNext()) {
+                case Reading::Over:
+                    return;
+                case Reading::Busy:
+                    return later(std::chrono::nanoseconds::zero());
+                case Reading::Done:
+                    break;
+                }
+            }
             if (const auto wait = untilDue(); wait > std::chrono::nanoseconds::zero())
                 return later(wait);
             if (!_sink.deliver(_message->body)) {
@@ -68,43 +82,71 @@ private:
     {
         if (_options.speed <= 0)
             return {};
-        if (!_origin) {
+        const bool isAfterGap = _isFirstOfFile && _message->time - _last > LongestGap;
+        if (!_origin || _message->time < _last || isAfterGap) {
             _origin = _message->time;
             _startedAt = _clock.now();
         }
+        _last = _message->time;
+        _isFirstOfFile = false;
         const auto recorded = static_cast<double>((_message->time - *_origin).count());
         const std::chrono::microseconds place(std::llround(recorded / _options.speed));
         return place - (_clock.now() - _startedAt);
     }
 
-    /// False at the end of all files.
-    bool readNext()
+    /// The next message between the two points.
+    Reading readNext()
     {
-        for (std::size_t opened = 0;;) {
+        for (int passed = 0; passed < PassedPerTurn;) {
             RecordedMessage message;
             if (_reader && _reader->next(message)) {
-                _message = message;
-                _hasPlayed = true;
-                return true;
+                if (isWithin(message.time)) {
+                    _message = message;
+                    _hasPlayed = true;
+                    return Reading::Done;
+                }
+                ++passed;
+            } else if (!openNext()) {
+                return Reading::Over;
             }
-            if (_reader && !_reader->damage().empty())
-                tell(_options.files[_file - 1] + ": " + _reader->damage());
+        }
+        return Reading::Busy;
+    }
+
+    bool isWithin(Moment time)
+    {
+        if (!_range) {
+            _range.emplace(_options.from ? _options.from->in(time, _clock) : Moment::min(),
+                _options.to ? _options.to->in(time, _clock) : Moment::max());
+        }
+        return time >= _range->first && time <= _range->second;
+    }
+
+    /// False at the end of all files.
+    bool openNext()
+    {
+        if (_reader && !_reader->damage().empty())
+            tell(_options.files[_file - 1] + ": " + _reader->damage());
+        _reader.reset();
+        while (!_reader) {
             if (_file == _options.files.size() && !rewind())
                 return false;
-            if (opened++ > _options.files.size())
-                return false; // nothing to read in any of them
             std::string reason;
             _reader = openRecording(_options.files[_file++], reason);
             if (!_reader)
                 tell(_options.files[_file - 1] + ": " + reason);
         }
+        _isFirstOfFile = true;
+        return true;
     }
 
     bool rewind()
     {
-        _reader.reset();
-        if (!_options.loop || !std::exchange(_hasPlayed, false)) {
-            tell("the replay has ended");
+        const bool hasPlayed = std::exchange(_hasPlayed, false);
+        _isEmpty = _isEmpty && !hasPlayed;
+        if (!_options.loop || !hasPlayed) {
+            tell(_isEmpty && _range ? "the replay has ended: no message lies between --from and --to"
+                                    : "the replay has ended");
             return false;
         }
         _file = 0;
@@ -120,8 +162,12 @@ private:
     std::unique_ptr<RecordingReader> _reader;
     std::size_t _file = 0; // the next one to open
     std::optional<RecordedMessage> _message; // read, not delivered yet
+    std::optional<std::pair<Moment, Moment>> _range; // of the messages to play; known from the first message on
     std::optional<Moment> _origin;
     Moment _startedAt {};
+    Moment _last {}; // the latest message's time
+    bool _isFirstOfFile = false;
+    bool _isEmpty = true; // nothing was played so far
     bool _isStopped = false; // the client had no room
     bool _hasPlayed = false; // since the last rewind
 };
@@ -166,6 +212,14 @@ std::unique_ptr<ReplaySource> ReplaySource::open(
 std::unique_ptr<LogStream> ReplaySource::start(MessageSink& sink)
 {
     return std::make_unique<Stream>(_runLoop, _clock, _options, sink);
+}
+
+std::string ReplaySource::status() const
+{
+    std::string text = _options.files.front();
+    if (_options.files.size() > 1)
+        text += " and " + std::to_string(_options.files.size() - 1) + " more";
+    return text + " (" + std::string(technologyName(_technology)) + ")" + (_options.loop ? ", looping" : "");
 }
 
 } // namespace spectrel

@@ -4,6 +4,7 @@
 #include "Platform/Recording.h"
 #include "Platform/RunLoop.h"
 #include "Telephony/LogSource.h"
+#include "Telephony/ReplayPoint.h"
 
 #include <memory>
 #include <optional>
@@ -18,10 +19,15 @@ struct ReplayOptions {
     double speed = 1; // times as fast as recorded; 0: as fast as the client takes them
     bool loop = false;
     std::optional<Technology> technology; // where a file does not tell
+    std::optional<ReplayPoint> from {}; // messages before it are passed over
+    std::optional<ReplayPoint> to {}; // and those after it
 };
 
 /// Plays recordings. Each channel hears them from their start, from its own start command on; nothing is dropped for a
 /// slow client. After the end the channel stays open and silent.
+///
+/// Messages keep their distances. Where the time goes back, and from one file to the next over more than ten seconds,
+/// it goes on at once.
 class ReplaySource final : public LogSource {
 public:
     /// Null when a file cannot be read, does not tell its technology, or tells another one than the first; `reason`
@@ -34,6 +40,7 @@ public:
         return _technology;
     }
     std::unique_ptr<LogStream> start(MessageSink& sink) override;
+    std::string status() const override;
 
 private:
     class Stream;

@@ -3,6 +3,7 @@
 #include "Platform/Dictionary.h"
 #include "Platform/PropertyList.h"
 #include "Platform/TelephonyProtocol.h"
+#include "Telephony/Tell.h"
 
 namespace spectrel {
 
@@ -33,8 +34,10 @@ TelephonyService::TelephonyService(RunLoop& runLoop, MessagePorts& ports, LogSou
 TelephonyService::~TelephonyService()
 {
     _channels.clear();
-    if (_port)
-        _port->invalidate();
+    if (!_port)
+        return;
+    _source.setTechnologyHandler({});
+    _port->invalidate();
 }
 
 bool TelephonyService::start()
@@ -45,7 +48,31 @@ bool TelephonyService::start()
         return false;
     _port = port;
     _port->serve();
+    _source.setTechnologyHandler([this] { endChannels(); });
     return true;
+}
+
+/// The source's technology is another one now: the clients are to ask for it, and choose their codes, anew.
+void TelephonyService::endChannels()
+{
+    if (!_channels.empty())
+        tell("ending " + std::to_string(_channels.size()) + " channel(s): their technology has changed");
+    _channels.clear();
+    tellChange();
+}
+
+void TelephonyService::tellChange()
+{
+    if (_changeHandler)
+        _changeHandler();
+}
+
+std::vector<ChannelStatus> TelephonyService::status() const
+{
+    std::vector<ChannelStatus> status;
+    for (const auto& [number, channel] : _channels)
+        status.push_back(channel->status());
+    return status;
 }
 
 Bytes TelephonyService::handleRequest(std::int32_t id, ByteView body)
@@ -56,15 +83,20 @@ Bytes TelephonyService::handleRequest(std::int32_t id, ByteView body)
         : nullptr;
     if (!clientPort || clientPort->empty())
         return answer(ChannelError::MalformedRequest);
+    if (!_source.isReady())
+        return answer(ChannelError::NotReady);
     if (_channels.size() >= MostChannels)
         return answer(ChannelError::TooManyChannels);
     const unsigned number = ++_lastChannel;
-    const std::string name = std::string(Protocol::ServicePort) + ".LogChannel." + std::to_string(number);
-    auto channel =
-        LogChannel::open(_runLoop, _ports, _source, name, *clientPort, [this, number] { _channels.erase(number); });
+    auto channel = LogChannel::open(_runLoop, _ports, _source, number, *clientPort, [this, number] {
+        _channels.erase(number);
+        tellChange();
+    });
     if (!channel)
         return answer(ChannelError::NoSuchPort);
+    const std::string name = channel->portName();
     _channels.emplace(number, std::move(channel));
+    tellChange();
     return answer(ChannelError::None, name);
 }
 

@@ -6,9 +6,12 @@
 #include "Telephony/LogSource.h"
 
 #include <cstddef>
+#include <functional>
 #include <map>
 #include <memory>
 #include <string>
+#include <utility>
+#include <vector>
 
 namespace spectrel {
 
@@ -28,9 +31,17 @@ public:
     {
         return _channels.size();
     }
+    std::vector<ChannelStatus> status() const;
+    /// Called whenever a channel has come or gone.
+    void setChangeHandler(std::function<void()> handler)
+    {
+        _changeHandler = std::move(handler);
+    }
 
 private:
     Bytes handleRequest(std::int32_t id, ByteView body);
+    void endChannels();
+    void tellChange();
 
     RunLoop& _runLoop;
     MessagePorts& _ports;
@@ -38,6 +49,7 @@ private:
     std::shared_ptr<LocalMessagePort> _port;
     std::map<unsigned, std::unique_ptr<LogChannel>> _channels;
     unsigned _lastChannel = 0;
+    std::function<void()> _changeHandler;
 };
 
 } // namespace spectrel

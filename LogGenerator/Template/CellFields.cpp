@@ -9,7 +9,7 @@ namespace spectrel {
 
 namespace {
 
-void storeCell(const Dictionary& cell, std::span<const CellField> fields, Dictionary& section)
+void storeCellIn(Dictionary& section, const Dictionary& cell, std::span<const CellField> fields)
 {
     TextBuffer buffer;
     for (const CellField& field : fields) {
@@ -30,18 +30,21 @@ bool holdsCells(const CellInfoArrayReader& reader)
 
 } // namespace
 
+void storeCell(const Dictionary& cell, std::span<const CellField> fields, const Value& sectionRef)
+{
+    Dictionary lost; // takes the values of a section that has no node
+    const auto& section = sectionRef.dictionary();
+    storeCellIn(section ? *section : lost, cell, fields);
+}
+
 void storeServingCell(RecordView record, std::initializer_list<std::string_view> technologies,
     std::span<const CellField> fields, const Value& sectionRef)
 {
     const CellInfoArrayReader reader(record);
     if (!holdsCells(reader))
         return;
-    const DictionaryRef cell = reader.firstServingCell(technologies);
-    if (!cell)
-        return;
-    Dictionary lost; // takes the values of a section that has no node
-    const auto& section = sectionRef.dictionary();
-    storeCell(*cell, fields, section ? *section : lost);
+    if (const DictionaryRef cell = reader.firstServingCell(technologies))
+        storeCell(*cell, fields, sectionRef);
 }
 
 void listNeighborCells(
@@ -56,7 +59,7 @@ void listNeighborCells(
     List entries;
     for (const DictionaryRef& cell : reader.neighborCells(technology)) {
         auto entry = Dictionary::make();
-        storeCell(*cell, fields, *entry);
+        storeCellIn(*entry, *cell, fields);
         entries.append(entry);
     }
     Base::replaceArray(list, entries);

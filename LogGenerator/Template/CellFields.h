@@ -20,6 +20,9 @@ struct CellField {
     const char* missing;
 };
 
+/// Writes a cell's fields in table order; a node that is none loses them.
+void storeCell(const Dictionary& cell, std::span<const CellField> fields, const Value& sectionRef);
+
 /// Writes the fields of the record's first serving cell of one of the technologies, in table order; changes nothing
 /// when there is none. Logs "Failed to get Cell Array" for a payload that does not parse.
 void storeServingCell(RecordView record, std::initializer_list<std::string_view> technologies,

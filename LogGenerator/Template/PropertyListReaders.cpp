@@ -33,6 +33,16 @@ bool isCell(const Value& value, std::string_view technology, std::string_view ty
         && isText((*cell)[kRKCellMonitorCellType], type);
 }
 
+std::vector<DictionaryRef> cellsOf(const Value& value, std::string_view technology, std::string_view type)
+{
+    std::vector<DictionaryRef> cells;
+    for (const Value& element : elementsOf(value)) {
+        if (isCell(element, technology, type))
+            cells.push_back(element.dictionary());
+    }
+    return cells;
+}
+
 } // namespace
 
 LogCode_0xFF0000::LogCode_0xFF0000(RecordView record)
@@ -77,14 +87,14 @@ DictionaryRef CellInfoArrayReader::firstServingCell(
     return nullptr;
 }
 
+std::vector<DictionaryRef> CellInfoArrayReader::servingCells(std::string_view radioAccessTechnology) const
+{
+    return cellsOf(_cells, radioAccessTechnology, kRKCellMonitorCellTypeServing);
+}
+
 std::vector<DictionaryRef> CellInfoArrayReader::neighborCells(std::string_view radioAccessTechnology) const
 {
-    std::vector<DictionaryRef> cells;
-    for (const Value& element : elementsOf(_cells)) {
-        if (isCell(element, radioAccessTechnology, kRKCellMonitorCellTypeNeighbor))
-            cells.push_back(element.dictionary());
-    }
-    return cells;
+    return cellsOf(_cells, radioAccessTechnology, kRKCellMonitorCellTypeNeighbor);
 }
 
 } // namespace spectrel

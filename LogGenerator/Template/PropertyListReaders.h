@@ -61,7 +61,8 @@ public:
     /// The first serving cell of any of the technologies, which has both a technology and a cell type. Null when there
     /// is none; an object that is no list has no cells.
     DictionaryRef firstServingCell(std::initializer_list<std::string_view> radioAccessTechnologies) const;
-    /// The neighbour cells of the technology, in the list's order.
+    /// All serving cells of the technology, and all neighbour cells, in the list's order.
+    std::vector<DictionaryRef> servingCells(std::string_view radioAccessTechnology) const;
     std::vector<DictionaryRef> neighborCells(std::string_view radioAccessTechnology) const;
 
 private:

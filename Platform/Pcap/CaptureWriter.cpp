@@ -29,10 +29,17 @@ struct CaptureCloser {
 using Capture = std::unique_ptr<pcap_t, CaptureCloser>;
 using Dumper = std::unique_ptr<pcap_dumper_t, CaptureCloser>;
 
+constexpr std::size_t PacketHeaderLength = 16;
+/// Of the file's buffer. Only whole packets leave it, so that a program that is killed leaves a file that ends with
+/// one.
+constexpr std::size_t BufferSize = 512 * 1024;
+static_assert(BufferSize > LargestMessage + PacketHeaderLength);
+
 class CaptureWriter final : public RecordingWriter {
 public:
-    explicit CaptureWriter(Dumper dumper)
-        : _dumper(std::move(dumper))
+    CaptureWriter(std::unique_ptr<char[]> buffer, Dumper dumper)
+        : _buffer(std::move(buffer))
+        , _dumper(std::move(dumper))
     {
     }
     bool write(Moment time, ByteView body) override;
@@ -49,7 +56,9 @@ private:
         return false;
     }
 
+    std::unique_ptr<char[]> _buffer; // the file's, so that it ends after it
     Dumper _dumper;
+    std::size_t _buffered = 0; // bytes since the last flush
     bool _isBroken = false; // the file holds a part of a packet, perhaps; nothing may follow
     std::string _error;
 };
@@ -70,6 +79,10 @@ bool CaptureWriter::write(Moment time, ByteView body)
     header.ts.tv_usec = (time - second).count();
     header.caplen = static_cast<std::uint32_t>(body.size());
     header.len = header.caplen;
+    const std::size_t length = PacketHeaderLength + body.size();
+    if (_buffered + length > BufferSize && !flush())
+        return false;
+    _buffered += length;
     errno = 0;
     pcap_dump(reinterpret_cast<std::uint8_t*>(_dumper.get()), &header, body.data());
     _isBroken = std::ferror(pcap_dump_file(_dumper.get())) != 0;
@@ -80,6 +93,7 @@ bool CaptureWriter::flush()
 {
     if (_isBroken)
         return false;
+    _buffered = 0;
     _isBroken = pcap_dump_flush(_dumper.get()) != 0;
     return !_isBroken || failed(std::strerror(errno));
 }
@@ -101,6 +115,8 @@ std::unique_ptr<RecordingWriter> createRecording(const std::string& path, Techno
         reason = std::strerror(errno);
         return nullptr;
     }
+    auto buffer = std::make_unique_for_overwrite<char[]>(BufferSize);
+    std::setvbuf(file, buffer.get(), _IOFBF, BufferSize);
     const auto link = std::ranges::find(LinkTypes, technology, &LinkType::technology);
     const Capture capture(pcap_open_dead(link->number, LargestMessage));
     Dumper dumper(pcap_dump_fopen(capture.get(), file)); // closes the file when it fails
@@ -108,7 +124,7 @@ std::unique_ptr<RecordingWriter> createRecording(const std::string& path, Techno
         reason = pcap_geterr(capture.get());
         return nullptr;
     }
-    auto writer = std::make_unique<CaptureWriter>(std::move(dumper));
+    auto writer = std::make_unique<CaptureWriter>(std::move(buffer), std::move(dumper));
     if (!writer->flush()) { // the head stands in the file from the start
         reason = writer->error();
         return nullptr;

@@ -18,11 +18,6 @@ unsigned u16(ByteView bytes, std::size_t place)
     return place + 2 <= bytes.size() ? bytes[place] | unsigned(bytes[place + 1]) << 8 : 0;
 }
 
-bool startsWithVersionReport(ByteView bytes)
-{
-    return u16(bytes, 0) >= SmallestItem && u16(bytes, 2) == VersionReportCode;
-}
-
 class DLFReader final : public RecordingReader {
 public:
     explicit DLFReader(Bytes bytes);
@@ -55,8 +50,8 @@ DLFReader::DLFReader(Bytes bytes)
     if (_start > _bytes.size())
         _damage = "version report at byte 0: it has a length of " + std::to_string(_start) + ", "
             + std::to_string(_bytes.size()) + " bytes are left";
-    else if (_start >= TimeOfWriting + 4)
-        _time = Moment(std::chrono::seconds(u16(_bytes, TimeOfWriting) | u16(_bytes, TimeOfWriting + 2) << 16));
+    else
+        _time = timeOfVersionReport(ByteView(_bytes).first(_start));
 }
 
 bool DLFReader::next(RecordedMessage& message)
@@ -83,6 +78,18 @@ bool DLFReader::next(RecordedMessage& message)
 }
 
 } // namespace
+
+bool startsWithVersionReport(ByteView bytes)
+{
+    return u16(bytes, 0) >= SmallestItem && u16(bytes, 2) == VersionReportCode;
+}
+
+Moment timeOfVersionReport(ByteView report)
+{
+    if (report.size() < TimeOfWriting + 4)
+        return {};
+    return Moment(std::chrono::seconds(u16(report, TimeOfWriting) | u16(report, TimeOfWriting + 2) << 16));
+}
 
 bool looksLikeDLF(ByteView bytes)
 {

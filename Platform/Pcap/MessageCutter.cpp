@@ -25,6 +25,7 @@ constexpr int BeheadedWrapperScore = 2;
 constexpr int UnknownTypeScore = 0;
 constexpr int SkipScore = -106;
 constexpr int DamageScore = -100;
+constexpr int OpenScore = 0; // the bytes end within a message
 constexpr std::int32_t NoWay = std::numeric_limits<std::int32_t>::min() / 2;
 
 } // namespace
@@ -52,6 +53,25 @@ MessageCutter::Candidate MessageCutter::message(std::size_t place) const
     if (!isItem(type + 1))
         return {};
     return {type + 1 + itemLength(type + 1) - place, isKnownType(type) ? MessageScore : UnknownTypeScore, {}};
+}
+
+/// Whether an item may start at the place whose rest is to come.
+bool MessageCutter::isStartOfItem(std::size_t place) const
+{
+    return place + 2 > _bytes.size()
+        || (itemLength(place) >= SmallestItem && itemLength(place) > _bytes.size() - place);
+}
+
+/// Whether a message may start at the place whose rest is to come.
+bool MessageCutter::goesOn(std::size_t place) const
+{
+    if (_end == SequenceEnd::Whole || place >= _bytes.size())
+        return false;
+    const std::size_t type = place + (_bytes[place] == Wrapper ? 2 : 0);
+    if (type >= _bytes.size() || (isKnownType(type) && isStartOfItem(type + 1)))
+        return true;
+    return _sequence == MessageSequence::Beheaded
+        && (isStartOfItem(place) || (isKnownType(place + 1) && isStartOfItem(place + 2)));
 }
 
 /// Calls `visit` with each message that may start at the place.
@@ -102,7 +122,8 @@ void MessageCutter::plan()
         std::int32_t score = 0;
         bestCandidate(place, score);
         const bool isSure = message(place).score == MessageScore; // is never skipped
-        _best[i - 1] = isSure ? score : std::max({score, bestBehind + SkipScore, DamageScore});
+        const int atWorst = goesOn(place) ? OpenScore : DamageScore;
+        _best[i - 1] = isSure ? score : std::max({score, bestBehind + SkipScore, atWorst});
         bestBehind = std::max(bestBehind, score);
     }
 }
@@ -136,14 +157,33 @@ bool MessageCutter::next(Cut& cut)
     std::int32_t score = 0;
     const Candidate candidate = bestCandidate(_place, score);
     if (candidate.length != 0 && score == bestOf(_place)) {
-        cut = {_place, candidate.length, candidate.missingByte};
+        cut = {_place, candidate.length, candidate.missingByte, false};
     } else {
         const auto end = endOfPiece();
         if (!end || !isRefusedMessage(*end))
             return false;
-        cut = {_place, *end - _place, {}};
+        cut = {_place, *end - _place, {}, true};
     }
     _place += cut.length;
+    return true;
+}
+
+bool MessageCutter::skipDamage(Cut& cut)
+{
+    constexpr std::int32_t LeastEvidence = 3 * BeheadedScore;
+    std::optional<std::size_t> best;
+    std::int32_t bestScore = NoWay;
+    for (std::size_t place = _place + 1; place < _planned + _best.size(); ++place) {
+        std::int32_t score = 0;
+        if (bestCandidate(place, score).length != 0 && score > bestScore) {
+            best = place;
+            bestScore = score;
+        }
+    }
+    if (!best || bestScore < LeastEvidence)
+        return false;
+    cut = {_place, *best - _place, {}, true};
+    _place = *best;
     return true;
 }
 

@@ -18,6 +18,12 @@ enum class MessageSequence : std::uint8_t {
     Beheaded,
 };
 
+/// Where the bytes to be cut end.
+enum class SequenceEnd : std::uint8_t {
+    Whole, // with a message
+    Anywhere, // within one, perhaps: more bytes are to come
+};
+
 /// Cuts log messages that lie back to back.
 ///
 /// An item starts with its own length (16 bits, little-endian, 12 to 65535, the two bytes included). Received bytes
@@ -31,16 +37,26 @@ public:
         std::size_t start = 0;
         std::size_t length = 0;
         std::optional<std::uint8_t> missingByte; // stood before the cut when the message was received
+        bool isRefused = false; // no proper message: what lies between two
     };
 
-    MessageCutter(ByteView bytes, MessageSequence sequence)
+    MessageCutter(ByteView bytes, MessageSequence sequence, SequenceEnd end = SequenceEnd::Whole)
         : _bytes(bytes)
         , _sequence(sequence)
+        , _end(end)
     {
     }
 
-    /// False at the end and where the bytes are damaged.
+    /// False at the end, where the bytes are damaged, and where they end within a message.
     bool next(Cut& cut);
+    /// After `next` has answered false with bytes left: whether they are the start of a message whose rest is to come.
+    bool endsWithin() const
+    {
+        return goesOn(_place) && bestOf(_place) == 0;
+    }
+    /// Goes on behind the damage at which `next` has stopped, where the best way starts. False when none leads on that
+    /// explains three messages without their first byte, or one as it stands.
+    bool skipDamage(Cut& cut);
     /// Where the next message starts.
     std::size_t place() const
     {
@@ -59,6 +75,8 @@ private:
     bool isItem(std::size_t place) const;
     std::size_t itemLength(std::size_t place) const;
     bool isKnownType(std::size_t place) const;
+    bool isStartOfItem(std::size_t place) const;
+    bool goesOn(std::size_t place) const;
     Candidate message(std::size_t place) const;
     template <typename Visitor> void visitCandidates(std::size_t place, Visitor visit) const;
     std::int32_t bestOf(std::size_t place) const;
@@ -69,6 +87,7 @@ private:
 
     ByteView _bytes;
     MessageSequence _sequence;
+    SequenceEnd _end;
     std::size_t _place = 0;
     std::size_t _planned = 0; // the plan's first place
     std::size_t _replanAt = 0; // where the plan looks too little ahead

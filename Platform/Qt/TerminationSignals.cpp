@@ -7,6 +7,7 @@
 #include <fcntl.h>
 #include <unistd.h>
 #include <utility>
+#include <vector>
 
 namespace spectrel {
 
@@ -25,9 +26,11 @@ void noteSignal(int signal)
 } // namespace
 
 struct TerminationSignals::Private {
-    explicit Private(Handler called)
+    Private(Handler called, std::initializer_list<int> further)
         : handler(std::move(called))
     {
+        for (const int signal : further)
+            former.push_back({signal, {}});
         [[maybe_unused]] const int made = ::pipe2(ends, O_CLOEXEC | O_NONBLOCK);
         writingEnd = ends[1];
         notifier = std::make_unique<QSocketNotifier>(ends[0], QSocketNotifier::Read);
@@ -63,11 +66,11 @@ struct TerminationSignals::Private {
         int signal;
         struct sigaction action;
     };
-    Former former[3] = {{SIGINT, {}}, {SIGTERM, {}}, {SIGHUP, {}}};
+    std::vector<Former> former {{SIGINT, {}}, {SIGTERM, {}}, {SIGHUP, {}}};
 };
 
-TerminationSignals::TerminationSignals(Handler handler)
-    : _private(std::make_unique<Private>(std::move(handler)))
+TerminationSignals::TerminationSignals(Handler handler, std::initializer_list<int> further)
+    : _private(std::make_unique<Private>(std::move(handler), further))
 {
 }
 

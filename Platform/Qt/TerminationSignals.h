@@ -1,6 +1,7 @@
 #pragma once
 
 #include <functional>
+#include <initializer_list>
 #include <memory>
 
 namespace spectrel {
@@ -11,7 +12,8 @@ class TerminationSignals {
 public:
     using Handler = std::function<void(int signal)>;
 
-    explicit TerminationSignals(Handler handler);
+    /// `further`: more signals to be turned into calls.
+    explicit TerminationSignals(Handler handler, std::initializer_list<int> further = {});
     ~TerminationSignals();
     TerminationSignals(const TerminationSignals&) = delete;
     TerminationSignals& operator=(const TerminationSignals&) = delete;

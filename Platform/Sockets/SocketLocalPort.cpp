@@ -35,6 +35,7 @@ public:
     }
 
     void serve();
+    void setPaused(bool isPaused);
     void close();
     void invalidate();
 
@@ -73,6 +74,7 @@ private:
     InvalidationHandler _invalidation;
     std::unique_ptr<QSocketNotifier> _acceptNotifier;
     std::vector<Connection> _connections;
+    bool _isPaused = false;
     bool _isFull = false; // a sender was turned away, and logged, since the last one ended
     wire::Buffer _buffer;
 };
@@ -85,13 +87,21 @@ void SocketLocalPort::Core::serve()
     QObject::connect(_acceptNotifier.get(), &QSocketNotifier::activated, [this] { acceptSenders(); });
 }
 
+void SocketLocalPort::Core::setPaused(bool isPaused)
+{
+    _isPaused = isPaused;
+    for (const Connection& each : _connections)
+        each.notifier->setEnabled(!isPaused);
+}
+
 void SocketLocalPort::Core::close()
 {
     if (!isOpen())
         return;
     _acceptNotifier.reset();
     _connections.clear();
-    ::unlink(_path.c_str());
+    if (!_path.empty())
+        ::unlink(_path.c_str());
     _socket.close();
     _lock.reset(); // last: until here nobody else can bind the path
 }
@@ -145,6 +155,7 @@ void SocketLocalPort::Core::add(FileDescriptor socket)
     const int number = socket.number();
     ::setsockopt(number, SOL_SOCKET, SO_SNDBUF, &wire::SendBuffer, sizeof wire::SendBuffer);
     auto notifier = std::make_unique<QSocketNotifier>(number, QSocketNotifier::Read);
+    notifier->setEnabled(!_isPaused);
     QObject::connect(notifier.get(), &QSocketNotifier::activated, [this, number] { receiveFrom(number); });
     _connections.push_back({std::move(socket), std::move(notifier)});
 }
@@ -152,7 +163,7 @@ void SocketLocalPort::Core::add(FileDescriptor socket)
 void SocketLocalPort::Core::receiveFrom(int socket)
 {
     const auto self = shared_from_this(); // the handler may end the port
-    for (int taken = 0; taken < LargestBatch && isOpen() && receiveOne(socket); ++taken) { }
+    for (int taken = 0; taken < LargestBatch && isOpen() && !_isPaused && receiveOne(socket); ++taken) { }
 }
 
 /// True while there may be more to take from a connection that still stands.
@@ -226,6 +237,11 @@ const std::string& SocketLocalPort::name() const
 void SocketLocalPort::serve()
 {
     _core->serve();
+}
+
+void SocketLocalPort::setPaused(bool isPaused)
+{
+    _core->setPaused(isPaused);
 }
 
 void SocketLocalPort::setInvalidationHandler(InvalidationHandler handler)

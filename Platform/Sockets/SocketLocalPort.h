@@ -15,12 +15,13 @@ public:
     static constexpr int LargestBatch = 64; // messages that one sender gets in before the run loop turns
     static constexpr std::size_t MostConnections = 64; // further senders are turned away
 
-    /// `socket` listens at `path`; `lock` is the right to the name.
+    /// `socket` listens at `path` (empty: a file that stays when the port ends); `lock` is the right to the name.
     SocketLocalPort(std::string name, std::string path, NameLock lock, FileDescriptor socket, MessageHandler handler);
     ~SocketLocalPort() override;
 
     const std::string& name() const override;
     void serve() override;
+    void setPaused(bool isPaused) override;
     void setInvalidationHandler(InvalidationHandler handler) override;
     void invalidate() override;
     bool isValid() const override;

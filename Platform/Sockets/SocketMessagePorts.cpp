@@ -8,6 +8,7 @@
 
 #include <cerrno>
 #include <cstring>
+#include <fcntl.h>
 #include <sys/socket.h>
 #include <unistd.h>
 #include <utility>
@@ -62,13 +63,31 @@ MessagePorts::LocalResult SocketMessagePorts::createLocal(
     auto lock = NameLock::take(_directory, name);
     if (!lock)
         return {};
-    FileDescriptor socket = listenAt(*address);
+    const auto adopted = _adopted.extract(std::string(name));
+    FileDescriptor socket = adopted ? std::move(adopted.mapped()) : listenAt(*address);
     if (!socket)
         return {};
-    auto port = std::make_shared<SocketLocalPort>(
-        std::string(name), address->sun_path, std::move(*lock), std::move(socket), std::move(handler));
+    // The file of a socket that was made elsewhere is not ours to remove.
+    auto port = std::make_shared<SocketLocalPort>(std::string(name), adopted ? std::string() : address->sun_path,
+        std::move(*lock), std::move(socket), std::move(handler));
     _locals.insert_or_assign(std::string(name), port);
     return {std::move(port), false};
+}
+
+bool SocketMessagePorts::adopt(std::string_view name, FileDescriptor socket, std::string& reason)
+{
+    const auto expected = portAddress(_directory, name);
+    sockaddr_un address = {};
+    socklen_t length = sizeof address;
+    if (!expected || ::getsockname(socket.number(), reinterpret_cast<sockaddr*>(&address), &length) != 0
+        || std::strncmp(address.sun_path, expected->sun_path, sizeof address.sun_path) != 0) {
+        reason = "the socket passed on listens at " + std::string(address.sun_path) + ", clients look for it at "
+            + (expected ? expected->sun_path : _directory);
+        return false;
+    }
+    ::fcntl(socket.number(), F_SETFL, ::fcntl(socket.number(), F_GETFL) | O_NONBLOCK);
+    _adopted.insert_or_assign(std::string(name), std::move(socket));
+    return true;
 }
 
 std::shared_ptr<RemoteMessagePort> SocketMessagePorts::createRemote(std::string_view name)

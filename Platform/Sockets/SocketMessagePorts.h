@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Platform/MessagePort.h"
+#include "Platform/Sockets/FileDescriptor.h"
 
 #include <map>
 #include <memory>
@@ -18,12 +19,16 @@ public:
 
     /// Makes the folder at need. Null and logged when it belongs to somebody else or the name cannot be used.
     LocalResult createLocal(std::string_view name, LocalMessagePort::MessageHandler handler) override;
+    /// Gives the listening socket of a name that was made elsewhere: `createLocal` of the name serves it. False, with
+    /// `reason`, when it does not listen where the name is looked for.
+    bool adopt(std::string_view name, FileDescriptor socket, std::string& reason);
     /// Null when nobody, or another user, serves the name.
     std::shared_ptr<RemoteMessagePort> createRemote(std::string_view name) override;
 
 private:
     std::string _directory;
     std::map<std::string, std::weak_ptr<LocalMessagePort>, std::less<>> _locals; // of this process
+    std::map<std::string, FileDescriptor, std::less<>> _adopted; // until they are served
 };
 
 } // namespace spectrel

@@ -78,6 +78,15 @@ private:
     double _decibels;
 };
 
+/// A stretch of the road where hills take up to `loss` dB, in its middle.
+struct Valley {
+    double from; // metres along the road
+    double to;
+    double loss;
+
+    double lossAt(const Journey& journey) const;
+};
+
 /// Path loss in dB at a distance in metres, not below 35 m (3GPP TR 36.942, 4.5.2: macro cell, urban, 2 GHz:
 /// 128.1 + 37.6 lg(d/km)).
 double pathLoss(double metres);

@@ -1,25 +1,17 @@
 #include "Telephony/Simulator/SimulatorSource.h"
 
-#include "Telephony/Tell.h"
+#include "Telephony/ChannelQueue.h"
 
 #include <algorithm>
-#include <deque>
 
 namespace spectrel {
 
-namespace {
-
-/// Live messages wait for a client that is busy; beyond this many the oldest go, and the loss is told.
-constexpr std::size_t LongestQueue = 4096;
-
-} // namespace
-
-/// One channel's share: what its client has no room for waits here.
+/// One channel's share.
 class SimulatorSource::Stream final : public LogStream {
 public:
     Stream(SimulatorSource& source, MessageSink& sink)
         : _source(source)
-        , _sink(sink)
+        , _queue(sink)
     {
     }
     ~Stream() override
@@ -29,30 +21,24 @@ public:
 
     void send(ByteView record)
     {
-        if (_waiting.empty() && _sink.deliver(record))
-            return;
-        _waiting.emplace_back(record.begin(), record.end());
-        if (_waiting.size() > LongestQueue) {
-            _waiting.pop_front();
-            ++_lost;
-        }
+        _queue.send(record);
     }
-
     void resume() override
     {
-        while (!_waiting.empty() && _sink.deliver(_waiting.front()))
-            _waiting.pop_front();
-        if (_waiting.empty() && _lost > 0) {
-            tell("a client was too slow and lost " + std::to_string(_lost) + " messages");
-            _lost = 0;
-        }
+        _queue.drain();
+    }
+    std::size_t waiting() const override
+    {
+        return _queue.waiting();
+    }
+    std::uint64_t lost() const override
+    {
+        return _queue.lost();
     }
 
 private:
     SimulatorSource& _source;
-    MessageSink& _sink;
-    std::deque<Bytes> _waiting;
-    std::size_t _lost = 0;
+    ChannelQueue _queue;
 };
 
 SimulatorSource::SimulatorSource(RunLoop& runLoop, const Clock& clock, std::unique_ptr<Baseband> baseband, double rate)

@@ -6,6 +6,7 @@
 #include "Telephony/Simulator/Baseband.h"
 
 #include <memory>
+#include <string>
 #include <vector>
 
 namespace spectrel {
@@ -23,6 +24,10 @@ public:
         return _baseband->technology();
     }
     std::unique_ptr<LogStream> start(MessageSink& sink) override;
+    std::string status() const override
+    {
+        return "a simulated " + std::string(technologyName(technology())) + " baseband";
+    }
 
 private:
     class Stream;

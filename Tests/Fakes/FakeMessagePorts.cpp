@@ -18,6 +18,10 @@ struct FakeMessagePorts::Local final : LocalMessagePort {
     {
         isServed = true;
     }
+    void setPaused(bool paused) override
+    {
+        isPaused = paused;
+    }
     void setInvalidationHandler(InvalidationHandler newHandler) override
     {
         invalidation = std::move(newHandler);
@@ -38,6 +42,7 @@ struct FakeMessagePorts::Local final : LocalMessagePort {
     MessageHandler handler;
     InvalidationHandler invalidation;
     bool isServed = false;
+    bool isPaused = false;
     bool valid = true;
 };
 
@@ -115,7 +120,7 @@ std::shared_ptr<RemoteMessagePort> FakeMessagePorts::createRemote(std::string_vi
 bool FakeMessagePorts::deliver(const std::string& name, std::int32_t id, ByteView body)
 {
     const auto port = _locals[name].lock();
-    if (!port || !port->isServed || !port->isValid())
+    if (!port || !port->isServed || port->isPaused || !port->isValid())
         return false;
     port->handler(id, body);
     return true;

@@ -31,7 +31,8 @@ public:
     LocalResult createLocal(std::string_view name, LocalMessagePort::MessageHandler handler) override;
     std::shared_ptr<RemoteMessagePort> createRemote(std::string_view name) override;
 
-    /// Delivers a message to the local port of that name, as its peer would; false when there is none.
+    /// Delivers a message to the local port of that name, as its peer would; false when there is none, or when
+    /// it is paused.
     bool deliver(const std::string& name, std::int32_t id, ByteView body);
     /// The same, with the answer that the port's handler gives.
     std::optional<Bytes> request(const std::string& name, std::int32_t id, ByteView body);

@@ -428,6 +428,27 @@ TEST_F(SpectrelModelTest, ManyMessagesInATickYieldOneRebuild)
     EXPECT_EQ(historyCount(), 1u);
 }
 
+TEST_F(SpectrelModelTest, FloodWaitsForTheNextTick)
+{
+    model.startMonitor();
+    const Bytes large = RecordBuilder(0xB0C1, 65536).bytes();
+    for (std::size_t count = 1; count < SpectrelModel::LargestIntake / large.size(); ++count)
+        receive(large);
+    receive(large); // the last one that is taken
+    EXPECT_FALSE(ports.deliver(PortName, 0, large));
+    loop.advance(SpectrelModel::RefreshInterval);
+    receive(large);
+}
+
+TEST_F(SpectrelModelTest, FloodOfMessagesThatTheObserverKeepsIsNotSlowed)
+{
+    model.startMonitor();
+    observer.applies = false;
+    const Bytes large = RecordBuilder(0xB0C1, 65536).bytes();
+    for (std::size_t bytes = 0; bytes < 3 * SpectrelModel::LargestIntake; bytes += large.size())
+        receive(large);
+}
+
 TEST_F(SpectrelModelTest, MessageThatTheObserverKeepsIsNotApplied)
 {
     model.startMonitor();

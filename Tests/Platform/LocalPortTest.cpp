@@ -45,6 +45,26 @@ TEST_F(LocalPortTest, LargestMessageArrivesWhole)
     EXPECT_EQ(received[0], "1:" + large);
 }
 
+TEST_F(LocalPortTest, PausedPortLeavesMessagesToWaitAndLosesNone)
+{
+    std::shared_ptr<LocalMessagePort> local;
+    local = serve([&](std::int32_t, ByteView body) {
+        received.push_back(text(body));
+        local->setPaused(received.size() == 2);
+        return std::nullopt;
+    });
+    const auto remote = ports.createRemote(Name);
+    for (const char* body : {"1", "2", "3", "4"})
+        EXPECT_EQ(send(*remote, 0, body), SendStatus::Success);
+    ASSERT_TRUE(turnUntilReceived(2));
+    const auto late = ports.createRemote(Name);
+    send(*late, 0, "late");
+    EXPECT_FALSE(loop.runUntil([this] { return received.size() > 2; }, std::chrono::milliseconds(100)));
+    local->setPaused(false);
+    ASSERT_TRUE(turnUntilReceived(5));
+    EXPECT_THAT(received, ElementsAre("1", "2", "3", "4", "late"));
+}
+
 TEST_F(LocalPortTest, SameNameInOneProcessHandsBackTheExistingPort)
 {
     const auto first = ports.createLocal(Name, keeping());

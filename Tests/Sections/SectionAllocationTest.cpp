@@ -2,12 +2,15 @@
 
 #include "Platform/Dictionary.h"
 #include "Sections/GSMUMTS/ZPH_GSMClassIndex.h"
+#include "Sections/LTE/LTEClassIndex.h"
+#include "Sections/UTRAN/UTRANClassIndex.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/RecordBuilder.h"
 
 #include <cstdlib>
 #include <gtest/gtest.h>
 #include <new>
+#include <stdexcept>
 
 namespace {
 std::size_t allocations = 0;
@@ -52,7 +55,12 @@ protected:
 
     Base& section() const
     {
-        return *_index.getClass(GetParam().section);
+        for (const ClassIndex* index : {static_cast<const ClassIndex*>(&_gsm), static_cast<const ClassIndex*>(&_lte),
+                 static_cast<const ClassIndex*>(&_utran)}) {
+            if (index->getSubscribers(GetParam().code)) // the technologies share no binary record
+                return *index->getClass(GetParam().section);
+        }
+        throw std::invalid_argument("nobody decodes the code");
     }
     /// The section's record with this value in every byte of the payload.
     static RecordBuilder record(std::uint32_t value)
@@ -62,6 +70,8 @@ protected:
             built.u8(offset, value);
         if (GetParam().code == 0x4221)
             built.u8(16, 0).u8(17, 0); // no lists
+        if (GetParam().code == 0xD0E0)
+            built.u8(13, 1); // the mode is valid
         return built;
     }
     /// How many allocations one update takes.
@@ -76,7 +86,9 @@ protected:
     Value node {Dictionary::make()};
 
 private:
-    ZPH_GSMClassIndex _index;
+    ZPH_GSMClassIndex _gsm;
+    LTEClassIndex _lte;
+    UTRANClassIndex _utran;
 };
 
 TEST_P(SectionAllocationTest, RepeatedRecordAllocatesNothing)
@@ -124,6 +136,14 @@ constexpr ScalarRecord ScalarRecords[] = {
     {"UMTS RR Info", 0x4127, 29},
     {"UMTS RR Info", 0x4157, 19},
     {"HSDPA Info", 0x4221, 18},
+    {"Serving Cell Info", 0xB0C1, 22},
+    {"Serving Cell Info", 0xB0C2, 38},
+    {"Connected mode LTE Intra-frequency Measurement", 0xB179, 29},
+    {"Serving Cell Measurements", 0xB17F, 33},
+    {"Neighbor Measurements", 0xB180, 21},
+    {"Reselection Candidates", 0xB186, 21},
+    {"RRC Info", 0xD0E0, 15},
+    {"Serving Cell Info", 0xD0E2, 26},
 };
 
 INSTANTIATE_TEST_SUITE_P(ScalarSections, SectionAllocationTest, testing::ValuesIn(ScalarRecords));

@@ -2,6 +2,7 @@
 
 #include "LogGenerator/Template/Base.h"
 #include "Platform/Dictionary.h"
+#include "Platform/List.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/LogRecorder.h"
 #include "Tests/Fakes/RecordBuilder.h"
@@ -57,6 +58,15 @@ protected:
     std::string shown(std::string_view key) const
     {
         return displayText((*_node.dictionary())[key]);
+    }
+    /// One entry of a list section, and how many there are.
+    std::string shownEntry(std::size_t position) const
+    {
+        return displayText(position < shownCount() ? (*_node.list())[position] : Value());
+    }
+    std::size_t shownCount() const
+    {
+        return _node.list()->count();
     }
     /// What the key shows for each value, 0 to 255, of the record's byte at the offset.
     std::vector<std::string> shownForEachByte(

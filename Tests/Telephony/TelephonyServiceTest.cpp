@@ -5,17 +5,13 @@
 #include "Platform/PropertyList.h"
 #include "Platform/TelephonyConstants.h"
 #include "Platform/TelephonyProtocol.h"
-#include "Telephony/ReplaySource.h"
 #include "Telephony/Simulator/SimulatorSource.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/FakeMessagePorts.h"
 #include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Fakes/RecordBuilder.h"
-#include "Tests/Fakes/ScratchFolder.h"
+#include "Tests/Telephony/Collector.h"
 
-#include <algorithm>
-#include <cstdlib>
-#include <filesystem>
 #include <gtest/gtest.h>
 
 namespace spectrel {
@@ -59,8 +55,13 @@ public:
     {
         return std::make_unique<Stream>(*this, sink);
     }
+    void setTechnologyHandler(std::function<void()> handler) override
+    {
+        technologyHandler = std::move(handler);
+    }
     std::vector<Bytes> messages;
     int streams = 0;
+    std::function<void()> technologyHandler;
 };
 
 class TelephonyServiceTest : public testing::Test {
@@ -209,30 +210,22 @@ TEST_F(TelephonyServiceTest, FullClientStopsTheStreamUntilThereIsRoom)
     EXPECT_EQ(ports.sent.size(), 4u);
 }
 
+TEST_F(TelephonyServiceTest, ChangeOfTechnologyEndsAllChannelsAndTheServiceStays)
+{
+    start(openChannel(), nullptr, nullptr);
+    openChannel("other");
+    source.technologyHandler();
+    EXPECT_EQ(service.channels(), 0u);
+    EXPECT_EQ(source.streams, 0);
+    EXPECT_EQ(ports.localPorts(), 1u) << "the service's own";
+    EXPECT_EQ(openChannel(), "org.spectrel.Telephony.LogChannel.3");
+}
+
 TEST_F(TelephonyServiceTest, SecondServiceIsRefused)
 {
     TelephonyService second(loop, ports, source);
     EXPECT_FALSE(second.start());
 }
-
-/// Collects what a stream delivers.
-class Collector final : public MessageSink {
-public:
-    bool deliver(ByteView message) override
-    {
-        if (isFull)
-            return false;
-        messages.emplace_back(message.begin(), message.end());
-        return true;
-    }
-    std::size_t count(std::uint8_t type, std::uint8_t lowCode) const
-    {
-        return static_cast<std::size_t>(std::count_if(messages.begin(), messages.end(),
-            [&](const Bytes& message) { return message[0] == type && message[3] == lowCode; }));
-    }
-    std::vector<Bytes> messages;
-    bool isFull = false;
-};
 
 class SimulatorSourceTest : public testing::Test {
 protected:
@@ -253,10 +246,10 @@ TEST_F(SimulatorSourceTest, RecordsComeSteadily)
 {
     const auto stream = source.start(collector);
     collector.messages.clear();
-    loop.advance(20s);
-    EXPECT_EQ(collector.count(0x01, 0xC2), 50u);
-    EXPECT_EQ(collector.count(0x01, 0xC1), 25u);
-    EXPECT_EQ(collector.count(0xFF, 1), 10u);
+    loop.advance(60s);
+    EXPECT_EQ(collector.count(0x01, 0xC2), 150u);
+    EXPECT_EQ(collector.count(0x01, 0xC1), 75u);
+    EXPECT_EQ(collector.count(0xFF, 1), 12u);
     EXPECT_EQ(collector.count(0xFF, 0), 2u);
 }
 
@@ -289,115 +282,6 @@ TEST_F(SimulatorSourceTest, BusyClientLosesNothingOnceItTakesAgain)
     other.isFull = false;
     second->resume();
     EXPECT_EQ(collector.messages, other.messages);
-}
-
-class ReplaySourceTest : public testing::Test {
-protected:
-    std::string recordingOf(int count, Technology technology = Technology::LTE)
-    {
-        std::string path = folder + "/" + std::to_string(++_files) + ".pcap";
-        const auto writer = createRecording(path, technology, reason);
-        for (int number = 0; number < count; ++number)
-            writer->write(Moment(std::chrono::seconds(1000 + number)),
-                RecordBuilder(0xB0C2, 13).u8(12, static_cast<std::uint32_t>(number)));
-        writer->flush();
-        return path;
-    }
-    std::unique_ptr<ReplaySource> open(ReplayOptions options)
-    {
-        return ReplaySource::open(loop, loop, std::move(options), reason);
-    }
-
-    FakeRunLoop loop;
-    Collector collector;
-    const ScratchFolder scratch;
-    const std::string folder = scratch.path().string();
-    std::string reason;
-
-private:
-    int _files = 0;
-};
-
-TEST_F(ReplaySourceTest, MessagesKeepTheirDistances)
-{
-    const auto source = open({{recordingOf(5)}, 1, false, {}});
-    EXPECT_EQ(source->technology(), Technology::LTE);
-    const auto stream = source->start(collector);
-    loop.runQueued();
-    EXPECT_EQ(collector.messages.size(), 1u);
-    loop.advance(2s);
-    EXPECT_EQ(collector.messages.size(), 3u);
-    loop.advance(60s);
-    EXPECT_EQ(collector.messages.size(), 5u);
-}
-
-TEST_F(ReplaySourceTest, SpeedShortensThem)
-{
-    const auto source = open({{recordingOf(5)}, 10, false, {}});
-    const auto stream = source->start(collector);
-    loop.advance(400ms);
-    EXPECT_EQ(collector.messages.size(), 5u);
-}
-
-TEST_F(ReplaySourceTest, SpeedZeroIsAsFastAsTheClientTakesThem)
-{
-    const auto source = open({{recordingOf(500), recordingOf(3)}, 0, false, {}});
-    const auto stream = source->start(collector);
-    loop.runQueued();
-    EXPECT_EQ(collector.messages.size(), 503u);
-}
-
-TEST_F(ReplaySourceTest, EachChannelHearsItFromTheStart)
-{
-    const auto source = open({{recordingOf(3)}, 0, false, {}});
-    const auto first = source->start(collector);
-    loop.runQueued();
-    Collector late;
-    const auto second = source->start(late);
-    loop.runQueued();
-    EXPECT_EQ(collector.messages, late.messages);
-}
-
-TEST_F(ReplaySourceTest, LoopBeginsAnew)
-{
-    const auto source = open({{recordingOf(2)}, 1, true, {}});
-    const auto stream = source->start(collector);
-    loop.advance(10s);
-    EXPECT_GT(collector.messages.size(), 10u);
-}
-
-TEST_F(ReplaySourceTest, LoopOverNothingEnds)
-{
-    const auto source = open({{recordingOf(0)}, 0, true, {}});
-    const auto stream = source->start(collector);
-    loop.advance(10s);
-    EXPECT_TRUE(collector.messages.empty());
-}
-
-TEST_F(ReplaySourceTest, SlowClientLosesNothing)
-{
-    const auto source = open({{recordingOf(5)}, 0, false, {}});
-    collector.isFull = true;
-    const auto stream = source->start(collector);
-    loop.advance(10s);
-    collector.isFull = false;
-    stream->resume();
-    loop.runQueued();
-    ASSERT_EQ(collector.messages.size(), 5u);
-    for (std::size_t number = 0; number < 5; ++number)
-        EXPECT_EQ(collector.messages[number][12], number);
-}
-
-TEST_F(ReplaySourceTest, FilesOfTwoTechnologiesAreRefused)
-{
-    EXPECT_EQ(open({{recordingOf(1), recordingOf(1, Technology::GSM)}, 1, false, {}}), nullptr);
-    EXPECT_NE(reason.find("2.pcap: is of technology gsm"), std::string::npos) << reason;
-}
-
-TEST_F(ReplaySourceTest, MissingFileIsNamed)
-{
-    EXPECT_EQ(open({{folder + "/nowhere.pcap"}, 1, false, {}}), nullptr);
-    EXPECT_NE(reason.find("nowhere.pcap: "), std::string::npos) << reason;
 }
 
 } // namespace

@@ -1,0 +1,46 @@
+#pragma once
+
+#include "Platform/Bytes.h"
+#include "Telephony/LogSource.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <deque>
+
+namespace spectrel {
+
+/// Live messages on their way to one client: what it has no room for waits here. The queue is bounded; beyond it the
+/// oldest go, and the loss is told once the client takes messages again.
+class ChannelQueue {
+public:
+    static constexpr std::size_t MostMessages = 4096;
+    static constexpr std::size_t MostBytes = 8 * 1024 * 1024;
+
+    explicit ChannelQueue(MessageSink& sink)
+        : _sink(sink)
+    {
+    }
+    void send(ByteView message);
+    /// The client has room again.
+    void drain();
+
+    std::size_t waiting() const
+    {
+        return _waiting.size();
+    }
+    std::uint64_t lost() const
+    {
+        return _lost;
+    }
+
+private:
+    void dropOldest();
+
+    MessageSink& _sink;
+    std::deque<Bytes> _waiting;
+    std::size_t _bytes = 0; // of those waiting
+    std::uint64_t _lost = 0;
+    std::uint64_t _toldLost = 0;
+};
+
+} // namespace spectrel

@@ -1,0 +1,89 @@
+"""The simulated basebands: written without waiting, and streamed."""
+
+import json
+import os
+import unittest
+
+from harness import Place
+
+TECHNOLOGIES = ("lte", "gsm", "utran", "cdma", "ifx")
+
+
+def leaves(display):
+    if isinstance(display, dict):
+        return [leaf for value in display.values() for leaf in leaves(value)]
+    if isinstance(display, list):
+        return [leaf for value in display for leaf in leaves(value)]
+    return [display]
+
+
+class Simulate(Place):
+    def service(self, *arguments):
+        return self.run_spectrel(*arguments, program="spectrel-telephonyd")
+
+    def written(self, name, *arguments):
+        done = self.service(*arguments, "--write", self.path(name))
+        self.assertEqual((done.returncode, done.stdout, done.stderr), (0, "", ""))
+        with open(self.path(name), "rb") as file:
+            return file.read()
+
+    def test_same_options_write_the_same_bytes(self):
+        for technology in TECHNOLOGIES:
+            with self.subTest(technology=technology):
+                options = ("--simulate", technology, "--seed", "3", "--duration", "2m")
+                self.assertEqual(self.written("a.pcap", *options), self.written("b.pcap", *options))
+
+    def test_every_scene_decodes_cleanly(self):
+        for technology in TECHNOLOGIES:
+            for scene in ("still", "walk", "drive", "stress"):
+                with self.subTest(technology=technology, scene=scene):
+                    self.written("a.pcap", "--simulate", technology, "--scene", scene, "--duration", "30s")
+                    done = self.run_spectrel("decode", "--format", "none", self.path("a.pcap"))
+                    self.assertEqual(done.returncode, 0, done.stderr)
+
+    def test_two_hours_drive_decodes_to_values(self):
+        for technology in TECHNOLOGIES:
+            with self.subTest(technology=technology):
+                self.written("a.pcap", "--simulate", technology, "--duration", "2h")
+                done = self.run_spectrel("decode", "--format", "json", self.path("a.pcap"))
+                self.assertEqual(done.returncode, 0, done.stderr)
+                values = leaves(json.loads(done.stdout))
+                self.assertGreater(sum(value != "-" for value in values), len(values) / 2)
+
+    def test_live_values_arrive_and_change(self):
+        for technology in TECHNOLOGIES:
+            with self.subTest(technology=technology):
+                service = self.start_service("--simulate", technology, "--rate", "5")
+                done = self.run_spectrel("watch", "--format", "json", "--count", "3")
+                self.assertEqual(done.returncode, 0, done.stderr)
+                displays = [json.loads(line) for line in done.stdout.splitlines()]
+                self.assertEqual(len(displays), 3)
+                self.assertNotEqual(displays[0], displays[2])
+                service.terminate()
+                service.wait()
+
+    def test_file_that_cannot_be_written_is_named(self):
+        path = self.path("no", "such", "folder")
+        done = self.service("--simulate", "lte", "--write", path)
+        self.assertEqual((done.returncode, done.stderr),
+                         (1, f"spectrel-telephonyd: {path}: No such file or directory\n"))
+
+    def test_full_disk_is_told(self):
+        if os.path.exists("/dev/full"):
+            done = self.service("--simulate", "lte", "--write", "/dev/full", "--duration", "10m")
+            self.assertEqual((done.returncode, done.stderr),
+                             (1, "spectrel-telephonyd: /dev/full: No space left on device\n"))
+
+    def test_wrong_use_is_told(self):
+        for arguments in (["--simulate", "lte", "--scene", "fly"], ["--write", "a.pcap"],
+                          ["--simulate", "lte", "--duration", "5m"],
+                          ["--simulate", "lte", "--write", "a", "--duration", "soon"],
+                          ["--simulate", "lte", "--write", "a", "--rate", "2"]):
+            with self.subTest(arguments=arguments):
+                done = self.service(*arguments)
+                self.assertEqual(done.returncode, 2)
+                self.assertIn("see spectrel-telephonyd --help", done.stderr)
+
+
+if __name__ == "__main__":
+    unittest.main()
