@@ -34,7 +34,7 @@ public:
     void locate(const std::string& modem, LocationHandler handler) override;
     void setSignalRate(const std::string& modem, std::uint32_t seconds, OutcomeHandler handler) override;
 
-private slots:
+private Q_SLOTS:
     void interfacesAdded(const QDBusMessage& message);
     void interfacesRemoved(const QDBusMessage& message);
     void propertiesChanged(const QDBusMessage& message);
