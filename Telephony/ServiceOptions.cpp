@@ -13,7 +13,8 @@ namespace {
 constexpr int ExitWrongUsage = 2;
 
 constexpr const char* Description =
-    "The telephony service: opens log channels and streams log messages from a simulated baseband or a recording.\n"
+    "The telephony service: opens log channels and streams log messages from a simulated baseband, recordings or a\n"
+    "live stream.\n"
     "Ports are met in $SPECTREL_PORT_DIR (default: $XDG_RUNTIME_DIR/spectrel).";
 
 const CLI::Validator IsScene(

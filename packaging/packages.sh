@@ -8,7 +8,7 @@ test_packages=(
     "${build_packages[@]}"
     libgtest-dev libgmock-dev libbenchmark-dev
     clang clang-format libclang-rt-14-dev
-    python3 tmux git procps dbus-daemon
+    python3 tmux git procps dbus-daemon systemd tcpdump
 )
 
 # install_missing PACKAGE...: asks the package manager only when something is missing.
