@@ -138,7 +138,7 @@ int serve(ServiceOptions& options)
     if (options.statusInterval)
         regularReport.emplace(runLoop, report, *options.statusInterval);
     ManagerStatus managerStatus(runLoop, manager, service, report);
-    tell("serving " + source->status() + " in " + Places::portDirectory());
+    tell("serving in " + Places::portDirectory() + ": " + source->status());
     if (!tellReady(options.readyDescriptor))
         return fail("--ready-fd: the descriptor cannot be written");
     managerStatus.tellManager("READY=1\n");
