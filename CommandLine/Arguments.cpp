@@ -18,6 +18,7 @@ constexpr const char* Environment =
     "  SPECTREL_PORT_DIR       where the telephony service is met (default: $XDG_RUNTIME_DIR/spectrel)\n"
     "  SPECTREL_CRASH_LOG_DIR  where snapshots go (default: $XDG_STATE_HOME/spectrel/CrashReporter)\n"
     "  SPECTREL_DEVICE_ROOT    prefix of the device's absolute paths (default: /)\n"
+    "  SPECTREL_DIAGNOSTIC_LOG file for what the decoders tell their developers (default: none)\n"
     "  NO_COLOR                no colours in the terminal screens\n"
     "Exit status: 0 done, 1 something could not be done, 2 wrong usage.";
 
@@ -56,6 +57,25 @@ void addCommon(CLI::App& command, Arguments& arguments)
         ->type_name("FILE");
 }
 
+void addScreens(CLI::App& command, Arguments& arguments)
+{
+    auto* graphical = command.add_flag_callback(
+        "--gui", [&arguments] { arguments.screens = ScreenChoice::Graphical; }, "Open the graphical screens");
+    command
+        .add_flag_callback(
+            "--terminal", [&arguments] { arguments.screens = ScreenChoice::Terminal; }, "Open the terminal screens")
+        ->excludes(graphical);
+}
+
+template <typename Set> void addTechnology(CLI::App* command, Set set)
+{
+    command
+        ->add_option_function<std::string>(
+            "--technology", [set](const std::string& name) { set(technologyNamed(name)); },
+            "The technology, where the file does not tell")
+        ->check(IsTechnology);
+}
+
 void addWatch(CLI::App& program, Arguments& arguments)
 {
     CLI::App* command = program.add_subcommand("watch", "Print the live session, once at each refresh");
@@ -75,14 +95,22 @@ void addDecode(CLI::App& program, Arguments& arguments)
     command->add_option("FILE", decode.files, "The recordings, decoded one after the other")->required();
     addFormat(command, [&decode](OutputFormat format) { decode.format = format; });
     command->add_flag("--each", decode.each, "With --format json: one line for each message");
-    command
-        ->add_option_function<std::string>(
-            "--technology", [&decode](const std::string& name) { decode.technology = technologyNamed(name); },
-            "The technology, where the file does not tell")
-        ->check(IsTechnology);
+    addTechnology(command, [&decode](std::optional<Technology> technology) { decode.technology = technology; });
     command->add_option("--snapshot", decode.snapshotDirectory, "Write a snapshot file into this folder at the end")
         ->type_name("DIR");
     command->add_flag("--keep-going", decode.keepGoing, "Go on after a message that would end the program");
+}
+
+void addView(CLI::App& program, Arguments& arguments)
+{
+    ViewOptions& view = arguments.view;
+    CLI::App* command = program.add_subcommand(
+        "view", "Browse a recording or a snapshot in the screens; a recording plays, pauses, steps and seeks");
+    command->callback([&arguments] { arguments.job = Job::View; });
+    addCommon(*command, arguments);
+    addScreens(*command, arguments);
+    command->add_option("FILE", view.file, "A capture, a snapshot or a DLF file")->required();
+    addTechnology(command, [&view](std::optional<Technology> technology) { view.technology = technology; });
 }
 
 void addRecord(CLI::App& program, Arguments& arguments)
@@ -120,14 +148,10 @@ std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
     program.set_version_flag("--version", "spectrel " SPECTREL_VERSION);
     program.require_subcommand(0, 1);
     addCommon(program, arguments);
-    auto* graphical = program.add_flag_callback(
-        "--gui", [&arguments] { arguments.screens = ScreenChoice::Graphical; }, "Open the graphical screens");
-    program
-        .add_flag_callback(
-            "--terminal", [&arguments] { arguments.screens = ScreenChoice::Terminal; }, "Open the terminal screens")
-        ->excludes(graphical);
+    addScreens(program, arguments);
     addWatch(program, arguments);
     addDecode(program, arguments);
+    addView(program, arguments);
     addRecord(program, arguments);
     try {
         program.parse(argc, argv);

@@ -1,7 +1,9 @@
 #pragma once
 
 #include "CommandLine/Decode.h"
+#include "CommandLine/ExitStatus.h"
 #include "CommandLine/Record.h"
+#include "CommandLine/View.h"
 #include "CommandLine/Watch.h"
 
 #include <chrono>
@@ -12,7 +14,7 @@
 
 namespace spectrel {
 
-enum class Job : std::uint8_t { Application, Watch, Decode, Record };
+enum class Job : std::uint8_t { Application, Watch, Decode, View, Record };
 
 /// Which screens the application was told to open; by default it finds out by itself.
 enum class ScreenChoice : std::uint8_t { Automatic, Graphical, Terminal };
@@ -24,16 +26,10 @@ struct Arguments {
     std::optional<std::string> resources; // the templates' folder
     std::optional<std::string> logFile;
     DecodeOptions decode;
+    ViewOptions view;
     WatchOptions watch;
     RecordOptions record;
 };
-
-/// Exit statuses of every program.
-namespace ExitStatus {
-inline constexpr int Done = 0;
-inline constexpr int Failed = 1;
-inline constexpr int WrongUsage = 2;
-} // namespace ExitStatus
 
 /// Reads the command line. An exit status when the program is done with that: after --help, --version or wrong usage,
 /// each told on the stream where it belongs.

@@ -1,9 +1,9 @@
 #include "CommandLine/DisplayPrinter.h"
 
 #include "Monitor/DisplayOrder.h"
+#include "Monitor/TreeText.h"
 #include "Platform/List.h"
 
-#include <cstdio>
 #include <rapidjson/writer.h>
 #include <utility>
 
@@ -36,20 +36,6 @@ void separate(bool& isFirst, std::string& out)
         out += ',';
 }
 
-void appendPlain(std::string_view text, std::string& out)
-{
-    for (const char character : text) {
-        const auto byte = static_cast<unsigned char>(character);
-        if (byte >= 0x20 && byte != 0x7F) {
-            out += character;
-            continue;
-        }
-        char escaped[8];
-        std::snprintf(escaped, sizeof escaped, "\\x%02x", byte);
-        out += escaped;
-    }
-}
-
 void appendNode(std::string_view name, const Value& value, std::size_t depth, std::string& out);
 
 void appendChildren(const Value& value, std::size_t depth, std::string& out)
@@ -66,15 +52,12 @@ void appendChildren(const Value& value, std::size_t depth, std::string& out)
 
 void appendNode(std::string_view name, const Value& value, std::size_t depth, std::string& out)
 {
-    out.append(2 * depth, ' ');
-    appendPlain(name, out);
     if (value.dictionary() || value.list()) {
-        out += '\n';
+        appendTreeLine(name, nullptr, depth, out);
         return appendChildren(value, depth + 1, out);
     }
-    out += ": ";
-    appendPlain(value.string() ? std::string_view(*value.string()) : std::string_view(UnknownText), out);
-    out += '\n';
+    const std::string_view text = value.string() ? std::string_view(*value.string()) : std::string_view(UnknownText);
+    appendTreeLine(name, &text, depth, out);
 }
 
 } // namespace

@@ -7,8 +7,11 @@
 #include "Platform/Environment.h"
 #include "Platform/SystemLog.h"
 
+#include <chrono>
 #include <cstdlib>
 #include <exception>
+#include <filesystem>
+#include <system_error>
 #include <utility>
 
 namespace spectrel {
@@ -30,6 +33,18 @@ std::string currentExceptionName()
         return "an exception of unknown kind";
     }
     return "no exception: the program was told to terminate";
+}
+
+/// No snapshot that the user has just saved is overwritten: the seconds in the name go on until one is free.
+std::string freeSnapshotPath(Moment now)
+{
+    std::string path;
+    std::error_code error;
+    do {
+        path = snapshotPath(Places::crashLogDirectory(), now);
+        now += std::chrono::seconds(1);
+    } while (std::filesystem::exists(path, error));
+    return path;
 }
 
 void tellEverywhere(const std::string& line)
@@ -83,7 +98,7 @@ void Ending::saveWhatIsLeft()
     if (!contents)
         return;
     const Moment now = Clock::installed().now();
-    const std::string path = snapshotPath(Places::crashLogDirectory(), now);
+    const std::string path = freeSnapshotPath(now);
     std::string reason;
     if (writeSnapshot(makeSnapshot(now, contents, "Spectrel " + reasonOfEnding), path, reason))
         tellEverywhere("what was received is kept in " + path);

@@ -305,10 +305,7 @@ NodeRef SpectrelModel::nodeAtPath(std::string_view path)
 {
     if (!_nodesByPath)
         topLevelNodes();
-    if (!_nodesByPath)
-        return nullptr;
-    const auto found = _nodesByPath->find(std::string(path));
-    return found == _nodesByPath->end() ? nullptr : found->second;
+    return _nodesByPath ? nodeInIndex(*_nodesByPath, path) : nullptr;
 }
 
 ListRef SpectrelModel::getSaveContents()

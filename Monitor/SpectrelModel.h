@@ -26,6 +26,8 @@ public:
     virtual void updateViewControllerFromModel() = 0;
     /// The session was opened or lost, or the reason why there is none has changed.
     virtual void sessionDidChange() { }
+    /// The place on the time line, or how it moves, has changed.
+    virtual void playbackDidChange() { }
     /// One inbound message body. False keeps it from being applied: a recorder wants the bytes alone.
     virtual bool modelShouldApply(ByteView)
     {

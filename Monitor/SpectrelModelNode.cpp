@@ -65,6 +65,12 @@ private:
 
 } // namespace
 
+NodeRef nodeInIndex(const PathIndex& index, std::string_view path)
+{
+    const auto found = index.find(std::string(path));
+    return found == index.end() ? nullptr : found->second;
+}
+
 std::string pathByAppending(std::string_view path, std::string_view component)
 {
     component.remove_prefix(std::min(component.find_first_not_of('/'), component.size()));

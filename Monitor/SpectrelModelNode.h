@@ -17,6 +17,9 @@ using NodeList = std::vector<NodeRef>;
 /// Path → node. "/" is the root; a child's path is its parent's path joined with its displayed name.
 using PathIndex = std::unordered_map<std::string, NodeRef>;
 
+/// The node at the path exactly as given; null when there is none.
+NodeRef nodeInIndex(const PathIndex& index, std::string_view path);
+
 /// A path with one more component, joined by exactly one "/".
 std::string pathByAppending(std::string_view path, std::string_view component);
 

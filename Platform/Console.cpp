@@ -29,4 +29,10 @@ void StandardErrorConsole::line(std::string_view text)
     std::fprintf(stderr, "%.*s\n", static_cast<int>(text.size()), text.data());
 }
 
+void StandardOutputConsole::line(std::string_view text)
+{
+    std::fprintf(stdout, "%.*s\n", static_cast<int>(text.size()), text.data());
+    std::fflush(stdout);
+}
+
 } // namespace spectrel

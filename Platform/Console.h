@@ -27,4 +27,10 @@ public:
     void line(std::string_view text) override;
 };
 
+/// Writes to standard output, each line at once, for the graphical application.
+class StandardOutputConsole : public Console {
+public:
+    void line(std::string_view text) override;
+};
+
 } // namespace spectrel

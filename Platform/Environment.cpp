@@ -57,6 +57,11 @@ std::string Places::crashLogDirectory()
     return baseDirectory("XDG_STATE_HOME", ".local/state") + "/spectrel/CrashReporter";
 }
 
+std::string Places::diagnosticLog()
+{
+    return variable("SPECTREL_DIAGNOSTIC_LOG");
+}
+
 std::string Places::preferencesDirectory()
 {
     return baseDirectory("XDG_CONFIG_HOME", ".config") + "/spectrel";

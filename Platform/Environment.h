@@ -9,6 +9,7 @@ struct Places {
     static std::string portDirectory(); // $SPECTREL_PORT_DIR, $XDG_RUNTIME_DIR/spectrel, a private temporary folder
     static std::string devicePath(const std::string& absolutePath); // below $SPECTREL_DEVICE_ROOT
     static std::string crashLogDirectory(); // $SPECTREL_CRASH_LOG_DIR, $XDG_STATE_HOME/spectrel/CrashReporter
+    static std::string diagnosticLog(); // the file $SPECTREL_DIAGNOSTIC_LOG; empty: none
     static std::string preferencesDirectory(); // $XDG_CONFIG_HOME/spectrel
     static std::string resourcesDirectory(); // Resources/ beside the program, the installed data directory otherwise
 };

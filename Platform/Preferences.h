@@ -15,4 +15,15 @@ public:
     virtual void postChanged(std::string_view domain, std::string_view key) = 0;
 };
 
+/// Preferences that nothing is written to, for screens that only show a file.
+class NoPreferences final : public Preferences {
+public:
+    void setBoolean(std::string_view, std::string_view, bool) override { }
+    bool synchronize(std::string_view) override
+    {
+        return true;
+    }
+    void postChanged(std::string_view, std::string_view) override { }
+};
+
 } // namespace spectrel

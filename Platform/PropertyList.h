@@ -29,7 +29,7 @@ std::optional<Value> parsePropertyList(ByteView bytes);
 std::optional<std::string> serialisePropertyList(const Value& value);
 
 /// Writes the XML form straight to the path, mode 0600 also where the file exists. On failure false, with `reason`
-/// telling why.
+/// telling why; a file without room for the list stays as it was, one that was not there is not left behind.
 bool writePropertyListToFile(const Value& value, const std::string& path, std::string& reason);
 
 /// Reads a whole file as a property list; none when it cannot be read or does not parse.

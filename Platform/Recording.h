@@ -2,6 +2,7 @@
 
 #include "Platform/Bytes.h"
 #include "Platform/Clock.h"
+#include "Platform/Value.h"
 
 #include <cstdint>
 #include <memory>
@@ -37,6 +38,11 @@ public:
     virtual bool next(RecordedMessage& message) = 0;
     /// What ended the reading early, with the place in the file ("message 12 at byte 3481: ..."); empty at a clean end.
     virtual const std::string& damage() const = 0;
+    /// The whole snapshot that the messages come from; null in any other kind of file.
+    virtual DictionaryRef snapshot() const
+    {
+        return nullptr;
+    }
 };
 
 /// Opens a recording; its content tells its kind. Null when it cannot be read or is of no known kind, with `reason`

@@ -63,6 +63,9 @@ enum class ScreenPart {
     Toolbar, // of a pane
     Modal, // a modal screen was presented or dismissed
     Text, // of a text field, or which one has the input focus
+    Find, // the search was opened or closed, or its text, list or selection has changed
+    Playback, // the place on a recording's time line, or how it moves
+    Notice, // a short message for people came or went
 };
 
 /// The toolkit that draws the controllers: measures texts, shows alerts, and is told what to draw again.
@@ -79,6 +82,8 @@ public:
     virtual Size mainScreenSize() const = 0;
     virtual void screenDidChange(ScreenPart part, Animation animation) = 0;
     virtual void showAlert(const Alert& alert) = 0;
+    /// Puts the text on the clipboard. False, with `reason` for people, when it cannot.
+    virtual bool copyToClipboard(const std::string& text, std::string& reason) = 0;
 };
 
 } // namespace spectrel

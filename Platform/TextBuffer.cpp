@@ -17,12 +17,23 @@ TextBuffer& TextBuffer::decimal(std::int64_t number)
 
 TextBuffer& TextBuffer::fixed2(double number)
 {
-    if (std::isnan(number))
-        return text(" nan");
-    char digits[340]; // 309 digits of the largest double, the point and two decimals
-    const auto result = std::to_chars(digits, digits + sizeof digits, number, std::chars_format::fixed, 2);
-    const auto length = static_cast<std::size_t>(result.ptr - digits);
-    if (length < 4) // only "inf"
+    return fixed(number, 4, 2);
+}
+
+TextBuffer& TextBuffer::fixed6(double number)
+{
+    return fixed(number, 0, 6);
+}
+
+TextBuffer& TextBuffer::fixed(double number, std::size_t leastLength, int decimals)
+{
+    char digits[340] = "nan"; // 309 digits of the largest double, the point and six decimals
+    std::size_t length = 3;
+    if (!std::isnan(number)) {
+        const auto result = std::to_chars(digits, digits + sizeof digits, number, std::chars_format::fixed, decimals);
+        length = static_cast<std::size_t>(result.ptr - digits);
+    }
+    if (length < leastLength) // only "nan" and "inf", one short of four
         text(" ");
     return text({digits, length});
 }

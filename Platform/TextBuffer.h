@@ -13,6 +13,8 @@ public:
     TextBuffer& decimal(std::int64_t number);
     /// "%4.2f": at least four characters, two decimals; a not-a-number is " nan", never with a sign.
     TextBuffer& fixed2(double number);
+    /// "%f": six decimals; a not-a-number is "nan", never with a sign.
+    TextBuffer& fixed6(double number);
     /// Further text; what does not fit the buffer is cut.
     TextBuffer& text(std::string_view text);
 
@@ -26,6 +28,8 @@ public:
     }
 
 private:
+    TextBuffer& fixed(double number, std::size_t leastLength, int decimals);
+
     char _characters[400]; // a double in full, and a unit
     std::size_t _length = 0;
 };

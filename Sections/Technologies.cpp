@@ -1,6 +1,7 @@
+#include "LogGenerator/CDMA/C2KLogGenerator.h"
+#include "LogGenerator/GSM/GSMLogGenerator.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Platform/TelephonyConstants.h"
-#include "Sections/AwaitedLogGenerator.h"
 #include "Sections/GSMUMTS/ZPH_GSMLogGenerator.h"
 #include "Sections/LTE/LTELogGenerator.h"
 #include "Sections/UTRAN/UTRANLogGenerator.h"
@@ -13,11 +14,11 @@ std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(const Value&
     if (!constant)
         return nullptr;
     if (*constant == kRKLogChannelTechnology_IFX)
-        return std::make_unique<AwaitedLogGenerator>(*constant);
+        return GSMLogGenerator::generator();
     if (*constant == kRKLogChannelTechnology_Zephyr_GSM)
         return ZPH_GSMLogGenerator::generator();
     if (*constant == kRKLogChannelTechnology_Zephyr_CDMA)
-        return std::make_unique<AwaitedLogGenerator>(*constant);
+        return C2KLogGenerator::generator();
     if (*constant == kRKLogChannelTechnology_Zephyr_LTE)
         return LTELogGenerator::generator();
     if (*constant == kRKLogChannelTechnology_Zephyr_UTRAN2)

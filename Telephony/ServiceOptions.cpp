@@ -13,8 +13,8 @@ namespace {
 constexpr int ExitWrongUsage = 2;
 
 constexpr const char* Description =
-    "The telephony service: opens log channels and streams log messages from a simulated baseband, recordings or a\n"
-    "live stream.\n"
+    "The telephony service: opens log channels and streams log messages from a simulated baseband, a recording,\n"
+    "a live stream or a modem.\n"
     "Ports are met in $SPECTREL_PORT_DIR (default: $XDG_RUNTIME_DIR/spectrel).";
 
 const CLI::Validator IsScene(
@@ -110,6 +110,13 @@ void describe(CLI::App& program, ServiceOptions& options)
             "A live stream of capture (pcap) or DLF bytes: - (standard input), a FIFO, unix:PATH or "
             "tcp:HOST:PORT to listen there (tcp:PORT: this machine alone)")
         ->type_name("ADDRESS");
+    source
+        ->add_option_function<std::string>(
+            "--modem", [&options](const std::string& wish) { options.modem = wish; },
+            "The modem that ModemManager has: its number, object path, model or control port (default: one that is "
+            "registered)")
+        ->expected(0, 1)
+        ->type_name("[NAME]");
     source->require_option(1);
     describeSimulation(program, *simulate, options.simulate);
     describeReplay(program, *replay, options.replay);

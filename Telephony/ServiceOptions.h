@@ -26,6 +26,7 @@ struct ServiceOptions {
     SimulateOptions simulate;
     ReplayOptions replay;
     std::string relay; // the stream's address
+    std::optional<std::string> modem; // which one; empty: any
     std::optional<Technology> technology; // where a recording or a stream does not tell
     int readyDescriptor = -1;
     std::optional<std::chrono::milliseconds> statusInterval;

@@ -8,6 +8,8 @@
 #include "Platform/Sockets/ServiceManager.h"
 #include "Platform/Sockets/SocketMessagePorts.h"
 #include "Platform/TelephonyProtocol.h"
+#include "Telephony/Modem/ModemManager/ModemManagerService.h"
+#include "Telephony/Modem/ModemSource.h"
 #include "Telephony/RelaySource.h"
 #include "Telephony/ReplaySource.h"
 #include "Telephony/ServiceOptions.h"
@@ -49,6 +51,10 @@ std::unique_ptr<LogSource> makeSource(
         return input ? std::make_unique<RelaySource>(
                    runLoop, std::move(input), options.technology, [&runLoop] { runLoop.quit(ExitFailed); })
                      : nullptr;
+    }
+    if (options.modem) {
+        auto service = ModemManagerService::open(reason);
+        return service ? std::make_unique<ModemSource>(runLoop, clock, std::move(service), *options.modem) : nullptr;
     }
     options.replay.technology = options.technology;
     if (!options.simulate.technology)
@@ -132,7 +138,7 @@ int serve(ServiceOptions& options)
         return fail("cannot take the telephony service's port in " + Places::portDirectory()
             + ": another service runs there, or the folder is not this user's own");
     StatusReport report(clock, service, *source);
-    const TerminationSignals signals(
+    const TerminationSignals terminationSignals(
         [&](int signal) { signal == SIGUSR1 ? tellStatus(report) : runLoop.quit(); }, {SIGUSR1});
     std::optional<RegularReport> regularReport;
     if (options.statusInterval)

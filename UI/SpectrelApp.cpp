@@ -28,6 +28,7 @@ SpectrelApp::SpectrelApp(Services services)
 SpectrelApp::~SpectrelApp()
 {
     // Closing the session tells its observer, who must find no model by then.
+    _playback.reset();
     _model.reset();
     if (sharedInstance == this)
         sharedInstance = nullptr;
@@ -44,6 +45,8 @@ void SpectrelApp::applicationDidFinishLaunching()
     const Size screen = _services.toolkit.mainScreenSize();
     _window = std::make_unique<Window>(Window {{0, 0, screen.width, screen.height}});
     _model = _services.makeModel(*this);
+    if (Playback* playback = _model->playback())
+        _playback = std::make_unique<PlaybackController>(*playback);
     setUpdateMessage(ConnectingAgain);
     _dateFormatter = std::make_unique<DateFormatter>(_services.clock, UpdatedPattern);
 
@@ -51,6 +54,8 @@ void SpectrelApp::applicationDidFinishLaunching()
     root->setStatus(ConnectingFirst, true);
     _navController = std::make_unique<NavigationController>(_services.toolkit, std::move(root));
     _navController->setDelegate(this);
+    _find = std::make_unique<FindController>(_services.toolkit, *_navController);
+    _copying = std::make_unique<CopyController>(_services.toolkit);
 
     _window->rootViewController = _navController.get();
     _window->isKeyAndVisible = true;
@@ -74,6 +79,7 @@ void SpectrelApp::applicationWillTerminate()
         _services.toolkit.screenDidChange(ScreenPart::Window, Animation::None);
     }
     setWindow(nullptr);
+    _playback.reset();
     _model.reset();
 }
 
@@ -81,7 +87,7 @@ void SpectrelApp::getSaveButtonPref()
 {
     std::error_code error;
     const auto status = std::filesystem::symlink_status(Places::devicePath(SaveMarker), error);
-    setAllowSaveButton(std::filesystem::exists(status));
+    setAllowSaveButton(_services.offersSaving && std::filesystem::exists(status));
 }
 
 void SpectrelApp::setGSMRSSI(bool shows)
@@ -141,6 +147,12 @@ void SpectrelApp::updateViewControllerFromModel()
     if (_model->isConnected())
         setUpdateMessage(_dateFormatter->stringFromDate(_services.clock.now()));
     updateStatusForViewController(*_navController->topViewController());
+    _find->treeDidReload();
+}
+
+void SpectrelApp::playbackDidChange()
+{
+    _services.toolkit.screenDidChange(ScreenPart::Playback, Animation::None);
 }
 
 void SpectrelApp::sessionDidChange()

@@ -6,7 +6,10 @@
 #include "Platform/Preferences.h"
 #include "Platform/RunLoop.h"
 #include "Platform/ScreenToolkit.h"
+#include "UI/CopyController.h"
+#include "UI/FindController.h"
 #include "UI/NavigationController.h"
+#include "UI/PlaybackController.h"
 #include "UI/SpectrelSaveViewController.h"
 
 #include <functional>
@@ -61,6 +64,7 @@ public:
         ModelFactory makeModel; // called once, at launch; the model must not call back while it is being made
         SpectrelSaveViewController::SnapshotWriter writeSnapshot;
         std::string snapshotDirectory;
+        bool offersSaving = true; // false: what is shown is a file already, and the marker does not count
     };
 
     explicit SpectrelApp(Services services);
@@ -83,6 +87,7 @@ public:
 
     void updateViewControllerFromModel() override;
     void sessionDidChange() override;
+    void playbackDidChange() override;
     void navigationControllerWillShowViewController(
         NavigationController& navigationController, SpectrelPaneController& pane, Animation animated) override;
 
@@ -129,6 +134,20 @@ public:
     {
         return _model.get();
     }
+    /// The search in the tree, and the copying; null before launch.
+    FindController* find() const
+    {
+        return _find.get();
+    }
+    CopyController* copying() const
+    {
+        return _copying.get();
+    }
+    /// The playback line; null where nothing is played.
+    PlaybackController* playback() const
+    {
+        return _playback.get();
+    }
     /// Why there is no session; empty while there is one or nothing is known.
     const std::string& lostReason() const;
 
@@ -139,7 +158,10 @@ private:
     std::unique_ptr<Window> _window;
     std::unique_ptr<NavigationController> _navController;
     std::unique_ptr<SpectrelSaveViewController> _saveViewController;
+    std::unique_ptr<FindController> _find;
+    std::unique_ptr<CopyController> _copying;
     std::unique_ptr<MonitorModel> _model;
+    std::unique_ptr<PlaybackController> _playback;
     bool _allowSaveButton = false;
     std::unique_ptr<DateFormatter> _dateFormatter;
     std::string _updateMessage;

@@ -129,16 +129,22 @@ void SpectrelPaneController::didSelectRow(std::optional<std::size_t> row)
 {
     if (!row)
         return;
-    const NodeRef child = childAtRow(*row);
-    if (!child->childNodes()) {
+    if (childAtRow(*row)->childNodes())
+        openRow(*row, Animation::Animated);
+    else
         _tableView.deselectRow(Animation::None);
+}
+
+void SpectrelPaneController::openRow(std::size_t row, Animation animation)
+{
+    const NodeRef child = childAtRow(row);
+    if (!child || !child->childNodes())
         return;
-    }
     auto pane =
         std::make_shared<SpectrelPaneController>(_toolkit, child, pathByAppending(_keyPath, child->displayName()));
     pane->setStatus(_status, _isLoading);
     if (_navigationController)
-        _navigationController->pushViewController(std::move(pane), Animation::Animated);
+        _navigationController->pushViewController(std::move(pane), animation);
 }
 
 } // namespace spectrel

@@ -77,6 +77,8 @@ public:
         return _tableView;
     }
     std::size_t numberOfRows() const override;
+    /// Opens the pane of the inner node at the row; nothing where there is none.
+    void openRow(std::size_t row, Animation animation);
     /// The child shown at the row; null when there is no such row.
     NodeRef childAtRow(std::size_t row) const;
     /// The cell of a row in sight; null for any other row.

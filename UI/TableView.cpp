@@ -105,4 +105,13 @@ void TableView::deselectRow(Animation animation)
         _toolkit.screenDidChange(ScreenPart::Rows, animation);
 }
 
+void TableView::showRow(std::size_t row)
+{
+    if (row >= numberOfRows())
+        return;
+    _selectedRow = row;
+    _rowToShow = row;
+    _toolkit.screenDidChange(ScreenPart::Rows, Animation::Animated);
+}
+
 } // namespace spectrel

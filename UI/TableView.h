@@ -8,6 +8,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 namespace spectrel {
@@ -108,6 +109,13 @@ public:
     /// A tap on the row.
     void selectRow(std::optional<std::size_t> row);
     void deselectRow(Animation animation);
+    /// Marks the row as selected without a tap and has it brought into sight; nothing when there is no such row.
+    void showRow(std::size_t row);
+    /// The row that the front end still has to bring into sight; asked once.
+    std::optional<std::size_t> takeRowToShow()
+    {
+        return std::exchange(_rowToShow, std::nullopt);
+    }
     std::optional<std::size_t> selectedRow() const
     {
         return _selectedRow;
@@ -125,6 +133,7 @@ private:
     std::vector<CellRef> _visible; // of the rows from `_firstVisible`
     std::deque<CellRef> _pool; // the first returned is at the front
     std::optional<std::size_t> _selectedRow;
+    std::optional<std::size_t> _rowToShow;
 };
 
 } // namespace spectrel

@@ -7,6 +7,7 @@ endif()
 add_library(spectrel_options INTERFACE)
 target_compile_features(spectrel_options INTERFACE cxx_std_20)
 target_compile_options(spectrel_options INTERFACE
+    -ffp-contract=off # the same last digit on every processor
     -Wall -Wextra -Wpedantic -Wshadow -Wconversion -Wno-sign-conversion -Werror
     $<$<CXX_COMPILER_ID:GNU>:-Wno-restrict>) # g++ 12 sees overlaps in "text" + std::string where there are none
 target_include_directories(spectrel_options INTERFACE ${CMAKE_SOURCE_DIR})

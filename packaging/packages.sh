@@ -3,12 +3,22 @@
 build_packages=(
     g++ cmake ninja-build pkg-config ccache
     qt6-base-dev libexpat1-dev libpcap-dev libncurses-dev libcli11-dev rapidjson-dev
+    qt6-declarative-dev qt6-declarative-dev-tools qt6-wayland libqt6svg6
+    # The QML modules that the graphical screens load; nothing pulls them in.
+    qml6-module-qtqml qml6-module-qtqml-models qml6-module-qtqml-workerscript qml6-module-qtquick
+    qml6-module-qtquick-controls qml6-module-qtquick-layouts qml6-module-qtquick-templates qml6-module-qtquick-window
 )
 test_packages=(
     "${build_packages[@]}"
     libgtest-dev libgmock-dev libbenchmark-dev
     clang clang-format libclang-rt-14-dev
     python3 tmux git procps dbus-daemon systemd tcpdump
+    python3-dbusmock modemmanager
+    xvfb xdotool imagemagick appstream desktop-file-utils
+)
+picture_packages=(
+    "${build_packages[@]}"
+    python3 xvfb xdotool imagemagick optipng fonts-inter
 )
 
 # install_missing PACKAGE...: asks the package manager only when something is missing.

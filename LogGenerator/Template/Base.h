@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LogGenerator/Template/ClassDictionary.h"
+#include "LogGenerator/Template/Framing.h"
 #include "LogGenerator/Template/RecordView.h"
 #include "Platform/List.h"
 #include "Platform/Value.h"
@@ -10,9 +11,6 @@
 #include <vector>
 
 namespace spectrel {
-
-/// Added to the 16-bit code of a record of the extra stream (type byte 0xFF).
-constexpr std::uint32_t ExtraStream = 0xFF0000;
 
 /// A section: decodes the records of a few log codes into its own node of the display dictionary.
 ///

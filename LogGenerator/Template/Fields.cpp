@@ -2,6 +2,8 @@
 
 #include "Platform/Dictionary.h"
 
+#include <algorithm>
+
 namespace spectrel {
 
 namespace {
@@ -51,6 +53,32 @@ DictionaryRef entryWithFields(RecordView record, std::span<const Field> fields, 
     auto entry = std::make_shared<Dictionary>();
     storeInto(*entry, record, fields, start);
     return entry;
+}
+
+std::string_view unsignedDecimal(std::uint32_t value, TextBuffer& buffer)
+{
+    return buffer.decimal(value).view();
+}
+
+std::string_view decimalDB(std::uint32_t value, TextBuffer& buffer)
+{
+    return buffer.decimal(static_cast<std::int32_t>(value)).text(" dB").view();
+}
+
+std::string_view decimalDBm(std::uint32_t value, TextBuffer& buffer)
+{
+    return buffer.decimal(static_cast<std::int32_t>(value)).text(" dBm").view();
+}
+
+bool storeRecord(
+    RecordView record, std::uint32_t logCode, std::span<const RecordLayout> layouts, const Value& sectionRef)
+{
+    const auto layout = std::ranges::find(layouts, logCode, &RecordLayout::code);
+    if (layout == layouts.end())
+        return false;
+    if (record.size() >= layout->minimumLength)
+        storeFields(record, layout->fields, sectionRef);
+    return true;
 }
 
 } // namespace spectrel

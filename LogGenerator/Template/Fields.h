@@ -58,4 +58,36 @@ void storeFields(RecordView record, std::span<const Field> fields, const Value& 
 /// A new dictionary with the fields in table order: one entry of a section's list, which stands at `start`.
 DictionaryRef entryWithFields(RecordView record, std::span<const Field> fields, std::size_t start);
 
+/// "%u".
+std::string_view unsignedDecimal(std::uint32_t value, TextBuffer& buffer);
+/// "%d dB".
+std::string_view decimalDB(std::uint32_t value, TextBuffer& buffer);
+/// "%d dBm".
+std::string_view decimalDBm(std::uint32_t value, TextBuffer& buffer);
+
+/// Shows a code's name in a table that is indexed by the code, and "Unknown" for a code past the table's end.
+template <const auto& Names> std::string_view named(std::uint32_t code, TextBuffer&)
+{
+    return code < Names.size() ? Names[code] : std::string_view("Unknown");
+}
+
+/// Shows the first text of two for zero, the second for anything else.
+template <const auto& Texts> std::string_view flagged(std::uint32_t value, TextBuffer&)
+{
+    static_assert(Texts.size() == 2);
+    return Texts[value == 0 ? 0 : 1];
+}
+
+/// A record that is fields throughout: its log code, its least length in bytes (header included), its fields.
+struct RecordLayout {
+    std::uint32_t code;
+    std::size_t minimumLength;
+    std::span<const Field> fields;
+};
+
+/// Writes the fields of the layout with the record's log code; a record that is too short changes nothing. False when
+/// no layout has the code.
+bool storeRecord(
+    RecordView record, std::uint32_t logCode, std::span<const RecordLayout> layouts, const Value& sectionRef);
+
 } // namespace spectrel

@@ -5,6 +5,8 @@
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyConstants.h"
 
+#include <span>
+
 namespace spectrel {
 
 namespace {
@@ -15,6 +17,30 @@ bool isText(const Value& value, std::string_view text)
 {
     const std::string* string = value.string();
     return string && *string == text;
+}
+
+/// The elements of a list; a value that is none has no elements.
+std::span<const Value> elementsOf(const Value& value)
+{
+    const auto& list = value.list();
+    return list ? std::span<const Value>(list->elements()) : std::span<const Value>();
+}
+
+bool isCell(const Value& value, std::string_view technology, std::string_view type)
+{
+    const auto& cell = value.dictionary();
+    return cell && isText((*cell)[kRKCellMonitorCellRadioAccessTechnology], technology)
+        && isText((*cell)[kRKCellMonitorCellType], type);
+}
+
+std::vector<DictionaryRef> cellsOf(const Value& value, std::string_view technology, std::string_view type)
+{
+    std::vector<DictionaryRef> cells;
+    for (const Value& element : elementsOf(value)) {
+        if (isCell(element, technology, type))
+            cells.push_back(element.dictionary());
+    }
+    return cells;
 }
 
 } // namespace
@@ -49,18 +75,26 @@ CellInfoArrayReader::CellInfoArrayReader(RecordView record)
         SPECTREL_LOG(Priority::Error, "Cell Info Array data could not be constructed");
 }
 
-DictionaryRef CellInfoArrayReader::firstServingCell(std::string_view radioAccessTechnology) const
+DictionaryRef CellInfoArrayReader::firstServingCell(
+    std::initializer_list<std::string_view> radioAccessTechnologies) const
 {
-    const auto& cells = _cells.list();
-    if (!cells)
-        return nullptr;
-    for (const Value& element : cells->elements()) {
-        const auto& cell = element.dictionary();
-        if (cell && isText((*cell)[kRKCellMonitorCellRadioAccessTechnology], radioAccessTechnology)
-            && isText((*cell)[kRKCellMonitorCellType], kRKCellMonitorCellTypeServing))
-            return cell;
+    for (const Value& element : elementsOf(_cells)) {
+        for (const std::string_view technology : radioAccessTechnologies) {
+            if (isCell(element, technology, kRKCellMonitorCellTypeServing))
+                return element.dictionary();
+        }
     }
     return nullptr;
+}
+
+std::vector<DictionaryRef> CellInfoArrayReader::servingCells(std::string_view radioAccessTechnology) const
+{
+    return cellsOf(_cells, radioAccessTechnology, kRKCellMonitorCellTypeServing);
+}
+
+std::vector<DictionaryRef> CellInfoArrayReader::neighborCells(std::string_view radioAccessTechnology) const
+{
+    return cellsOf(_cells, radioAccessTechnology, kRKCellMonitorCellTypeNeighbor);
 }
 
 } // namespace spectrel

@@ -6,8 +6,9 @@
 
 #include <cstdint>
 #include <exception>
-#include <optional>
+#include <initializer_list>
 #include <string_view>
+#include <vector>
 
 /// Readers of the records whose payload is a property list that the telephony service supplies. Each owns the parsed
 /// object for the duration of one update.
@@ -57,9 +58,12 @@ public:
     {
         return !_cells.isAbsent();
     }
-    /// The first serving cell of the technology, which has both a technology and a cell type. Null when there is none;
-    /// an object that is no list has no cells.
-    DictionaryRef firstServingCell(std::string_view radioAccessTechnology) const;
+    /// The first serving cell of any of the technologies, which has both a technology and a cell type. Null when there
+    /// is none; an object that is no list has no cells.
+    DictionaryRef firstServingCell(std::initializer_list<std::string_view> radioAccessTechnologies) const;
+    /// All serving cells of the technology, and all neighbour cells, in the list's order.
+    std::vector<DictionaryRef> servingCells(std::string_view radioAccessTechnology) const;
+    std::vector<DictionaryRef> neighborCells(std::string_view radioAccessTechnology) const;
 
 private:
     Value _cells;

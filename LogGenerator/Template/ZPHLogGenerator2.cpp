@@ -1,7 +1,7 @@
 #include "LogGenerator/Template/ZPHLogGenerator2.h"
 
 #include "LogGenerator/Template/Base.h"
-#include "LogGenerator/Template/RecordView.h"
+#include "LogGenerator/Template/Framing.h"
 #include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
 
@@ -10,15 +10,6 @@
 #include <utility>
 
 namespace spectrel {
-
-namespace {
-
-constexpr std::uint8_t WrapperMark = 0x81;
-constexpr std::size_t WrapperSize = 2;
-constexpr std::uint8_t OrdinaryRecord = 0x01;
-constexpr std::uint8_t ExtraRecord = 0xFF;
-
-} // namespace
 
 void ZPHLogGenerator2::initWithPListName(std::string newPListName, std::shared_ptr<ClassIndex> cIndexObj)
 {
@@ -46,13 +37,13 @@ void ZPHLogGenerator2::updateWithData(ByteView data)
 {
     if (data.size() < RecordHeaderSize)
         return;
-    const RecordView record(data[0] == WrapperMark ? data.subspan(WrapperSize) : data);
+    const RecordView record(recordInMessage(data));
     const std::uint8_t type = record.u8(0);
     if (type != OrdinaryRecord && type != ExtraRecord) {
-        SPECTREL_LOG(Priority::Error, "Invalid log type: %x. Dropping.", type);
+        SPECTREL_LOG(Priority::Error, InvalidTypeLine, type);
         return;
     }
-    const std::uint32_t code = record.u16(3) | (type == ExtraRecord ? ExtraStream : 0);
+    const std::uint32_t code = routingCode(record);
     const Subscribers* subscribers = cIndex ? cIndex->getSubscribers(code) : nullptr;
     if (!subscribers)
         return;

@@ -40,6 +40,28 @@ bool makePrivate(int file, std::string& reason)
     return !S_ISREG(status.st_mode) || ::fchmod(file, 0600) == 0 || failed(reason);
 }
 
+bool isWantOfRoom(int error)
+{
+    return error == ENOSPC || error == EDQUOT || error == EFBIG;
+}
+
+/// Gives a regular file its new size before the first byte is overwritten: where the disk is full, the file stays as it
+/// was. File systems that cannot reserve tell at the write.
+bool reserve(int file, std::size_t size, std::string& reason)
+{
+    struct stat status { };
+    if (::fstat(file, &status) != 0)
+        return failed(reason);
+    if (!S_ISREG(status.st_mode))
+        return true;
+    if (::fallocate(file, 0, 0, static_cast<off_t>(size)) != 0 && isWantOfRoom(errno)) {
+        failed(reason);
+        [[maybe_unused]] const int shortened = ::ftruncate(file, status.st_size);
+        return false;
+    }
+    return ::ftruncate(file, static_cast<off_t>(size)) == 0 || failed(reason);
+}
+
 /// The file's bytes; none when it cannot be read or is larger than a list may be.
 std::optional<Bytes> readAll(int file)
 {
@@ -69,13 +91,18 @@ bool writePropertyListToFile(const Value& value, const std::string& path, std::s
         reason = "the value cannot be written as a property list";
         return false;
     }
-    const int file = ::open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0600);
+    int file = ::open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0600);
+    const bool isNew = file >= 0;
+    if (!isNew)
+        file = ::open(path.c_str(), O_WRONLY | O_CREAT | O_CLOEXEC, 0600);
     if (file < 0)
         return failed(reason);
-    const bool written = makePrivate(file, reason) && writeAll(file, *text, reason);
-    if (::close(file) != 0 && written)
-        return failed(reason); // some file systems tell only now that the disk is full
-    return written;
+    const bool written =
+        makePrivate(file, reason) && reserve(file, text->size(), reason) && writeAll(file, *text, reason);
+    const bool closed = ::close(file) == 0 || (written && failed(reason)); // some file systems tell only now
+    if (isNew && !(written && closed))
+        ::unlink(path.c_str()); // half a list is of no use to anybody
+    return written && closed;
 }
 
 std::optional<Value> readPropertyListFile(const std::string& path)

@@ -1,7 +1,7 @@
 #include "Platform/Expat/XMLPropertyListReader.h"
 
+#include "Platform/Base64.h"
 #include "Platform/Dictionary.h"
-#include "Platform/Expat/Base64.h"
 #include "Platform/Expat/PropertyListBudget.h"
 #include "Platform/Expat/PropertyListScalars.h"
 #include "Platform/List.h"

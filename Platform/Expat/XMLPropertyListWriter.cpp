@@ -1,5 +1,5 @@
+#include "Platform/Base64.h"
 #include "Platform/Dictionary.h"
-#include "Platform/Expat/Base64.h"
 #include "Platform/Expat/PropertyListScalars.h"
 #include "Platform/List.h"
 #include "Platform/PropertyList.h"

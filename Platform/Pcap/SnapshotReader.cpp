@@ -11,7 +11,7 @@ namespace {
 
 class SnapshotReader final : public RecordingReader {
 public:
-    explicit SnapshotReader(ListRef entries);
+    SnapshotReader(DictionaryRef snapshot, ListRef entries);
 
     std::optional<Technology> technology() const override
     {
@@ -22,6 +22,10 @@ public:
     {
         return _damage;
     }
+    DictionaryRef snapshot() const override
+    {
+        return _snapshot;
+    }
 
 private:
     bool openEntry();
@@ -29,6 +33,7 @@ private:
     bool takeReport(RecordedMessage& message);
     bool damaged(const std::string& place, const std::string& why);
 
+    DictionaryRef _snapshot;
     ListRef _entries;
     std::optional<Technology> _technology;
     std::size_t _nextEntry = 0;
@@ -52,8 +57,9 @@ const Value& displayStateOf(const Value& entry)
 }
 
 /// Messages do not tell which Zephyr technology they are of; only the dictionary-reporting baseband keeps its reports.
-SnapshotReader::SnapshotReader(ListRef entries)
-    : _entries(std::move(entries))
+SnapshotReader::SnapshotReader(DictionaryRef snapshot, ListRef entries)
+    : _snapshot(std::move(snapshot))
+    , _entries(std::move(entries))
 {
     for (const Value& entry : _entries->elements()) {
         const Value& state = displayStateOf(entry);
@@ -140,7 +146,7 @@ std::unique_ptr<RecordingReader> openSnapshot(const Value& list, std::string& re
         reason = "a property list, but no snapshot: it has no list \"Data\"";
         return nullptr;
     }
-    return std::make_unique<SnapshotReader>(entries);
+    return std::make_unique<SnapshotReader>(dictionary, entries);
 }
 
 } // namespace spectrel

@@ -3,7 +3,15 @@
 #include "LogGenerator/Template/ClassIndex.h"
 #include "Sections/GSMUMTS/PDPContextList.h"
 #include "Sections/GSMUMTS/SimInfo.h"
+#include "Sections/LTE/ConnectedModeMeasurementMisc.h"
+#include "Sections/LTE/DetectedCells.h"
 #include "Sections/LTE/LTEServingCellInfo.h"
+#include "Sections/LTE/MeasuredNeighborCells.h"
+#include "Sections/LTE/NeighborCellsList.h"
+#include "Sections/LTE/NeighborMeasurementMisc.h"
+#include "Sections/LTE/ReselectionCandidatesList.h"
+#include "Sections/LTE/ReselectionCandidatesMisc.h"
+#include "Sections/LTE/ServingCellMeasurement.h"
 
 namespace spectrel {
 
@@ -14,6 +22,14 @@ public:
 
 private:
     LTEServingCellInfo objLTEServingCellInfo {classDict, codeDictionary};
+    ConnectedModeMeasurementMisc objConnectedModeMeasurementMisc {classDict, codeDictionary};
+    MeasuredNeighborCells objMeasuredNeighborCells {classDict, codeDictionary};
+    DetectedCells objDetectedCells {classDict, codeDictionary};
+    ServingCellMeasurement objServingCellMeasurement {classDict, codeDictionary};
+    NeighborMeasurementMisc objNeighborMeasurementMisc {classDict, codeDictionary};
+    NeighborCellsList objNeighborCellsList {classDict, codeDictionary};
+    ReselectionCandidatesMisc objReselectionCandidatesMisc {classDict, codeDictionary};
+    ReselectionCandidatesList objReselectionCandidatesList {classDict, codeDictionary};
     SimInfo objSimInfo {classDict, codeDictionary};
     PDPContextList objPDPContextList {classDict, codeDictionary};
 };

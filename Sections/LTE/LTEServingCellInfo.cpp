@@ -1,8 +1,8 @@
 #include "Sections/LTE/LTEServingCellInfo.h"
 
+#include "LogGenerator/Template/CellFields.h"
 #include "LogGenerator/Template/Fields.h"
 #include "LogGenerator/Template/PropertyListReaders.h"
-#include "Platform/Dictionary.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyConstants.h"
 
@@ -57,19 +57,14 @@ constexpr std::array<Field, 1> AntennaFields {{
     {20, Width::U8, "Num Tx Antennas", decimal},
 }};
 
-struct CellInformationKey {
-    std::string_view monitorKey;
-    std::string_view displayKey;
-    const char* missing; // logged with its own line end, as it stands
-};
-
 /// Cell information, code 0xFF0001, in writing order.
-constexpr std::array<CellInformationKey, 5> CellInformationKeys {{
-    {kRKCellMonitorTAC, "Tracking Area Code", "Serving Cell Info: Failed to retrieve TAC\n"},
-    {kRKCellMonitorCellId, "Cell Identity", "Serving Cell Info: Failed to retrieve Cell ID\n"},
-    {kRKCellMonitorPID, "Physical Cell ID", "Serving Cell Info: Failed to retrieve Physical Cell ID\n"},
-    {kRKCellMonitorBandInfo, "Freq Band Indicator", "Serving Cell Info: Failed to retrieve Freq Band Indicator\n"},
-    {kRKCellMonitorUARFCN, "UARFCN", "Serving Cell Info: Failed to retrieve UARFCN\n"},
+constexpr std::array<CellField, 5> CellInformationFields {{
+    {kRKCellMonitorTAC, "Tracking Area Code", decimal, "Serving Cell Info: Failed to retrieve TAC\n"},
+    {kRKCellMonitorCellId, "Cell Identity", decimal, "Serving Cell Info: Failed to retrieve Cell ID\n"},
+    {kRKCellMonitorPID, "Physical Cell ID", decimal, "Serving Cell Info: Failed to retrieve Physical Cell ID\n"},
+    {kRKCellMonitorBandInfo, "Freq Band Indicator", decimal,
+        "Serving Cell Info: Failed to retrieve Freq Band Indicator\n"},
+    {kRKCellMonitorUARFCN, "UARFCN", decimal, "Serving Cell Info: Failed to retrieve UARFCN\n"},
 }};
 
 } // namespace
@@ -124,22 +119,7 @@ void LTEServingCellInfo::updateAntennas(RecordView record)
 
 void LTEServingCellInfo::updateFromCellInformation(RecordView record)
 {
-    const CellInfoArrayReader reader(record);
-    if (!reader.holdsAnything()) {
-        SPECTREL_LOG(Priority::Error, "Failed to get Cell Array\n");
-        return;
-    }
-    const DictionaryRef cell = reader.firstServingCell(kRKCellMonitorRadioAccessTechnologyLTE);
-    if (!cell)
-        return;
-    TextBuffer buffer;
-    for (const CellInformationKey& key : CellInformationKeys) {
-        buffer.clear();
-        if (const auto number = (*cell)[key.monitorKey].int32())
-            storeText(key.displayKey, buffer.decimal(*number).view());
-        else
-            SPECTREL_LOG(Priority::Error, "%s", key.missing);
-    }
+    storeServingCell(record, {kRKCellMonitorRadioAccessTechnologyLTE}, CellInformationFields, sectionRef);
 }
 
 } // namespace spectrel

@@ -38,7 +38,7 @@ Bytes propertyListRecord(std::uint32_t code, const Value& payload, Moment time)
     return RecordWriter(code, time).bytes({reinterpret_cast<const std::uint8_t*>(text.data()), text.size()}).take();
 }
 
-Bytes simFilesRecord(Moment time)
+Bytes simFilesRecord(Moment time, const SIMFiles& files)
 {
     return propertyListRecord(0xFF0000,
         Dictionary::make({
@@ -46,13 +46,13 @@ Bytes simFilesRecord(Moment time)
             {"kSimFile_MSISDN", "+10015550100"},
             {"kSimFile_MBDN", "+10015550199"},
             {"kSimFile_HPPLMN", "60 min"},
-            {"kSimFile_LOCI", "00F110 04B1 FE"},
-            {"kSimFile_PSLOCI", "00F110 04B1 01"},
+            {"kSimFile_LOCI", files.location},
+            {"kSimFile_PSLOCI", files.packetLocation},
             {"kSimFile_ACC", "0001"},
             {"kSimFile_AD", "80 00 00 02"},
             {"kSimFile_FPLMN", "001-02, 001-03"},
             {"kSimFile_AHPLMN", "001-01"},
-            {"kSimFile_RATMODE", "LTE preferred"},
+            {"kSimFile_RATMODE", files.ratMode},
             {"kSimFile_PNN", "Test Network"},
             {"kSimFile_OPL", "001-01 0000-FFFE"},
             {"kSimFile_OPLMNAcT", "001-01 E-UTRAN, 001-01 UTRAN, 001-01 GSM"},

@@ -5,6 +5,7 @@
 #include "Platform/Value.h"
 
 #include <cstdint>
+#include <string_view>
 
 namespace spectrel {
 
@@ -13,8 +14,15 @@ class LTEWorld;
 /// A record of the extra stream whose payload is the property list, in its XML form.
 Bytes propertyListRecord(std::uint32_t code, const Value& payload, Moment time);
 
+/// What a phone changes on its SIM.
+struct SIMFiles {
+    std::string_view location = "00F110 04B1 FE"; // EF-LOCI: where calls reach it
+    std::string_view packetLocation = "00F110 04B1 01";
+    std::string_view ratMode = "LTE preferred";
+};
+
 /// 0xFF0000: the SIM's elementary files. A test card's: MCC 001, MNC 01.
-Bytes simFilesRecord(Moment time);
+Bytes simFilesRecord(Moment time, const SIMFiles& files = {});
 
 /// 0xFF0001: the serving cell and its strongest neighbours.
 Bytes lteCellInformationRecord(const LTEWorld& world, Moment time);

@@ -6,15 +6,15 @@ std::unique_ptr<Baseband> makeBaseband(Technology technology, Scene scene, std::
 {
     switch (technology) {
     case Technology::IFX:
-        return nullptr;
+        return makeIFXBaseband(scene, seed);
     case Technology::GSM:
-        return nullptr;
+        return makeGSMUMTSBaseband(scene, seed);
     case Technology::CDMA:
-        return nullptr;
+        return makeCDMABaseband(scene, seed);
     case Technology::LTE:
         return makeLTEBaseband(scene, seed);
     case Technology::UTRAN:
-        return nullptr;
+        return makeUTRANBaseband(scene, seed);
     }
     return nullptr;
 }

@@ -88,6 +88,10 @@ private:
 std::unique_ptr<Baseband> makeBaseband(Technology technology, Scene scene, std::uint32_t seed);
 
 // One for each technology that can be simulated.
+std::unique_ptr<Baseband> makeCDMABaseband(Scene scene, std::uint32_t seed);
+std::unique_ptr<Baseband> makeIFXBaseband(Scene scene, std::uint32_t seed);
 std::unique_ptr<Baseband> makeLTEBaseband(Scene scene, std::uint32_t seed);
+std::unique_ptr<Baseband> makeGSMUMTSBaseband(Scene scene, std::uint32_t seed);
+std::unique_ptr<Baseband> makeUTRANBaseband(Scene scene, std::uint32_t seed);
 
 } // namespace spectrel

@@ -11,15 +11,39 @@ namespace {
 
 using namespace std::chrono_literals;
 
-constexpr std::array<Cadence<LTEWorld>, 5> Cadences {{
-    {10s, true, [](const LTEWorld&, Moment time) { return simFilesRecord(time); }},
-    {2s, true, [](const LTEWorld& world, Moment time) { return lteCellInformationRecord(world, time); }},
-    {1s, true,
+Bytes connectedMode(const LTEWorld& world, Moment time)
+{
+    return world.isConnected() ? lteConnectedModeRecord(world.connectedReport(), time) : Bytes();
+}
+
+Bytes servingMeasurement(const LTEWorld& world, Moment time)
+{
+    return world.isConnected() ? Bytes() : lteServingMeasurementRecord(world.idleMode().serving(), time);
+}
+
+Bytes neighbourMeasurement(const LTEWorld& world, Moment time)
+{
+    return world.isConnected() ? Bytes() : lteNeighbourMeasurementRecord(world.idleMode().neighbours(), time);
+}
+
+Bytes reselection(const LTEWorld& world, Moment time)
+{
+    return world.isConnected() ? Bytes() : lteReselectionRecord(world.idleMode().candidate(), time);
+}
+
+constexpr std::array<Cadence<LTEWorld>, 9> Cadences {{
+    {30s, true, [](const LTEWorld&, Moment time) { return simFilesRecord(time); }},
+    {5s, true, [](const LTEWorld& world, Moment time) { return lteCellInformationRecord(world, time); }},
+    {2s, true,
         [](const LTEWorld& world, Moment time) {
             return contextsRecord(world.bytesReceived(), world.bytesSent(), time);
         }},
     {400ms, false, [](const LTEWorld& world, Moment time) { return lteServingCellRecord(world.servingCell(), time); }},
     {800ms, false, [](const LTEWorld& world, Moment time) { return lteAntennasRecord(world.servingCell(), time); }},
+    {200ms, false, connectedMode},
+    {LTEIdleMode::Cycle, true, servingMeasurement},
+    {LTEIdleMode::Cycle, true, neighbourMeasurement},
+    {LTEIdleMode::Cycle, true, reselection},
 }};
 
 } // namespace

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <numbers>
 
 namespace spectrel {
 
@@ -65,10 +66,21 @@ double Journey::distanceTo(double position, double offset) const
     return std::hypot(std::min(direct, _length - direct), offset);
 }
 
+double Journey::ahead(double position) const
+{
+    return std::remainder(position - _position, _length);
+}
+
 void Shadowing::advance(std::chrono::milliseconds step, Dice& dice)
 {
     const double seconds = std::chrono::duration<double>(step).count();
     _decibels = std::clamp(_decibels + dice.between(-1, 1) * std::sqrt(seconds), -6.0, 6.0);
+}
+
+double Valley::lossAt(const Journey& journey) const
+{
+    const double out = journey.distanceTo((from + to) / 2, 0) / ((to - from) / 2);
+    return out >= 1 ? 0 : loss * (1 + std::cos(out * std::numbers::pi)) / 2;
 }
 
 double pathLoss(double metres)

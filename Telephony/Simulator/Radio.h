@@ -45,6 +45,8 @@ public:
     void advance(std::chrono::milliseconds step, Dice& dice);
     /// Metres from here to a mast that stands `offset` metres beside the place `position`.
     double distanceTo(double position, double offset) const;
+    /// Metres along the road to the place `position`, the shorter way round: positive ahead, negative behind.
+    double ahead(double position) const;
     /// Metres a second.
     double speed() const
     {
@@ -74,6 +76,15 @@ public:
 
 private:
     double _decibels;
+};
+
+/// A stretch of the road where hills take up to `loss` dB, in its middle.
+struct Valley {
+    double from; // metres along the road
+    double to;
+    double loss;
+
+    double lossAt(const Journey& journey) const;
 };
 
 /// Path loss in dB at a distance in metres, not below 35 m (3GPP TR 36.942, 4.5.2: macro cell, urban, 2 GHz:

@@ -63,10 +63,21 @@ TEST(ReadArgumentsTest, WatchEndsAfterACountOrATime)
     EXPECT_EQ(arguments.watch.duration, std::chrono::minutes(2));
 }
 
+TEST(ReadArgumentsTest, ViewTakesAFileItsTechnologyAndTheScreens)
+{
+    Arguments arguments;
+    EXPECT_EQ(read({"view", "--terminal", "--technology", "lte", "a.dlf"}, arguments), std::nullopt);
+    EXPECT_EQ(arguments.job, Job::View);
+    EXPECT_EQ(arguments.screens, ScreenChoice::Terminal);
+    EXPECT_EQ(arguments.view.file, "a.dlf");
+    EXPECT_EQ(arguments.view.technology, Technology::LTE);
+}
+
 TEST(ReadArgumentsTest, WrongUsageIsStatus2)
 {
     for (const std::vector<const char*>& words : std::vector<std::vector<const char*>> {{"--gui", "--terminal"},
-             {"play"}, {"watch", "--count", "0"}, {"watch", "--duration", "soon"}, {"record"}, {"decode"}}) {
+             {"play"}, {"watch", "--count", "0"}, {"watch", "--duration", "soon"}, {"record"}, {"decode"}, {"view"},
+             {"view", "a", "b"}, {"view", "--gui", "--terminal", "a"}, {"view", "--technology", "5g", "a"}}) {
         Arguments arguments;
         EXPECT_EQ(read(words, arguments), ExitStatus::WrongUsage) << words.front();
     }

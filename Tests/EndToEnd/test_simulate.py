@@ -6,7 +6,7 @@ import unittest
 
 from harness import Place
 
-TECHNOLOGIES = ("lte",)
+TECHNOLOGIES = ("lte", "gsm", "utran", "cdma", "ifx")
 
 
 def leaves(display):

@@ -1,29 +1,52 @@
 """The terminal screens in a real terminal: tmux shows what a person would see."""
 
 import os
+import plistlib
 import shlex
+import signal
 import subprocess
 import unittest
 
 from harness import BIN, Place, capture, record, serving_cell, sim_files
 
 
-class Terminal(Place):
+class TerminalPlace(Place):
+    """A test with a terminal of its own."""
+
     def setUp(self):
         super().setUp()
+        self.terminals = 0
         self.socket = self.path("tmux")
-        self.addCleanup(self.tmux, "kill-server")
+        self.addCleanup(self.end_terminal, self.socket)
+
+    def end_terminal(self, socket):
+        self.socket = socket
+        self.tmux("kill-server")
 
     def tmux(self, *arguments):
         return subprocess.run(["tmux", "-S", self.socket, "-f", "/dev/null", *arguments], text=True,
                               capture_output=True, env={**self.environment, "TERM": "xterm-256color",
                                                         "LANG": "C.UTF-8", "LC_ALL": "C.UTF-8"})
 
-    def open(self, *arguments, width=80, height=24):
+    def open(self, *arguments, width=80, height=24, before="true"):
         """Starts a shell in a terminal and the program from it, so that what it leaves behind can be seen."""
-        self.tmux("new-session", "-d", "-x", str(width), "-y", str(height), "sh")
+        self.tmux("new-session", "-d", "-x", str(width), "-y", str(height), "sh", ";",
+                  "set-option", "-s", "set-clipboard", "on")
         program = shlex.join([os.path.join(BIN, "spectrel"), *arguments])
-        self.keys(f"PS1='prompt% '; clear; {program}; echo status $?", "Enter")
+        self.keys(f"PS1='prompt% '; {before}; clear; {program}; echo status $?", "Enter")
+
+    def open_anew(self, *arguments):
+        """The same in a terminal of its own, for tests that start the program more than once."""
+        self.terminals += 1
+        self.socket = self.path(f"tmux-{self.terminals}")
+        self.addCleanup(self.end_terminal, self.socket)
+        self.open(*arguments)
+
+    def program(self):
+        """The process number of the program that the shell in the terminal runs."""
+        shell = self.tmux("display-message", "-p", "#{pane_pid}").stdout.strip()
+        with open(f"/proc/{shell}/task/{shell}/children") as children:
+            return int(children.read().split()[0])
 
     def keys(self, *keys):
         self.tmux("send-keys", *keys)
@@ -39,6 +62,12 @@ class Terminal(Place):
         self.wait_until(shows, f"the screen never showed {texts}:\n{self.screen()}")
         return self.screen()
 
+    def buffer(self):
+        """What was copied last."""
+        return self.tmux("show-buffer").stdout
+
+
+class Terminal(TerminalPlace):
     def replay(self, *messages, technology="lte", **options):
         file = self.write(f"{len(self.processes)}.pcap", capture(messages, technology=technology, **options))
         return self.start_service("--replay", file, "--speed", "0")
@@ -52,7 +81,7 @@ class Terminal(Place):
         self.see("Physical Cell ID", "321", "10 MHz")
         self.keys("Left")
         self.see("SIM Info", "PDP Context Info")
-        self.keys("Down", "Enter")
+        self.keys("End", "Enter")
         self.see("EF-ICCID", "890011")
         self.keys("BSpace")
         self.see("Serving Cell Info")
@@ -98,17 +127,100 @@ class Terminal(Place):
         self.see("still 42")
 
     def test_signals_give_the_terminal_back(self):
-        for name in ("TERM", "SEGV"):
-            with self.subTest(signal=name):
-                self.socket = self.path(f"tmux-{name}")
-                self.addCleanup(self.tmux, "kill-server")
-                self.open("--terminal")
+        for number in (signal.SIGTERM, signal.SIGSEGV):
+            with self.subTest(signal=number.name):
+                self.open_anew("--terminal")
                 self.see("Connecting...")
-                subprocess.run(["pkill", f"-{name}", "-f", f"^{BIN}/spectrel --terminal"], env=self.environment)
+                os.kill(self.program(), number)
                 self.see("status", "prompt%")
                 self.keys("echo still $((40 + 2))", "Enter")
                 self.see("still 42")
-                self.keys("exit", "Enter")
+
+    def start_bus(self):
+        """A message bus of the test's own, and a file that gathers the notices on it."""
+        address = "unix:path=" + self.path("bus")
+        self.environment["DBUS_SESSION_BUS_ADDRESS"] = address
+        self.processes.append(subprocess.Popen(["dbus-daemon", "--session", "--nofork", "--address", address],
+                                               stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL))
+        self.wait_until(lambda: os.path.exists(self.path("bus")), "the bus did not come up")
+        notices = open(self.path("notices"), "w")
+        self.addCleanup(notices.close)
+        self.processes.append(subprocess.Popen(
+            ["dbus-monitor", "--address", address, "type='signal',interface='org.spectrel.Preferences'"],
+            stdout=notices, stderr=subprocess.STDOUT))
+        # It hears of its own coming first: from then on it listens.
+        self.wait_until(lambda: self.notices(), "nobody listens on the bus")
+
+    def notices(self):
+        with open(self.path("notices")) as file:
+            return file.read()
+
+    def test_every_wish_to_end_writes_the_preference_with_its_notice(self):
+        self.start_bus()
+        preference = self.path("config", "spectrel", "org.spectrel.HomeScreen.conf")
+        ways = [number.name for number in (signal.SIGINT, signal.SIGTERM, signal.SIGHUP)] + ["q"]
+        for count, way in enumerate(ways, start=1):
+            with self.subTest(way=way):
+                self.open_anew("--terminal")
+                self.see("Connecting...")
+                self.assertFalse(os.path.exists(preference), "it is written at the end only")
+                if way == "q":
+                    self.keys("q")
+                else:
+                    os.kill(self.program(), signal.Signals[way])
+                self.see("status 0", "prompt%")
+                with open(preference) as file:
+                    self.assertEqual(file.read(), "[General]\nTHShowGSMRSSI=false\n")
+                os.remove(preference)
+                self.wait_until(lambda: self.notices().count('string "THShowGSMRSSI"') == count,
+                                f"no notice came: {self.notices()}")
+                self.assertIn("member=Changed", self.notices())
+
+    def allow_saving(self):
+        os.makedirs(self.path("device", "VexelInternal/Library/PreferenceBundles/Carrier Settings.bundle"))
+
+    def saved(self):
+        return sorted(os.listdir(self.path("crash"))) if os.path.exists(self.path("crash")) else []
+
+    def test_snapshot_is_saved_with_its_description(self):
+        self.allow_saving()
+        self.replay(serving_cell(321))
+        self.open("--terminal")
+        self.see("Serving Cell Info", "Updated ", "[Save]")
+        self.keys("s")
+        self.see("Save Snapshot", "Snapshot (", "DLF binary")
+        self.keys("in car park", *["Left"] * 8, "the ", "Enter")
+        self.see("Description: in the car park")
+        self.keys("Enter")
+        self.see("Serving Cell Info")
+        self.wait_until(self.saved, "nothing was saved")
+        path = self.path("crash", self.saved()[0])
+        self.assertRegex(path, r"/SpectrelSnapshot-\d+\.spectrel$")
+        self.assertEqual(os.stat(path).st_mode & 0o777, 0o600)
+        with open(path, "rb") as file:
+            snapshot = plistlib.load(file)
+        self.assertEqual(list(snapshot), ["Timestamp", "Data", "Description"])
+        self.assertEqual(snapshot["Description"], "in the car park")
+        self.assertEqual(snapshot["Data"][0]["Display"]["Serving Cell Info"]["Physical Cell ID"], "321")
+
+    def test_save_without_room_alerts_and_leaves_older_snapshots(self):
+        self.allow_saving()
+        self.replay(serving_cell(321))
+        os.makedirs(self.path("crash"))
+        older = self.write("crash/SpectrelSnapshot-1.spectrel", b"older")
+        self.open("--terminal", before="ulimit -f 2")  # no file may have more than 1024 bytes
+        self.see("Serving Cell Info", "Updated ", "[Save]")
+        self.keys("s")
+        self.see("Save Snapshot")
+        self.keys("Enter", "Enter")
+        self.see("File Error", "Unable to write file to disk", "[Close]")
+        self.keys("Enter")
+        self.see("Serving Cell Info", "Updated ")
+        self.assertEqual(self.saved(), [os.path.basename(older)])
+        with open(older, "rb") as file:
+            self.assertEqual(file.read(), b"older")
+        self.keys("q")
+        self.see("status 0")
 
     def test_resize_draws_anew(self):
         self.replay(serving_cell(321))

@@ -1,13 +1,13 @@
 #pragma once
 
-#include "Platform/Value.h"
-
-#include <string>
+#include "Platform/Description.h"
 
 namespace spectrel {
 
-/// A value as one short text for comparisons: {"key": "text", "list": ["a"]}. Dictionaries keep their order; numbers,
-/// dates and data are shown by kind and content (int 5, real 0.5, true, date 0, data 01ff); an absent value is "none".
-std::string displayText(const Value& value);
+/// A value as one short text for comparisons.
+inline std::string displayText(const Value& value)
+{
+    return describe(value);
+}
 
 } // namespace spectrel

@@ -31,6 +31,14 @@ public:
         alerts.push_back(alert);
     }
 
+    bool copyToClipboard(const std::string& text, std::string& reason) override
+    {
+        reason = refusesToCopy;
+        if (refusesToCopy.empty())
+            clipboard = text;
+        return refusesToCopy.empty();
+    }
+
     struct Change {
         ScreenPart part;
         Animation animation;
@@ -39,6 +47,8 @@ public:
     std::map<std::string, Size, std::less<>> sizes;
     std::vector<Change> changes;
     std::vector<Alert> alerts;
+    std::string clipboard;
+    std::string refusesToCopy; // why copying fails; empty: it does not
     mutable std::vector<Font> measuredFonts;
 };
 

@@ -73,5 +73,49 @@ TEST(FieldsTest, NodeThatIsNoDictionaryLosesThem)
     EXPECT_EQ(displayText(section), "{\"A\": \"129\"}");
 }
 
+std::string formatted(Formatter format, std::uint32_t value)
+{
+    TextBuffer buffer;
+    return std::string(format(value, buffer));
+}
+
+TEST(FieldsTest, NumbersAreSignedUnlessTheFormatSaysOtherwise)
+{
+    EXPECT_EQ(formatted(decimal, 0xFFFFFFFF), "-1");
+    EXPECT_EQ(formatted(unsignedDecimal, 0xFFFFFFFF), "4294967295");
+    EXPECT_EQ(formatted(decimalDB, static_cast<std::uint32_t>(-7)), "-7 dB");
+    EXPECT_EQ(formatted(decimalDBm, static_cast<std::uint32_t>(-93)), "-93 dBm");
+}
+
+constexpr std::array<std::string_view, 2> Names {{"None", "Some"}};
+
+TEST(FieldsTest, CodeIsNamedByItsPlaceInTheTable)
+{
+    EXPECT_EQ(formatted(named<Names>, 0), "None");
+    EXPECT_EQ(formatted(named<Names>, 1), "Some");
+    EXPECT_EQ(formatted(named<Names>, 2), "Unknown");
+    EXPECT_EQ(formatted(named<Names>, 0xFFFFFFFF), "Unknown");
+}
+
+TEST(FieldsTest, FlagIsOneOfTwoTexts)
+{
+    EXPECT_EQ(formatted(flagged<Names>, 0), "None");
+    EXPECT_EQ(formatted(flagged<Names>, 1), "Some");
+    EXPECT_EQ(formatted(flagged<Names>, 255), "Some");
+}
+
+TEST(FieldsTest, RecordIsStoredByTheLayoutOfItsCode)
+{
+    constexpr std::array<Field, 1> First {{{0, Width::U8, "A", decimal}}};
+    constexpr std::array<Field, 1> Second {{{1, Width::U8, "B", decimal}}};
+    const std::array<RecordLayout, 3> layouts {{{0x10, 8, First}, {0x11, 8, Second}, {0x12, 9, First}}};
+    const Value section(Dictionary::make());
+    EXPECT_FALSE(storeRecord(ByteView(Raw), 0x13, layouts, section));
+    EXPECT_TRUE(storeRecord(ByteView(Raw), 0x12, layouts, section)) << "known, but a byte too short";
+    EXPECT_EQ(displayText(section), "{}");
+    EXPECT_TRUE(storeRecord(ByteView(Raw), 0x11, layouts, section));
+    EXPECT_EQ(displayText(section), "{\"B\": \"254\"}");
+}
+
 } // namespace
 } // namespace spectrel

@@ -134,8 +134,8 @@ TEST_F(TechnologyTest, EachKnownTechnologyHasItsGenerator)
     EXPECT_EQ(generatorFor(kRKLogChannelTechnology_Zephyr_LTE), "LTELogGenerator");
     EXPECT_EQ(generatorFor(kRKLogChannelTechnology_Zephyr_GSM), "ZPH_GSMLogGenerator");
     EXPECT_EQ(generatorFor(kRKLogChannelTechnology_Zephyr_UTRAN2), "UTRANLogGenerator");
-    EXPECT_NE(generatorFor(kRKLogChannelTechnology_Zephyr_CDMA), "none");
-    EXPECT_NE(generatorFor(kRKLogChannelTechnology_IFX), "none");
+    EXPECT_EQ(generatorFor(kRKLogChannelTechnology_Zephyr_CDMA), "C2KLogGenerator");
+    EXPECT_EQ(generatorFor(kRKLogChannelTechnology_IFX), "GSMLogGenerator");
 }
 
 TEST_F(TechnologyTest, UnknownTechnologyHasNoGenerator)

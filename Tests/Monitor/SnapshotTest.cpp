@@ -5,10 +5,11 @@
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/ScratchFolder.h"
 
+#include <csignal>
 #include <filesystem>
 #include <fstream>
 #include <gtest/gtest.h>
-#include <unistd.h>
+#include <sys/resource.h>
 
 namespace spectrel {
 namespace {
@@ -49,6 +50,44 @@ TEST_F(SnapshotTest, FileIsAPropertyListForItsOwnerAlone)
         "{\"Timestamp\": \"2024-03-05 14:07:31 +0000\", \"Data\": [\"entry\"], \"Description\": \"\"}");
     EXPECT_EQ(std::filesystem::status(path).permissions(),
         std::filesystem::perms::owner_read | std::filesystem::perms::owner_write);
+}
+
+TEST_F(SnapshotTest, TheSameSecondsFileIsOverwritten)
+{
+    const std::string path = snapshotPath(folder, Opened);
+    ASSERT_TRUE(writeSnapshot(makeSnapshot(Opened, List::make({std::string(5000, 'x')}), "long"), path, reason));
+    ASSERT_TRUE(writeSnapshot(makeSnapshot(Opened, List::make(), "short"), path, reason));
+    EXPECT_EQ(displayText(*readPropertyListFile(path)),
+        "{\"Timestamp\": \"2024-03-05 14:07:31 +0000\", \"Data\": [], \"Description\": \"short\"}");
+}
+
+TEST_F(SnapshotTest, AFullDeviceIsTold)
+{
+    std::filesystem::create_symlink("/dev/full", folder + "/s.spectrel");
+    EXPECT_FALSE(writeSnapshot(makeSnapshot(Opened, List::make(), ""), folder + "/s.spectrel", reason));
+    EXPECT_EQ(reason, "No space left on device");
+}
+
+TEST_F(SnapshotTest, WithoutRoomTheOlderSnapshotsStayAndNoHalfOneIsLeft)
+{
+    const std::string older = snapshotPath(folder, Opened);
+    ASSERT_TRUE(writeSnapshot(makeSnapshot(Opened, List::make(), "older"), older, reason));
+    const auto large = makeSnapshot(Opened, List::make({std::string(100'000, 'x')}), "");
+    rlimit before {};
+    ASSERT_EQ(::getrlimit(RLIMIT_FSIZE, &before), 0);
+    const auto handler = std::signal(SIGXFSZ, SIG_IGN);
+    const rlimit little {4096, before.rlim_max};
+    ASSERT_EQ(::setrlimit(RLIMIT_FSIZE, &little), 0);
+    const bool overOlder = writeSnapshot(large, older, reason);
+    const bool besideIt = writeSnapshot(large, folder + "/new.spectrel", reason);
+    ::setrlimit(RLIMIT_FSIZE, &before);
+    std::signal(SIGXFSZ, handler);
+    EXPECT_FALSE(overOlder);
+    EXPECT_FALSE(besideIt);
+    EXPECT_EQ(reason, "File too large");
+    EXPECT_FALSE(std::filesystem::exists(folder + "/new.spectrel"));
+    EXPECT_EQ(displayText(*readPropertyListFile(older)),
+        "{\"Timestamp\": \"2024-03-05 14:07:31 +0000\", \"Data\": [], \"Description\": \"older\"}");
 }
 
 TEST_F(SnapshotTest, DirectoryThatCannotBeMadeIsTold)

@@ -4,7 +4,7 @@ spectrel_library(spectrel_port_fixtures
         RawPeer.cpp RawPeer.h)
 
 spectrel_test(test_qt_platform
-    SOURCES FileLogTest.cpp QtClockTest.cpp QtPreferencesTest.cpp QtRunLoopTest.cpp TerminationSignalsTest.cpp
+    SOURCES DiagnosticFileTest.cpp FileLogTest.cpp QtClockTest.cpp QtPreferencesTest.cpp QtRunLoopTest.cpp TerminationSignalsTest.cpp
     USES spectrel_qt spectrel_syslog spectrel_port_fixtures Qt6::DBus)
 
 spectrel_test(test_message_ports

@@ -1,5 +1,6 @@
 #include "Platform/Qt/QtPreferences.h"
 #include "Platform/Qt/QtRunLoop.h"
+#include "Tests/Fakes/PrivateBus.h"
 #include "Tests/Fakes/ScratchFolder.h"
 
 #include <QDBusConnection>
@@ -69,36 +70,6 @@ TEST_F(QtPreferencesTest, WithoutASessionBusNobodyIsTold)
     preferences.postChanged("app", "key");
     EXPECT_FALSE(QDBusConnection("spectrel-preferences").isConnected());
 }
-
-/// A message bus of the test's own.
-class PrivateBus {
-public:
-    explicit PrivateBus(const std::string& folder)
-    {
-        const std::string command =
-            "dbus-daemon --session --fork --print-address=1 --print-pid=1 --address=unix:path=" + folder + "/bus";
-        std::FILE* const output = ::popen(command.c_str(), "r");
-        char line[512] = "";
-        if (std::fgets(line, sizeof line, output))
-            _address = std::string(line, std::char_traits<char>::length(line) - 1);
-        if (std::fgets(line, sizeof line, output))
-            _process = std::atoi(line);
-        ::pclose(output);
-    }
-    ~PrivateBus()
-    {
-        if (_process > 0)
-            ::kill(_process, SIGTERM);
-    }
-    const std::string& address() const
-    {
-        return _address;
-    }
-
-private:
-    std::string _address;
-    pid_t _process = 0;
-};
 
 TEST_F(QtPreferencesTest, ChangeIsAnnouncedOnTheSessionBus)
 {

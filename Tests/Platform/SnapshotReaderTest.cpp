@@ -119,6 +119,25 @@ TEST_F(SnapshotReaderTest, MessageOfUnknownTypeIsCutByItsOwnLength)
     EXPECT_EQ(readBuffer(unknown + good).messages, (Messages {unknown, good}));
 }
 
+TEST_F(SnapshotReaderTest, MessagesOfUnknownTypesInARowAreCutByTheirOwnLengths)
+{
+    const std::string two = record(0x1183, std::string(37, 'a'), '\x02');
+    const std::string three = record(0x119D, "bcd", '\x03');
+    const RecordingText text = readBuffer(two + two + three + two);
+    EXPECT_EQ(text.messages, (Messages {two, two, three, two}));
+    EXPECT_EQ(text.damage, "");
+}
+
+TEST_F(SnapshotReaderTest, ReportOfManyValuesIsOneMessage)
+{
+    const Value report = Dictionary::make({{"Cell", Dictionary::make({{"ARFCN", "12"}})},
+        {"Neighbours", List::make({"head", Dictionary::make({{"ARFCN", "14"}}), Value::integer(5)})}});
+    const RecordingText text = read(List::make({entry(report), Dictionary::make(), entry("one text")}));
+    ASSERT_EQ(text.messages.size(), 2u) << "and none of the empty entry";
+    EXPECT_EQ(text.messages[0], serialisePropertyList(report));
+    EXPECT_EQ(text.messages[1], serialisePropertyList("one text"));
+}
+
 TEST_F(SnapshotReaderTest, GarbageMessageBetweenOthersIsKept)
 {
     const std::string good = record(0xB0C2, "abcdef");

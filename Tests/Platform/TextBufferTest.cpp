@@ -72,6 +72,18 @@ TEST(TextBufferTest, NotANumberNeverHasASign)
     EXPECT_EQ(fixed2(-std::numeric_limits<double>::quiet_NaN()), " nan");
 }
 
+TEST(TextBufferTest, SixDecimalsAreAsPrintfMakesThem)
+{
+    using Limits = std::numeric_limits<double>;
+    for (const double number : {0.0, -0.0, -7.5, 63.5, 1.0 / 256, 2.0 / 3, Limits::max(), Limits::lowest(),
+             Limits::denorm_min(), Limits::infinity(), -Limits::infinity()}) {
+        char text[400];
+        std::snprintf(text, sizeof text, "%f", number);
+        EXPECT_EQ(TextBuffer().fixed6(number).view(), text);
+    }
+    EXPECT_EQ(TextBuffer().fixed6(-Limits::quiet_NaN()).view(), "nan");
+}
+
 TEST(TextBufferTest, PiecesFollowEachOtherUntilCleared)
 {
     TextBuffer buffer;

@@ -39,6 +39,17 @@ TEST(JourneyTest, RoadIsARing)
     }
 }
 
+TEST(JourneyTest, PlacesAreAheadOrBehindByTheShorterWay)
+{
+    Dice dice(3);
+    const Journey journey(Scene::Still, RingLength, dice);
+    const double here = std::fmod(RingLength - journey.ahead(0), RingLength);
+    EXPECT_NEAR(journey.ahead(here), 0, 1e-9);
+    EXPECT_NEAR(journey.ahead(here + 100), 100, 1e-9);
+    EXPECT_NEAR(journey.ahead(here + RingLength - 100), -100, 1e-9);
+    EXPECT_NEAR(std::fabs(journey.ahead(1234)), journey.distanceTo(1234, 0), 1e-9);
+}
+
 TEST(SceneTest, NamesAreThoseOfTheCommandLine)
 {
     Scene scene = Scene::Drive;

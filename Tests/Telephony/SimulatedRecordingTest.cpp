@@ -34,6 +34,15 @@ TEST_F(SimulatedRecordingTest, SameOptionsGiveTheSameBytes)
     EXPECT_NE(first, write(Technology::LTE, Scene::Walk, 7, 30s));
 }
 
+TEST_F(SimulatedRecordingTest, SameOptionsGiveTheSameBytesForUTRANToo)
+{
+    const std::string first = write(Technology::UTRAN, Scene::Drive, 7, 30s);
+    EXPECT_EQ(first, write(Technology::UTRAN, Scene::Drive, 7, 30s));
+    EXPECT_NE(first, write(Technology::UTRAN, Scene::Drive, 8, 30s));
+    EXPECT_NE(first, write(Technology::UTRAN, Scene::Still, 7, 30s));
+    EXPECT_GT(write(Technology::UTRAN, Scene::Stress, 7, 10s).size(), first.size());
+}
+
 TEST_F(SimulatedRecordingTest, ItCoversItsDurationFromTheFixedStart)
 {
     write(Technology::LTE, Scene::Drive, 1, 60s);

@@ -232,14 +232,6 @@ TEST_F(TelephonyServiceTest, SourceThatIsNotReadyHasNoChannels)
     EXPECT_EQ((*ask("org.spectrel.Telephony", 1, wish).dictionary())["Error"].int32(), 0);
 }
 
-TEST_F(TelephonyServiceTest, ChangeOfTheTechnologyEndsTheChannels)
-{
-    start(openChannel(), codes({0xB0C2}), nullptr);
-    source.technologyHandler();
-    EXPECT_EQ(service.channels(), 0u);
-    EXPECT_EQ(source.streams, 0);
-}
-
 TEST_F(TelephonyServiceTest, StatusTellsWhatIsStreamedToWhom)
 {
     StatusReport report(loop, service, source);
@@ -269,6 +261,17 @@ TEST_F(TelephonyServiceTest, ComingAndGoingOfChannelsIsAChange)
     EXPECT_EQ(changes, 2);
 }
 
+TEST_F(TelephonyServiceTest, ChangeOfTechnologyEndsAllChannelsAndTheServiceStays)
+{
+    start(openChannel(), nullptr, nullptr);
+    openChannel("other");
+    source.technologyHandler();
+    EXPECT_EQ(service.channels(), 0u);
+    EXPECT_EQ(source.streams, 0);
+    EXPECT_EQ(ports.localPorts(), 1u) << "the service's own";
+    EXPECT_EQ(openChannel(), "org.spectrel.Telephony.LogChannel.3");
+}
+
 TEST_F(TelephonyServiceTest, SecondServiceIsRefused)
 {
     TelephonyService second(loop, ports, source);
@@ -294,10 +297,10 @@ TEST_F(SimulatorSourceTest, RecordsComeSteadily)
 {
     const auto stream = source.start(collector);
     collector.messages.clear();
-    loop.advance(20s);
-    EXPECT_EQ(collector.count(0x01, 0xC2), 50u);
-    EXPECT_EQ(collector.count(0x01, 0xC1), 25u);
-    EXPECT_EQ(collector.count(0xFF, 1), 10u);
+    loop.advance(60s);
+    EXPECT_EQ(collector.count(0x01, 0xC2), 150u);
+    EXPECT_EQ(collector.count(0x01, 0xC1), 75u);
+    EXPECT_EQ(collector.count(0xFF, 1), 12u);
     EXPECT_EQ(collector.count(0xFF, 0), 2u);
 }
 

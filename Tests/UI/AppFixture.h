@@ -69,6 +69,7 @@ protected:
                 observer = &given;
                 auto made = std::make_unique<FakeModel>();
                 model = made.get();
+                model->playing = playing;
                 return made;
             },
             [this](const DictionaryRef& snapshot, const std::string& path, std::string& reason) {
@@ -76,7 +77,7 @@ protected:
                 reason = canWrite ? "" : "no room";
                 return canWrite;
             },
-            "/crash"});
+            "/crash", offersSaving});
     }
     void launch()
     {
@@ -161,6 +162,8 @@ protected:
     SpectrelModelObserver* observer = nullptr;
     std::vector<WrittenSnapshot> written;
     bool canWrite = true;
+    bool offersSaving = true;
+    Playback* playing = nullptr; // of the model to be made
     std::unique_ptr<SpectrelApp> app;
 };
 

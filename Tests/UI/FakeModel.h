@@ -43,6 +43,11 @@ public:
         return saveContents;
     }
 
+    Playback* playback() override
+    {
+        return playing;
+    }
+
     void setDisplay(const Value& display)
     {
         index.clear();
@@ -54,6 +59,7 @@ public:
     int restarts = 0;
     int saveRequests = 0;
     ListRef saveContents;
+    Playback* playing = nullptr; // set while it is made
     NodeRef root;
     PathIndex index;
     std::function<void()> onEnd;

@@ -1,5 +1,7 @@
 #include "UI/Terminal/CursesTerminal.h"
 
+#include "Platform/Base64.h"
+
 #include <algorithm>
 #include <array>
 #include <clocale>
@@ -44,9 +46,9 @@ std::string capability(const char* name)
 /// What stands for a character on a terminal that has only ASCII.
 char32_t inASCII(char32_t character)
 {
-    constexpr std::array<std::pair<char32_t, char32_t>, 12> Likenesses {
+    constexpr std::array<std::pair<char32_t, char32_t>, 15> Likenesses {
         {{U'‹', U'<'}, {U'›', U'>'}, {U'…', U'~'}, {U'✓', U'x'}, {U'─', U'-'}, {U'│', U'|'}, {U'┌', U'+'}, {U'┐', U'+'},
-            {U'└', U'+'}, {U'┘', U'+'}, {U'°', U'o'}, {U'–', U'-'}}};
+            {U'└', U'+'}, {U'┘', U'+'}, {U'°', U'o'}, {U'–', U'-'}, {U'━', U'='}, {U'▶', U'>'}, {U'‖', U'|'}}};
     if (character < 0x7F)
         return character;
     const auto found =
@@ -147,6 +149,16 @@ void CursesTerminal::updateSize()
     winsize size {};
     if (::ioctl(STDOUT_FILENO, TIOCGWINSZ, &size) == 0 && size.ws_row > 0 && size.ws_col > 0)
         ::resizeterm(size.ws_row, size.ws_col);
+}
+
+void CursesTerminal::copy(const std::string& text) const
+{
+    // The library has written out all of its own at the end of the last drawing.
+    std::string sequence = "\033]52;c;";
+    appendBase64(sequence, {reinterpret_cast<const std::uint8_t*>(text.data()), text.size()});
+    sequence += '\a';
+    std::fwrite(sequence.data(), 1, sequence.size(), stdout);
+    std::fflush(stdout);
 }
 
 void CursesTerminal::forgetShown()

@@ -28,6 +28,10 @@ public:
     /// Takes on the terminal's present size.
     void updateSize();
     void show(const Grid& grid);
+    /// Puts the text on the terminal's clipboard (OSC 52), where the terminal allows that; none answers whether it did.
+    /// Inside tmux the sequence is for tmux, which keeps a buffer and hands it on when its set-clipboard is "on"; the
+    /// passthrough to the terminal outside is not used, as it is off by default and would leave tmux's buffers out.
+    void copy(const std::string& text) const;
     /// Shows every cell again at the next `show`, whatever the terminal was thought to hold.
     void forgetShown();
     /// Hands out what can be read now, without waiting; false when the terminal is gone.

@@ -23,16 +23,20 @@ constexpr std::array FunctionKeys {
     std::pair(static_cast<unsigned>(KEY_END), Key::End),
     std::pair(static_cast<unsigned>(KEY_ENTER), Key::Enter),
     std::pair(static_cast<unsigned>(KEY_BACKSPACE), Key::Backspace),
+    std::pair(static_cast<unsigned>(KEY_DC), Key::Delete),
     std::pair(static_cast<unsigned>(KEY_BTAB), Key::BackTab),
 };
 
 constexpr std::array ControlCharacters {
+    std::pair(0x01U, Key::Home),
+    std::pair(0x05U, Key::End),
     std::pair(0x08U, Key::Backspace),
     std::pair(0x09U, Key::Tab),
     std::pair(0x0AU, Key::Enter),
     std::pair(0x0CU, Key::Redraw),
     std::pair(0x0DU, Key::Enter),
     std::pair(0x15U, Key::ClearLine),
+    std::pair(0x17U, Key::EraseWord),
     std::pair(0x7FU, Key::Backspace),
 };
 

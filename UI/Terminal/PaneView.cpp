@@ -27,6 +27,10 @@ constexpr int WheelStep = 3; // rows
 /// Finds the cursor's row again after a reload and keeps it, and as many rows as there are, in sight.
 void PaneView::settle(SpectrelPaneController& pane, int rows)
 {
+    if (const auto shown = pane.tableView().takeRowToShow()) {
+        _cursor = *shown;
+        _cursorName.clear();
+    }
     follow(pane);
     const std::size_t count = pane.numberOfRows();
     const auto room = static_cast<std::size_t>(std::max(rows, 1));
@@ -52,6 +56,15 @@ void PaneView::follow(SpectrelPaneController& pane)
             return;
         }
     }
+}
+
+std::optional<std::size_t> PaneView::cursorRow(int height)
+{
+    const auto pane = _pane.lock();
+    if (!pane)
+        return std::nullopt;
+    settle(*pane, Layout(height).rows);
+    return _cursor < pane->numberOfRows() ? std::optional(_cursor) : std::nullopt;
 }
 
 void PaneView::moveTo(SpectrelPaneController& pane, std::size_t row, int rows)
@@ -188,17 +201,17 @@ void PaneView::pressSaveButton(SpectrelPaneController& pane)
 
 // ---- Drawing
 
-void PaneView::draw(Grid& grid, bool isRoot, char spinner)
+void PaneView::draw(Grid& grid, const Surroundings& around)
 {
     const auto pane = _pane.lock();
     if (!pane)
         return;
-    const Layout layout(grid.height());
+    const Layout layout(around.height);
     settle(*pane, layout.rows);
     pane->tableView().setVisibleRows(_top, static_cast<std::size_t>(std::max(layout.rows, 0)),
         {0, 0, grid.width() * TerminalMetrics::Column, TerminalMetrics::Line});
     if (layout.hasTitle)
-        drawTitle(grid, *pane, isRoot);
+        drawTitle(grid, *pane, around.isRoot);
     for (int line = 0; line < layout.rows; ++line) {
         const std::size_t row = _top + static_cast<std::size_t>(line);
         const SpectrelCell* cell = pane->cellAtRow(row);
@@ -209,7 +222,7 @@ void PaneView::draw(Grid& grid, bool isRoot, char spinner)
             grid.reverse(layout.firstRow() + line, {0, grid.width()});
     }
     if (layout.hasToolbar)
-        drawToolbar(grid, *pane, spinner);
+        drawToolbar(grid, *pane, around);
 }
 
 void PaneView::drawTitle(Grid& grid, const SpectrelPaneController& pane, bool isRoot) const
@@ -244,9 +257,9 @@ void PaneView::drawRow(Grid& grid, int y, const SpectrelCell& cell) const
         grid.put(width - 1, y, MoreMark, FaintStyle);
 }
 
-void PaneView::drawToolbar(Grid& grid, const SpectrelPaneController& pane, char spinner)
+void PaneView::drawToolbar(Grid& grid, const SpectrelPaneController& pane, const Surroundings& around)
 {
-    const int y = grid.height() - 1;
+    const int y = around.height - 1;
     _saveButton = {};
     int right = grid.width();
     const auto& items = pane.toolbarItems();
@@ -263,7 +276,7 @@ void PaneView::drawToolbar(Grid& grid, const SpectrelPaneController& pane, char 
     bool isFirst = true;
     for (const ToolbarItem& item : items) {
         if (item.kind == ToolbarItem::Kind::LoadingIndicator && item.isSpinning) {
-            grid.put(x, y, std::string_view(&spinner, 1), Style {.tint = Tint::Accent}, {0, right});
+            grid.put(x, y, std::string_view(&around.spinner, 1), Style {.tint = Tint::Accent}, {0, right});
             x += 2;
         } else if (item.kind == ToolbarItem::Kind::Label) {
             const Style style = isFirst ? Style {} : Style {.tint = Tint::Warning};
@@ -271,6 +284,7 @@ void PaneView::drawToolbar(Grid& grid, const SpectrelPaneController& pane, char 
             isFirst = false;
         }
     }
+    grid.put(x, y, around.notice, Style {.tint = Tint::Warning}, {0, right});
 }
 
 } // namespace spectrel

@@ -7,7 +7,9 @@
 
 #include <cstddef>
 #include <memory>
+#include <optional>
 #include <string>
+#include <string_view>
 
 namespace spectrel {
 
@@ -34,8 +36,17 @@ public:
         return _pane.lock() == pane;
     }
 
-    void draw(Grid& grid, bool isRoot, char spinner);
-    /// `height` is the screen's.
+    /// What a drawing takes from around the pane.
+    struct Surroundings {
+        int height = 0; // the first lines of the screen are the pane's
+        bool isRoot = false;
+        char spinner = ' ';
+        std::string_view notice; // behind the status; may be empty
+    };
+    void draw(Grid& grid, const Surroundings& around);
+    /// The row under the cursor; absent in an empty pane.
+    std::optional<std::size_t> cursorRow(int height);
+    /// `height` is as in `Surroundings`.
     void handle(const KeyEvent& event, int height, NavigationController& navigation);
     void handle(const MouseEvent& event, int height, NavigationController& navigation);
     /// Presses the toolbar's save button, where there is one.
@@ -67,7 +78,7 @@ private:
     bool scrollSideways(SpectrelPaneController& pane, double columns) const;
     void drawTitle(Grid& grid, const SpectrelPaneController& pane, bool isRoot) const;
     void drawRow(Grid& grid, int y, const SpectrelCell& cell) const;
-    void drawToolbar(Grid& grid, const SpectrelPaneController& pane, char spinner);
+    void drawToolbar(Grid& grid, const SpectrelPaneController& pane, const Surroundings& around);
 
     std::weak_ptr<SpectrelPaneController> _pane;
     std::size_t _cursor = 0;

@@ -57,16 +57,8 @@ void SaveView::press(SpectrelSaveViewController& controller) const
 void SaveView::edit(const KeyEvent& event, SpectrelSaveViewController& controller)
 {
     std::string text = controller.saveDescription()->text.value_or("");
-    if (event.key == Key::Backspace) {
-        text = withoutLastGlyph(text);
-    } else if (event.key == Key::ClearLine) {
-        text.clear();
-    } else if (event.key == Key::Character && text.size() + 4 <= MaximumDescription) {
-        appendUTF8(text, event.character);
-    } else {
-        return;
-    }
-    controller.setDescriptionText(std::move(text));
+    if (_editor.handle(event, text, MaximumDescription))
+        controller.setDescriptionText(std::move(text));
 }
 
 void SaveView::scroll(std::ptrdiff_t by, int lines, const SpectrelSaveViewController& controller)
@@ -106,6 +98,8 @@ void SaveView::handle(const KeyEvent& event, int height, SpectrelSaveViewControl
     case Key::Right:
         if (_focus == Focus::Save || _focus == Focus::Cancel)
             _focus = event.key == Key::Left ? Focus::Save : Focus::Cancel;
+        else if (_focus == Focus::Description)
+            edit(event, controller);
         return;
     case Key::Enter:
         if (_focus == Focus::Description) {
@@ -142,14 +136,9 @@ void SaveView::handle(const MouseEvent& event, int height, SpectrelSaveViewContr
 
 void SaveView::drawDescription(Grid& grid, int y, const SpectrelSaveViewController& controller) const
 {
-    const bool isEditing = controller.saveDescription()->isFirstResponder;
-    const std::string text = controller.saveDescription()->text.value_or("");
     const int start = grid.put(0, y, DescriptionLabel, Style {.isBold = true});
-    const int room = grid.width() - start - 1;
-    // The end of the text, where it is typed, stays in sight.
-    const int end = grid.put(start + std::min(0, room - columnsOf(text)), y, text, Style {}, {start, grid.width()});
-    if (isEditing)
-        grid.reverse(y, {end, end + 1});
+    _editor.draw(grid, y, {start, grid.width()}, controller.saveDescription()->text.value_or(""),
+        controller.saveDescription()->isFirstResponder);
 }
 
 void SaveView::drawEntries(Grid& grid, const Layout& layout, SpectrelSaveViewController& controller) const

@@ -2,6 +2,7 @@
 
 #include "UI/SpectrelSaveViewController.h"
 #include "UI/Terminal/Grid.h"
+#include "UI/Terminal/LineEditor.h"
 #include "UI/Terminal/TerminalInput.h"
 
 #include <cstddef>
@@ -40,6 +41,7 @@ private:
     void drawDescription(Grid& grid, int y, const SpectrelSaveViewController& controller) const;
 
     Focus _focus = Focus::Description;
+    LineEditor _editor;
     std::size_t _top = 0; // the first entry in sight
 };
 

@@ -20,7 +20,8 @@ constexpr std::chrono::milliseconds SpinnerInterval {150};
 class TerminalFrontEnd::Screens {
 public:
     explicit Screens(TerminalFrontEnd& frontEnd)
-        : screen([&frontEnd] { frontEnd.needsDisplay(); }, [&frontEnd] { frontEnd.quit(); })
+        : screen({[&frontEnd] { frontEnd.needsDisplay(); }, [&frontEnd] { frontEnd.quit(); },
+            [&frontEnd](const std::string& text) { frontEnd.copy(text); }})
     {
     }
     TerminalScreen screen;
@@ -40,6 +41,11 @@ public:
         QObject::connect(&_input, &QSocketNotifier::activated, &_input, [this] { readInput(); });
         QObject::connect(&_signalled, &QSocketNotifier::activated, &_signalled, [this] { takeSignals(); });
         _screen.resize(_terminal->width(), _terminal->height());
+    }
+
+    void copy(const std::string& text)
+    {
+        _terminal->copy(text);
     }
 
     void draw()
@@ -145,6 +151,12 @@ void TerminalFrontEnd::quit() const
 {
     if (onQuit)
         onQuit();
+}
+
+void TerminalFrontEnd::copy(const std::string& text)
+{
+    if (_session)
+        _session->copy(text);
 }
 
 /// Draws once the current job has ended, however often it was asked for.

@@ -46,6 +46,7 @@ public:
 private:
     class Session;
     void quit() const;
+    void copy(const std::string& text);
     void needsDisplay();
 
     RunLoop& _runLoop;

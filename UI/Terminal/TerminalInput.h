@@ -14,14 +14,16 @@ enum class Key {
     ShiftRight,
     PageUp,
     PageDown,
-    Home,
-    End,
+    Home, // also Control-A
+    End, // also Control-E
     Enter,
     Backspace,
+    Delete,
     Escape,
     Tab,
     BackTab,
     ClearLine, // Control-U
+    EraseWord, // Control-W
     Redraw, // Control-L
 };
 

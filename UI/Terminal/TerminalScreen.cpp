@@ -1,6 +1,7 @@
 #include "UI/Terminal/TerminalScreen.h"
 
 #include "UI/SpectrelApp.h"
+#include "UI/Terminal/Box.h"
 
 #include <algorithm>
 #include <string>
@@ -13,23 +14,7 @@ namespace {
 
 constexpr std::string_view SpinnerFrames = "|/-\\";
 
-const std::vector<std::string>& helpLines()
-{
-    static const std::vector<std::string> lines {
-        "Keys",
-        "",
-        "Up Down  j k      move",
-        "PgUp PgDn         move a page",
-        "Home End          first, last row",
-        "Enter Right       open",
-        "Backspace Left    back (also Esc)",
-        "Right  h l        scroll a long value",
-        "s                 save a snapshot, if allowed",
-        "Control-L         draw again",
-        "q                 quit",
-    };
-    return lines;
-}
+constexpr int SmallestWithPlayback = 4; // lines
 
 SpectrelApp* shownApplication()
 {
@@ -39,9 +24,8 @@ SpectrelApp* shownApplication()
 
 } // namespace
 
-TerminalScreen::TerminalScreen(std::function<void()> needsDisplay, std::function<void()> quit)
-    : _needsDisplay(std::move(needsDisplay))
-    , _quit(std::move(quit))
+TerminalScreen::TerminalScreen(Terminal terminal)
+    : _terminal(std::move(terminal))
 {
 }
 
@@ -63,19 +47,29 @@ void TerminalScreen::screenDidChange(ScreenPart part, Animation)
         if (app && app->saveViewController())
             app->saveViewController()->beginEditing(); // a keyboard is at hand: typing goes into the description
     }
-    _needsDisplay();
+    _terminal.needsDisplay();
 }
 
 void TerminalScreen::showAlert(const Alert& alert)
 {
     _alerts.push_back(alert);
-    _needsDisplay();
+    _terminal.needsDisplay();
+}
+
+bool TerminalScreen::copyToClipboard(const std::string& text, std::string& reason)
+{
+    if (text.size() > MaximumCopy) {
+        reason = std::to_string(text.size()) + " bytes are too many for a terminal";
+        return false;
+    }
+    _terminal.copy(text);
+    return true;
 }
 
 void TerminalScreen::resize(int width, int height)
 {
     _grid.resize(width, height);
-    _needsDisplay();
+    _terminal.needsDisplay();
 }
 
 // ---- Input
@@ -95,58 +89,119 @@ PaneView* TerminalScreen::topView(SpectrelApp& app)
     return &_panes.back();
 }
 
-bool TerminalScreen::closesOverlay()
+/// The alert or the help takes what comes while it is in sight.
+bool TerminalScreen::coverTakes(const KeyEvent& event)
 {
     if (!_alerts.empty()) {
         _alerts.pop_front();
         return true;
     }
-    return std::exchange(_showsHelp, false);
+    if (!_help.isOpen())
+        return false;
+    _help.handle(event, _grid.height());
+    return true;
 }
 
-bool TerminalScreen::handleGlobalKey(SpectrelApp& app, const KeyEvent& event)
+bool TerminalScreen::coverTakes(const MouseEvent& event)
+{
+    if (!_alerts.empty()) {
+        if (event.action == MouseEvent::Action::Press) // a turn of the wheel presses nothing
+            _alerts.pop_front();
+        return true;
+    }
+    if (!_help.isOpen())
+        return false;
+    _help.handle(event, _grid.height());
+    return true;
+}
+
+bool TerminalScreen::handleGlobally(SpectrelApp& app, PaneView& view, const KeyEvent& event)
 {
     if (event.key != Key::Character)
         return false;
+    const SpectrelPaneController& pane = *app.navController()->topViewController();
     switch (event.character) {
     case U'q':
-        _quit();
+        _terminal.quit();
         return true;
     case U'?':
-        _showsHelp = true;
+        _help.open(app.playback() != nullptr);
         return true;
     case U's':
         PaneView::pressSaveButton(*app.navController()->topViewController());
         return true;
+    case U'/':
+        app.find()->open();
+        return true;
+    case U'n':
+        app.find()->chooseNext();
+        return true;
+    case U'N':
+        app.find()->choosePrevious();
+        return true;
+    case U'y':
+        if (const auto row = view.cursorRow(paneHeight(app)))
+            app.copying()->copyRow(pane, *row);
+        return true;
+    case U'Y':
+        app.copying()->copyPane(pane);
+        return true;
     default:
-        return false;
+        return app.playback() && PlaybackView::handle(event, *app.playback());
     }
+}
+
+bool TerminalScreen::handleGlobally(SpectrelApp& app, PaneView&, const MouseEvent& event)
+{
+    if (event.y < paneHeight(app))
+        return false;
+    if (event.action == MouseEvent::Action::Press && app.playback())
+        _playbackView.press(event.x, *app.playback());
+    return true;
 }
 
 template <typename Event> void TerminalScreen::dispatch(const Event& event)
 {
-    if (closesOverlay())
+    if (coverTakes(event))
         return;
     SpectrelApp* app = shownApplication();
     PaneView* view = app ? topView(*app) : nullptr;
     if (!view)
         return;
+    app->copying()->clearMessage();
     if (app->saveViewController())
         _saveView.handle(event, _grid.height(), *app->saveViewController());
-    else if (!handleGlobalKey(*app, event))
-        view->handle(event, _grid.height(), *app->navController());
+    else if (app->find()->isOpen())
+        _findView.handle(event, _grid.height(), *app->find());
+    else if (!handleGlobally(*app, *view, event))
+        view->handle(event, paneHeight(*app), *app->navController());
 }
 
 void TerminalScreen::handle(const InputEvent& event)
 {
-    if (const auto* mouse = std::get_if<MouseEvent>(&event);
-        mouse && mouse->action != MouseEvent::Action::Press && (_showsHelp || !_alerts.empty()))
-        return; // a turn of the wheel presses nothing
     std::visit([this](const auto& given) { dispatch(given); }, event);
-    _needsDisplay();
+    _terminal.needsDisplay();
 }
 
 // ---- Drawing
+
+/// The lines of the pane; the one below them is the playback's, where there is one.
+int TerminalScreen::paneHeight(const SpectrelApp& app) const
+{
+    const bool showsPlayback = app.playback() && _grid.height() >= SmallestWithPlayback;
+    return _grid.height() - (showsPlayback ? 1 : 0);
+}
+
+void TerminalScreen::drawPane(SpectrelApp& app, PaneView& view)
+{
+    PaneView::Surroundings around {
+        paneHeight(app), _panes.size() == 1, SpinnerFrames[_spinner % SpinnerFrames.size()], app.copying()->message()};
+    if (app.playback() && around.notice.empty())
+        around.notice = app.playback()->notice();
+    view.draw(_grid, around);
+    if (around.height < _grid.height())
+        _playbackView.draw(_grid, around.height, *app.playback());
+}
 
 const Grid& TerminalScreen::draw()
 {
@@ -157,45 +212,23 @@ const Grid& TerminalScreen::draw()
         return _grid;
     if (app->saveViewController())
         _saveView.draw(_grid, *app->saveViewController());
+    else if (app->find()->isOpen())
+        _findView.draw(_grid, *app->find());
     else
-        view->draw(_grid, _panes.size() == 1, SpinnerFrames[_spinner % SpinnerFrames.size()]);
+        drawPane(*app, *view);
     if (!_alerts.empty()) {
         const Alert& alert = _alerts.front();
-        drawBox({alert.title, "", alert.message, "", "[" + alert.button + "]"}, 0);
-    } else if (_showsHelp) {
-        drawBox(helpLines(), 0);
+        drawBox(_grid, {alert.title, "", alert.message, "", "[" + alert.button + "]"}, 0);
+    } else if (_help.isOpen()) {
+        _help.draw(_grid);
     }
     return _grid;
-}
-
-/// A framed box in the middle, over what is there.
-void TerminalScreen::drawBox(const std::vector<std::string>& lines, std::size_t boldLine)
-{
-    int inner = 0;
-    for (const std::string& line : lines)
-        inner = std::max(inner, columnsOf(line));
-    const int width = std::min(inner + 4, _grid.width());
-    const int height = static_cast<int>(lines.size()) + 2;
-    const int left = (_grid.width() - width) / 2;
-    const int top = std::max(0, (_grid.height() - height) / 2);
-    std::string bar;
-    for (int column = 0; column < width - 2; ++column)
-        bar += "─";
-    _grid.put(left, top, "┌" + bar + "┐", Style {});
-    for (std::size_t index = 0; index < lines.size(); ++index) {
-        const int y = top + 1 + static_cast<int>(index);
-        _grid.fill(y, {left, left + width}, Style {});
-        _grid.put(left, y, "│", Style {});
-        _grid.put(left + 2, y, lines[index], Style {.isBold = index == boldLine}, {left, left + width - 1});
-        _grid.put(left + width - 1, y, "│", Style {});
-    }
-    _grid.put(left, top + height - 1, "└" + bar + "┘", Style {});
 }
 
 bool TerminalScreen::isAnimating() const
 {
     const SpectrelApp* app = shownApplication();
-    if (!app || !app->navController() || app->saveViewController() || _grid.height() < 3)
+    if (!app || !app->navController() || app->saveViewController() || app->find()->isOpen() || paneHeight(*app) < 3)
         return false;
     return std::ranges::any_of(app->navController()->topViewController()->toolbarItems(),
         [](const ToolbarItem& item) { return item.kind == ToolbarItem::Kind::LoadingIndicator && item.isSpinning; });
@@ -204,7 +237,7 @@ bool TerminalScreen::isAnimating() const
 void TerminalScreen::advanceSpinner()
 {
     ++_spinner;
-    _needsDisplay();
+    _terminal.needsDisplay();
 }
 
 } // namespace spectrel

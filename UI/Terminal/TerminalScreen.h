@@ -1,13 +1,18 @@
 #pragma once
 
 #include "Platform/ScreenToolkit.h"
+#include "UI/Terminal/FindView.h"
 #include "UI/Terminal/Grid.h"
+#include "UI/Terminal/HelpView.h"
 #include "UI/Terminal/PaneView.h"
+#include "UI/Terminal/PlaybackView.h"
 #include "UI/Terminal/SaveView.h"
 #include "UI/Terminal/TerminalInput.h"
 
+#include <cstddef>
 #include <deque>
 #include <functional>
+#include <string>
 #include <vector>
 
 namespace spectrel {
@@ -15,17 +20,27 @@ namespace spectrel {
 class SpectrelApp;
 
 /// Everything of the terminal front end but the terminal: draws the shared application's screens into a grid and
-/// hands input to the controllers. An alert covers the help, the help the save screen, and that the panes.
+/// hands input to the controllers. An alert covers the help, the help the save screen or the search, and those the
+/// panes.
 class TerminalScreen final : public ScreenToolkit {
 public:
-    /// `needsDisplay` is called whenever something may have to be drawn again; `quit` when the user wants to leave.
-    TerminalScreen(std::function<void()> needsDisplay, std::function<void()> quit);
+    /// The most that is copied: longer texts do not pass through every terminal.
+    static constexpr std::size_t MaximumCopy = 74'994; // bytes; 100,000 characters on their way
+
+    /// What the screens ask of the terminal's side.
+    struct Terminal {
+        std::function<void()> needsDisplay; // something may have to be drawn again
+        std::function<void()> quit; // the user wants to leave
+        std::function<void(const std::string&)> copy; // to the terminal's clipboard
+    };
+    explicit TerminalScreen(Terminal terminal);
 
     // For the controllers.
     Size sizeOfText(std::string_view text, const Font& font) const override;
     Size mainScreenSize() const override;
     void screenDidChange(ScreenPart part, Animation animation) override;
     void showAlert(const Alert& alert) override;
+    bool copyToClipboard(const std::string& text, std::string& reason) override;
 
     // For the terminal.
     void resize(int width, int height);
@@ -38,21 +53,21 @@ public:
 private:
     PaneView* topView(SpectrelApp& app);
     template <typename Event> void dispatch(const Event& event);
-    bool closesOverlay();
-    bool handleGlobalKey(SpectrelApp& app, const KeyEvent& event);
-    bool handleGlobalKey(SpectrelApp&, const MouseEvent&)
-    {
-        return false;
-    }
-    void drawBox(const std::vector<std::string>& lines, std::size_t boldLine);
+    bool coverTakes(const KeyEvent& event);
+    bool coverTakes(const MouseEvent& event);
+    bool handleGlobally(SpectrelApp& app, PaneView& view, const KeyEvent& event);
+    bool handleGlobally(SpectrelApp& app, PaneView& view, const MouseEvent& event);
+    int paneHeight(const SpectrelApp& app) const;
+    void drawPane(SpectrelApp& app, PaneView& view);
 
-    std::function<void()> _needsDisplay;
-    std::function<void()> _quit;
+    Terminal _terminal;
     Grid _grid;
     std::vector<PaneView> _panes; // beside the stack of panes, bottom first
     SaveView _saveView;
+    FindView _findView;
+    PlaybackView _playbackView;
+    HelpView _help;
     std::deque<Alert> _alerts;
-    bool _showsHelp = false;
     std::size_t _spinner = 0;
 };
 

@@ -152,16 +152,4 @@ void appendUTF8(std::string& text, char32_t character)
     append(0x80 | (character & 0x3F));
 }
 
-std::string withoutLastGlyph(std::string_view text)
-{
-    std::size_t kept = 0;
-    std::string_view rest = text;
-    while (const auto glyph = takeGlyph(rest)) {
-        if (rest.empty())
-            break;
-        kept += glyph->bytes;
-    }
-    return std::string(text.substr(0, kept));
-}
-
 } // namespace spectrel

@@ -28,7 +28,4 @@ int columnsOf(std::string_view text);
 /// One character as UTF-8; U+FFFD for what is none.
 void appendUTF8(std::string& text, char32_t character);
 
-/// The text without its last glyph.
-std::string withoutLastGlyph(std::string_view text);
-
 } // namespace spectrel

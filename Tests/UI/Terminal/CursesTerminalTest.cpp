@@ -102,6 +102,14 @@ TEST(CursesTerminalTest, StandardErrorIsHeldUntilTheScreenIsLeft)
     EXPECT_EQ(outcome.output.find("a held line"), outcome.output.rfind("a held line"));
 }
 
+TEST(CursesTerminalTest, CopyingSendsTheTextToTheTerminalsClipboard)
+{
+    const Outcome outcome = runOnTerminal("xterm-256color", [] { showText("hello")->copy("20 MHz\n"); });
+    const auto sent = outcome.output.find("\033]52;c;MjAgTUh6Cg==\a");
+    ASSERT_NE(sent, std::string::npos);
+    EXPECT_GT(sent, outcome.output.find("hello"));
+}
+
 TEST(CursesTerminalTest, ColoursAreLeftOutWhenNotWanted)
 {
     const auto show = [] { showText("text"); };

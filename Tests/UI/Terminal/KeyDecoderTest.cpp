@@ -45,6 +45,13 @@ TEST_F(KeyDecoderTest, CharactersComeAsTheyAre)
             {Key::Backspace}, {Key::ClearLine}, {Key::Redraw}}));
 }
 
+TEST_F(KeyDecoderTest, ALineIsEditedWithTheUsualKeys)
+{
+    key(KEY_DC);
+    characters(U"\x01\x05\x17");
+    EXPECT_EQ(events, (std::vector<KeyEvent> {{Key::Delete}, {Key::Home}, {Key::End}, {Key::EraseWord}}));
+}
+
 TEST_F(KeyDecoderTest, EscapeIsAKeyWhenNothingFollows)
 {
     characters(U"\x1b");

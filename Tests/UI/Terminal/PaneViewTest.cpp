@@ -351,16 +351,40 @@ TEST_F(PaneViewTest, AClickOnTheSaveButtonOpensTheSaveScreen)
     EXPECT_NE(app->saveViewController(), nullptr);
 }
 
-TEST_F(PaneViewTest, QuestionMarkShowsTheKeysAndAnyKeyHidesThem)
+TEST_F(PaneViewTest, YCopiesTheRowUnderTheCursorAndCapitalYThePane)
 {
     start();
-    show(entries({{"A", entries({})}}));
-    screen.resize(60, 15);
-    type(U"?");
-    EXPECT_THAT(text(), testing::HasSubstr("Enter Right       open"));
-    press(Key::Enter);
-    EXPECT_THAT(text(), testing::Not(testing::HasSubstr("Enter Right       open")));
-    EXPECT_EQ(openPaths(), "/ ");
+    show(entries({{"Cell", entries({{"ID", "248"}})}, {"State", "Idle"}}));
+    press(Key::Down);
+    type(U"y");
+    EXPECT_EQ(clipboard, "Idle");
+    EXPECT_THAT(line(6), testing::HasSubstr("Copied"));
+    type(U"Y");
+    EXPECT_EQ(clipboard, "Cell\n  ID: 248\nState: Idle\n");
+    press(Key::Up);
+    EXPECT_THAT(line(6), testing::Not(testing::HasSubstr("Copied"))) << "the next key takes the message away";
+}
+
+TEST_F(PaneViewTest, WhatIsTooLongForATerminalIsNotCopied)
+{
+    start();
+    show(entries({{"Long", std::string(TerminalScreen::MaximumCopy + 1, 'x')}}));
+    screen.resize(100, 7);
+    type(U"y");
+    EXPECT_EQ(clipboard, "");
+    EXPECT_THAT(line(6), testing::HasSubstr("Not copied: 74995 bytes are too many for a terminal"));
+    show(entries({{"Long", std::string(TerminalScreen::MaximumCopy, 'x')}}));
+    type(U"y");
+    EXPECT_EQ(clipboard.size(), TerminalScreen::MaximumCopy);
+}
+
+TEST_F(PaneViewTest, InAnEmptyPaneThereIsNothingToCopy)
+{
+    start();
+    show(entries({}));
+    clipboard = "before";
+    type(U"y");
+    EXPECT_EQ(clipboard, "before");
 }
 
 TEST_F(PaneViewTest, QuittingIsLeftToTheProgram)

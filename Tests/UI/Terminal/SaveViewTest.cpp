@@ -84,6 +84,27 @@ TEST_F(SaveViewTest, TypingEditsTheDescriptionAtItsEnd)
     EXPECT_EQ(*app->saveViewController()->saveDescription()->text, "");
 }
 
+TEST_F(SaveViewTest, TheDescriptionIsEditedInTheMiddleToo)
+{
+    open(1);
+    type(U"in car park");
+    press(Key::Left, 8);
+    type(U"the ");
+    EXPECT_EQ(line(1), " Description: in the car park");
+    press(Key::End);
+    press(Key::EraseWord);
+    EXPECT_EQ(*app->saveViewController()->saveDescription()->text, "in the car ");
+    press(Key::Home);
+    press(Key::Delete, 3);
+    EXPECT_EQ(*app->saveViewController()->saveDescription()->text, "the car ");
+    press(Key::Tab, 2);
+    press(Key::Right); // to the other button, no longer in the text
+    press(Key::Enter);
+    loop.runQueued();
+    EXPECT_EQ(app->saveViewController(), nullptr);
+    EXPECT_TRUE(written.empty());
+}
+
 TEST_F(SaveViewTest, TheEndOfALongDescriptionStaysInSight)
 {
     open(1);

@@ -82,7 +82,9 @@ protected:
 
     int drawings = 0; // asked for
     int quits = 0;
-    TerminalScreen screen {[this] { ++drawings; }, [this] { ++quits; }};
+    std::string clipboard;
+    TerminalScreen screen {
+        {[this] { ++drawings; }, [this] { ++quits; }, [this](const std::string& text) { clipboard = text; }}};
 };
 
 } // namespace spectrel

@@ -1,0 +1,18 @@
+#pragma once
+
+#include "LogGenerator/Template/Base.h"
+
+namespace spectrel {
+
+/// "Non-Ranked GSM Set": keeps its place on the screen; no record fills it.
+class NonRankedGSMSet final : public Base {
+public:
+    NonRankedGSMSet(ClassDictionary& dict, CodeDictionary& codeDict);
+
+    std::string_view getSectionName() const override;
+    std::vector<std::uint32_t> getLogCodeArray() const override;
+    /// Only logs its line.
+    void updateWithData(RecordView record, std::uint32_t logCode) override;
+};
+
+} // namespace spectrel

@@ -1,0 +1,131 @@
+#include "Telephony/Encoders/GSMUMTSPropertyLists.h"
+
+#include "Platform/Dictionary.h"
+#include "Platform/List.h"
+#include "Platform/TelephonyConstants.h"
+#include "Telephony/Encoders/PropertyListRecords.h"
+#include "Telephony/Simulator/GSMUMTSWorld.h"
+
+#include <cmath>
+#include <cstdio>
+#include <string>
+
+namespace spectrel {
+
+namespace {
+
+constexpr std::int64_t NotMeasured = 32767;
+
+Value whole(double value)
+{
+    return Value::integer(std::lround(value));
+}
+
+DictionaryRef cellDictionary(std::string_view technology, std::string_view type)
+{
+    auto dictionary = Dictionary::make();
+    dictionary->set(kRKCellMonitorCellRadioAccessTechnology, technology);
+    dictionary->set(kRKCellMonitorCellType, type);
+    return dictionary;
+}
+
+void setPlace(Dictionary& dictionary, std::uint16_t locationArea, std::uint32_t identity)
+{
+    dictionary.set(kRKCellMonitorMCC, Value::integer(1));
+    dictionary.set(kRKCellMonitorMNC, Value::integer(1));
+    dictionary.set(kRKCellMonitorLAC, Value::integer(locationArea));
+    dictionary.set(kRKCellMonitorCellId, Value::integer(identity));
+}
+
+DictionaryRef servingUMTSCell(const UMTSCell& cell)
+{
+    auto dictionary = cellDictionary(kRKCellMonitorRadioAccessTechnologyUMTS, kRKCellMonitorCellTypeServing);
+    setPlace(*dictionary, cell.locationArea, cell.identity);
+    dictionary->set(kRKCellMonitorUARFCN, Value::integer(cell.downlinkChannel));
+    dictionary->set(kRKCellMonitorSCN, Value::integer(cell.scramblingCode));
+    dictionary->set(kRKCellMonitorRSCP, whole(cell.rscp));
+    dictionary->set(kRKCellMonitorECN0, whole(cell.ecno));
+    return dictionary;
+}
+
+DictionaryRef servingGSMCell(const GSMCell& cell)
+{
+    auto dictionary = cellDictionary(kRKCellMonitorRadioAccessTechnologyGSM, kRKCellMonitorCellTypeServing);
+    setPlace(*dictionary, cell.locationArea, cell.identity);
+    dictionary->set(kRKCellMonitorARFCN, Value::integer(cell.arfcn));
+    dictionary->set(kRKCellMonitorRSSI, whole(cell.rssi / 2));
+    return dictionary;
+}
+
+DictionaryRef umtsNeighbour(const RankedUMTSCell& cell)
+{
+    auto dictionary = cellDictionary(kRKCellMonitorRadioAccessTechnologyUMTS, kRKCellMonitorCellTypeNeighbor);
+    dictionary->set(kRKCellMonitorUARFCN, Value::integer(cell.downlinkChannel));
+    dictionary->set(kRKCellMonitorSCN, Value::integer(cell.scramblingCode));
+    dictionary->set(kRKCellMonitorRSCP, cell.isMeasured ? whole(cell.rscp) : Value::integer(NotMeasured));
+    dictionary->set(kRKCellMonitorECN0, cell.isMeasured ? whole(cell.ecno) : Value::integer(NotMeasured));
+    return dictionary;
+}
+
+/// Levels of GSM neighbours count in steps of 2 dB.
+DictionaryRef gsmNeighbour(const GSMCell& cell, bool isMeasured)
+{
+    auto dictionary = cellDictionary(kRKCellMonitorRadioAccessTechnologyGSM, kRKCellMonitorCellTypeNeighbor);
+    dictionary->set(kRKCellMonitorARFCN, Value::integer(cell.arfcn));
+    dictionary->set(kRKCellMonitorRSSI, isMeasured ? whole(cell.rssi / 2) : Value::integer(NotMeasured));
+    return dictionary;
+}
+
+std::string hexadecimal(const char* format, unsigned first, unsigned second = 0)
+{
+    char text[32];
+    std::snprintf(text, sizeof text, format, first, second);
+    return text;
+}
+
+} // namespace
+
+Bytes gsmumtsSIMFilesRecord(const MobilityManagement& mobility, Moment time)
+{
+    const Place& routing = mobility.knownRouting();
+    const std::string location = hexadecimal("00F110 %04X FE", mobility.knownLocation().locationArea);
+    const std::string packets = hexadecimal("00F110 %04X %02X", routing.locationArea, routing.routingArea);
+    return simFilesRecord(time, {location, packets, "UTRAN preferred"});
+}
+
+Bytes gsmumtsCellInformationRecord(const GSMUMTSWorld& world, Moment time)
+{
+    auto cells = List::make();
+    if (world.now().umtsCell)
+        cells->append(servingUMTSCell(*world.now().umtsCell));
+    if (world.now().gsmCell)
+        cells->append(servingGSMCell(*world.now().gsmCell));
+    if (world.system() != RadioSystem::None) {
+        for (const RankedUMTSCell& cell : world.umts().ranking())
+            cells->append(umtsNeighbour(cell));
+        for (const GSMCell* cell : world.gsm().neighbours())
+            cells->append(gsmNeighbour(*cell, world.measuresGSM()));
+    }
+    return propertyListRecord(0xFF0001, cells, time);
+}
+
+Bytes packetContextsRecord(const GSMUMTSWorld& world, Moment time)
+{
+    auto contexts = List::make();
+    if (world.now().hasSession) {
+        contexts->append(Dictionary::make({
+            {"Context ID", "5"},
+            {"APN", "internet.test"},
+            {"Type", "IPv4"},
+            {"Address", "192.0.2.17"},
+            {"NSAPI", "5"},
+            {"Traffic Class", "Interactive"},
+            {"State", "Active"},
+            {"Bytes Received", std::to_string(world.bytesReceived())},
+            {"Bytes Sent", std::to_string(world.bytesSent())},
+        }));
+    }
+    return propertyListRecord(0xFF0002, contexts, time);
+}
+
+} // namespace spectrel

@@ -1,0 +1,140 @@
+#include "Telephony/Encoders/IFXReport.h"
+
+#include "Platform/Dictionary.h"
+#include "Platform/List.h"
+#include "Platform/PropertyList.h"
+#include "Telephony/Simulator/IFXWorld.h"
+
+#include <cmath>
+#include <string>
+
+namespace spectrel {
+
+namespace {
+
+constexpr std::size_t NeighboursTold = 6;
+constexpr const char* Network = "001-01"; // MCC and MNC of a test network
+
+std::string power(double level)
+{
+    return std::to_string(std::lround(level)) + " dBm";
+}
+
+std::string colourCode(const IFXCell& cell)
+{
+    return std::to_string(cell.networkColour) + "-" + std::to_string(cell.stationColour);
+}
+
+/// Path loss criterion (3GPP TS 45.008, 6.4): level above the cell's least one.
+std::string criterion(const IFXCell& cell)
+{
+    constexpr long LeastLevel = -104;
+    return std::to_string(std::lround(cell.level) - LeastLevel);
+}
+
+Value registration(const IFXWorld& world)
+{
+    return Dictionary::make({
+        {"State", "Registered, home"},
+        {"Network", Dictionary::make({{"PLMN", Network}, {"Name", "Test Network"}})},
+        {"Area",
+            Dictionary::make({
+                {"LAC", std::to_string(world.serving().locationArea)},
+                {"RAC", std::to_string(world.serving().routingArea)},
+            })},
+        {"Forbidden", List::make({"PLMN", "001-02", "001-03"})},
+    });
+}
+
+/// Calls hop over some channels; the list is empty but for its heading otherwise.
+Value carrier(const IFXWorld& world)
+{
+    const std::string channel = std::to_string(world.serving().channel);
+    auto hopping = List::make({"ARFCN"});
+    if (world.isTalking()) {
+        for (const std::string& hop : {channel, std::to_string(world.serving().channel + 6), std::string("118")})
+            hopping->append(hop);
+    }
+    return Dictionary::make({{"ARFCN", channel}, {"Hopping", hopping}});
+}
+
+Value servingCell(const IFXWorld& world)
+{
+    const IFXCell& cell = world.serving();
+    return Dictionary::make({
+        {"Cell Identity", std::to_string(cell.identity)},
+        {"BSIC", colourCode(cell)},
+        {"Carrier", carrier(world)},
+        {"Level",
+            Dictionary::make({
+                {"RxLev", power(cell.level)},
+                {"RxQual", std::to_string(world.quality())},
+                {"C1", criterion(cell)},
+            })},
+        {"Timing Advance", Dictionary::make({{"Steps", std::to_string(world.timingAdvance())}})},
+        {"Cells Visited", std::to_string(world.cellsVisited())},
+    });
+}
+
+Value neighbourCells(const IFXWorld& world)
+{
+    auto list = List::make({"Neighbours, strongest first"});
+    for (const IFXCell* cell : world.neighbours(NeighboursTold)) {
+        list->append(Dictionary::make({
+            {"ARFCN", std::to_string(cell->channel)},
+            {"BSIC", colourCode(*cell)},
+            {"RxLev", power(cell->level)},
+            {"C1", criterion(*cell)},
+        }));
+    }
+    return list;
+}
+
+/// Every value is wrapped once or twice, as this baseband does it where a value might have company.
+Value call(const IFXWorld& world)
+{
+    const bool isTalking = world.isTalking();
+    return Dictionary::make({
+        {"State", isTalking ? "Active" : "No call"},
+        {"Duration", Dictionary::make({{"Seconds", std::to_string(world.talkingFor().count())}})},
+        {"Channel", Dictionary::make({{"Type", isTalking ? "TCH/F" : "None"}})},
+        {"Codec", Dictionary::make({{"Speech", Dictionary::make({{"Mode", isTalking ? "AMR 12.2" : "None"}})}})},
+    });
+}
+
+Value packetData(const IFXWorld& world)
+{
+    const auto context = Dictionary::make({
+        {"APN", "internet.test"},
+        {"Address", "192.0.2.33"},
+        {"Bytes Received", std::to_string(world.bytesReceived())},
+        {"Bytes Sent", std::to_string(world.bytesSent())},
+        {"Quality", List::make({"Class, delay", "Background", "4"})},
+    });
+    return Dictionary::make({
+        {"State", world.isTalking() ? "Suspended" : "Attached"},
+        {"Contexts", List::make({"PDP contexts", context})},
+    });
+}
+
+} // namespace
+
+Value ifxState(const IFXWorld& world)
+{
+    return Dictionary::make({
+        {"Registration", registration(world)},
+        {"Serving Cell", servingCell(world)},
+        {"Neighbour Cells", neighbourCells(world)},
+        {"Call", call(world)},
+        {"Packet Data", packetData(world)},
+        {"SIM", Dictionary::make({{"State", Dictionary::make({{"Card", "Ready"}})}})},
+    });
+}
+
+Bytes ifxReport(const IFXWorld& world, Moment)
+{
+    const std::string text = serialisePropertyList(ifxState(world)).value_or(std::string());
+    return {text.begin(), text.end()};
+}
+
+} // namespace spectrel

@@ -1,0 +1,77 @@
+#pragma once
+
+#include "Telephony/Simulator/MastRoad.h"
+#include "Telephony/Simulator/Radio.h"
+
+#include <chrono>
+#include <cstdint>
+#include <vector>
+
+namespace spectrel {
+
+/// One GSM 900 cell as the phone could measure it.
+struct IFXCell {
+    std::uint16_t channel = 0; // ARFCN, 1 to 124 (3GPP TS 45.005, clause 2)
+    std::uint8_t networkColour = 0; // NCC and BCC, 0 to 7
+    std::uint8_t stationColour = 0;
+    std::uint16_t locationArea = 0;
+    std::uint16_t identity = 0;
+    std::uint8_t routingArea = 0;
+    double level = 0; // dBm, as heard now
+};
+
+/// A GSM phone on a drive: which cell it is on, what else it hears, whether it talks, what it has transferred.
+///
+/// The same seed gives the same drive. It makes a call in every second minute.
+class IFXWorld {
+public:
+    IFXWorld(Scene scene, std::uint32_t seed);
+
+    void advance(std::chrono::milliseconds step);
+
+    const IFXCell& serving() const
+    {
+        return _cells[_serving];
+    }
+    /// The strongest other cells that can be heard, strongest first.
+    std::vector<const IFXCell*> neighbours(std::size_t atMost) const;
+    bool isTalking() const;
+    /// Seconds since the call began; 0 without one.
+    std::chrono::seconds talkingFor() const;
+    /// 0 (best) to 7 (3GPP TS 45.008, 8.2.4).
+    unsigned quality() const
+    {
+        return _quality;
+    }
+    /// Distance to the serving cell in steps of 554 m, 0 to 63.
+    unsigned timingAdvance() const;
+    /// Cells that have served, this one included.
+    unsigned cellsVisited() const
+    {
+        return _cellsVisited;
+    }
+    std::uint64_t bytesReceived() const
+    {
+        return static_cast<std::uint64_t>(_received);
+    }
+    std::uint64_t bytesSent() const
+    {
+        return static_cast<std::uint64_t>(_sent);
+    }
+
+private:
+    void measure();
+    std::size_t strongest() const;
+
+    Dice _dice;
+    MastRoad _road;
+    std::vector<IFXCell> _cells; // one a mast
+    std::size_t _serving = 0;
+    std::chrono::milliseconds _elapsed {0};
+    unsigned _quality = 0;
+    unsigned _cellsVisited = 1;
+    double _received = 0;
+    double _sent = 0;
+};
+
+} // namespace spectrel

@@ -1,0 +1,61 @@
+#pragma once
+
+#include "Telephony/Simulator/Radio.h"
+
+#include <chrono>
+
+namespace spectrel {
+
+/// Something that its user does now and then.
+class Habit {
+public:
+    /// Seconds, shortest and longest.
+    struct Span {
+        double shortest;
+        double longest;
+    };
+
+    /// `first`: until it begins for the first time.
+    Habit(Span pauses, Span times, Span first, Dice& dice);
+
+    void advance(std::chrono::milliseconds step, Dice& dice);
+    bool isOn() const
+    {
+        return _isOn;
+    }
+
+private:
+    Span _pauses;
+    Span _times;
+    bool _isOn = false;
+    double _left; // seconds until it turns
+};
+
+/// How its user uses the phone: voice calls, data sessions, and transfers within them.
+class Usage {
+public:
+    explicit Usage(Dice& dice);
+
+    /// Only a phone that is attached is used.
+    void advance(std::chrono::milliseconds step, bool isAttached, Dice& dice);
+
+    bool wantsCall() const
+    {
+        return _calls.isOn();
+    }
+    bool hasSession() const
+    {
+        return _sessions.isOn();
+    }
+    bool wantsTransfer() const
+    {
+        return hasSession() && _transfers.isOn();
+    }
+
+private:
+    Habit _calls;
+    Habit _sessions;
+    Habit _transfers;
+};
+
+} // namespace spectrel

@@ -1,0 +1,41 @@
+#include "Platform/Syslog/DiagnosticFile.h"
+
+#include "Tests/Fakes/ScratchFolder.h"
+
+#include <fstream>
+#include <gtest/gtest.h>
+#include <iterator>
+
+namespace spectrel {
+namespace {
+
+class DiagnosticFileTest : public testing::Test {
+protected:
+    ScratchFolder folder;
+    std::string path = folder.path().string() + "/diagnostics";
+    std::string reason;
+};
+
+TEST_F(DiagnosticFileTest, IsTheDiagnosticLogForAsLongAsItLives)
+{
+    ASSERT_EQ(DiagnosticLog::installed(), nullptr);
+    {
+        const auto log = DiagnosticFile::create(path, reason);
+        ASSERT_TRUE(log) << reason;
+        ASSERT_EQ(DiagnosticLog::installed(), log.get());
+        DiagnosticLog::installed()->write("Display Dict = {}\nmore");
+        std::ifstream file(path, std::ios::binary);
+        EXPECT_EQ(std::string(std::istreambuf_iterator<char>(file), {}), "<7>Display Dict = {}\\nmore\n");
+    }
+    EXPECT_EQ(DiagnosticLog::installed(), nullptr);
+}
+
+TEST_F(DiagnosticFileTest, FileThatCannotBeMadeIsTold)
+{
+    EXPECT_EQ(DiagnosticFile::create(folder.path().string() + "/no/such/folder", reason), nullptr);
+    EXPECT_NE(reason.find("No such file or directory"), std::string::npos);
+    EXPECT_EQ(DiagnosticLog::installed(), nullptr);
+}
+
+} // namespace
+} // namespace spectrel

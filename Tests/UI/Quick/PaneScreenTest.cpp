@@ -1,0 +1,394 @@
+#include "Tests/UI/Quick/QuickFixture.h"
+
+#include <QAccessible>
+#include <QQuickItem>
+#include <QQuickWindow>
+#include <QTest>
+
+#include <array>
+
+namespace spectrel {
+namespace {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+class PaneScreenTest : public QuickFixture {
+protected:
+    /// What the row's item shows where, within the row's content.
+    static Rect frame(const QQuickItem& item)
+    {
+        return {item.x(), item.y(), item.width(), item.height()};
+    }
+    double contentY() const
+    {
+        return list()->property("contentY").toDouble();
+    }
+    std::string title() const
+    {
+        return shownText("title");
+    }
+};
+
+Value nested()
+{
+    return entries({{"Cells", entries({{"Serving", entries({{"PCI", "17"}, {"EARFCN", "1300"}})}})},
+        {"Empty", entries({})}, {"Band", "3"}});
+}
+
+TEST_F(PaneScreenTest, RootPaneShowsThatItConnects)
+{
+    open();
+    EXPECT_EQ(title(), "Spectrel");
+    EXPECT_EQ(shownText("status"), "Connecting");
+    EXPECT_NE(item("spinner"), nullptr);
+    EXPECT_EQ(item("back"), nullptr);
+    EXPECT_EQ(item("save"), nullptr);
+    EXPECT_THAT(shownRows(), IsEmpty());
+}
+
+TEST_F(PaneScreenTest, LosingTheSessionShowsTheReasonAndTheSpinner)
+{
+    open();
+    connect();
+    show(nested());
+    EXPECT_EQ(item("spinner"), nullptr);
+    EXPECT_EQ(shownText("status"), "Updated 2024-03-05 at 14:07:31");
+    lose("no service");
+    EXPECT_EQ(shownText("status"), "Connecting...");
+    EXPECT_EQ(shownText("reason"), "no service");
+    EXPECT_NE(item("spinner"), nullptr);
+}
+
+TEST_F(PaneScreenTest, RowsAreWhatTheDisplayTreeHas)
+{
+    open();
+    show(nested());
+    ASSERT_TRUE(waitFor([this] { return row(2); }));
+    EXPECT_EQ(shownRows(), treeRows());
+    EXPECT_THAT(shownRows(), ElementsAre("Cells >", "Empty >", "Band: 3"));
+}
+
+TEST_F(PaneScreenTest, TouchingRowsOpensPanesAndTheBackArrowClosesThem)
+{
+    open();
+    show(nested());
+    for (const char* name : {"Cells", "Serving"}) {
+        ASSERT_TRUE(waitFor([this] { return row(0); }));
+        touch(row(0));
+        EXPECT_EQ(title(), name);
+        settle();
+    }
+    ASSERT_TRUE(waitFor([this] { return row(1); }));
+    EXPECT_EQ(shownRows(), treeRows());
+    EXPECT_EQ(shownText("path"), "/Cells/Serving");
+    touch(item("back"));
+    settle();
+    EXPECT_EQ(title(), "Cells");
+    touch(item("back"));
+    settle();
+    EXPECT_EQ(title(), "Spectrel");
+    EXPECT_EQ(item("back"), nullptr);
+    EXPECT_EQ(openPaths(), "/ ");
+}
+
+TEST_F(PaneScreenTest, InnerNodeWithoutChildrenOpensAnEmptyPane)
+{
+    open();
+    show(nested());
+    ASSERT_TRUE(waitFor([this] { return row(1); }));
+    touch(row(1));
+    settle();
+    EXPECT_EQ(title(), "Empty");
+    EXPECT_THAT(shownRows(), IsEmpty());
+}
+
+TEST_F(PaneScreenTest, TouchingALeafOpensNothingAndLeavesNothingSelected)
+{
+    open();
+    show(nested());
+    ASSERT_TRUE(waitFor([this] { return row(2); }));
+    touch(row(2));
+    EXPECT_EQ(openPaths(), "/ ");
+    EXPECT_EQ(top().tableView().selectedRow(), std::nullopt);
+}
+
+TEST_F(PaneScreenTest, PageThatSlidesAwayTakesNoTouch)
+{
+    open();
+    show(nested());
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    QQuickItem* leaving = row(0);
+    touch(leaving);
+    touch(leaving);
+    EXPECT_EQ(openPaths(), "/ /Cells ");
+    settle();
+}
+
+TEST_F(PaneScreenTest, ReloadChangesTheRowsInPlaceAndKeepsTheScrollPosition)
+{
+    open();
+    show(manyLeaves(200, "a"));
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    drag(list(), {0, -300});
+    settle();
+    const double scrolled = contentY();
+    EXPECT_GT(scrolled, 100);
+    const int middle = static_cast<int>(scrolled / 50) + 4;
+    QQuickItem* const before = row(middle);
+    ASSERT_NE(before, nullptr);
+
+    show(manyLeaves(200, "b"));
+    EXPECT_EQ(contentY(), scrolled);
+    EXPECT_EQ(row(middle), before);
+    EXPECT_EQ(itemIn(*before, "value")->property("text").toString().toStdString(), "b" + std::to_string(middle));
+}
+
+TEST_F(PaneScreenTest, EveryRowInSightShowsItsOwnValueWhileScrolling)
+{
+    open();
+    show(manyLeaves(200, "v"));
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    for (int swipe = 0; swipe < 4; ++swipe) {
+        drag(list(), {0, -320});
+        settle();
+        const auto tree = treeRows();
+        for (const std::string& shown : shownRows())
+            EXPECT_THAT(tree, testing::Contains(shown));
+        EXPECT_GE(shownRows().size(), 10U);
+    }
+}
+
+TEST_F(PaneScreenTest, RowsThatComeAndGoLeaveTheOthersAndTheKeyboardsRowInPlace)
+{
+    open();
+    show(entries({{"A", "1"}, {"C", "3"}, {"D", "4"}}));
+    ASSERT_TRUE(waitFor([this] { return row(2); }));
+    key(Qt::Key_Down);
+    key(Qt::Key_Down);
+    ASSERT_EQ(list()->property("currentIndex").toInt(), 1);
+    QQuickItem* const rowOfC = row(1);
+    show(entries({{"A", "1"}, {"B", "2"}, {"C", "3"}, {"D", "4"}}));
+    ASSERT_TRUE(waitFor([this] { return row(3); }));
+    EXPECT_EQ(shownRows(), treeRows());
+    EXPECT_EQ(row(2), rowOfC);
+    EXPECT_EQ(list()->property("currentIndex").toInt(), 2);
+    show(entries({{"C", "3"}, {"D", "4"}}));
+    ASSERT_TRUE(waitFor([this] { return shownRows() == treeRows(); }));
+    EXPECT_EQ(list()->property("currentIndex").toInt(), 0);
+}
+
+TEST_F(PaneScreenTest, LeafInACellMadeForAnInnerNodeStaysBlank)
+{
+    open();
+    show(entries({{"Row", entries({})}}));
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    show(entries({{"Row", "7"}}));
+    ASSERT_TRUE(waitFor([this] { return shownRows() == std::vector<std::string> {"Row"}; }));
+    EXPECT_EQ(itemIn(*row(0), "disclosure"), nullptr);
+}
+
+TEST_F(PaneScreenTest, VanishedPathClosesItsPaneAndThoseAbove)
+{
+    open();
+    show(nested());
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    touch(row(0));
+    settle();
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    touch(row(0));
+    settle();
+    EXPECT_EQ(openPaths(), "/ /Cells /Cells/Serving ");
+    show(entries({{"Other", entries({})}}));
+    settle();
+    EXPECT_EQ(title(), "Spectrel");
+    EXPECT_THAT(shownRows(), ElementsAre("Other >"));
+}
+
+TEST_F(PaneScreenTest, PaneThatVanishesUnderAFingerLeavesCleanly)
+{
+    open();
+    show(nested());
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    touch(row(0));
+    settle();
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    const QPointF finger = press(row(0));
+    show(entries({{"Other", "1"}}));
+    settle();
+    release(finger);
+    EXPECT_EQ(openPaths(), "/ ");
+    EXPECT_EQ(title(), "Spectrel");
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    touch(row(0)); // fingers work as before
+    EXPECT_EQ(openPaths(), "/ ");
+}
+
+TEST_F(PaneScreenTest, LabelsStandWhereTheCellHasThem)
+{
+    open();
+    show(entries({{"Short", "1"}, {"Long", std::string(200, 'x')}, {"Inner", entries({})}}));
+    ASSERT_TRUE(waitFor([this] { return row(2); }));
+    for (const int index : {0, 1}) {
+        const SpectrelCell& cell = *top().cellAtRow(static_cast<std::size_t>(index));
+        EXPECT_EQ(frame(*itemIn(*row(index), "name")), cell.key.frame);
+        EXPECT_EQ(frame(*itemIn(*row(index), "value")), cell.value->frame);
+        const QQuickItem& area = *itemIn(*row(index), "area");
+        EXPECT_EQ(area.property("contentWidth").toDouble(), cell.view->contentSize.width);
+        EXPECT_EQ(area.width(), cell.view->frame.width);
+        EXPECT_EQ(area.height(), cell.view->frame.height);
+    }
+    EXPECT_EQ(frame(*itemIn(*row(2), "name")), top().cellAtRow(2)->key.frame);
+    const SpectrelCell& brief = *top().cellAtRow(0);
+    EXPECT_DOUBLE_EQ(brief.value->frame.x + brief.value->frame.width, itemIn(*row(0), "area")->width());
+}
+
+TEST_F(PaneScreenTest, LongValueScrollsSidewaysInItsRowAndKeepsItsPlace)
+{
+    open();
+    show(entries({{"Long", std::string(200, 'x')}, {"Other", "1"}}));
+    ASSERT_TRUE(waitFor([this] { return row(1); }));
+    drag(row(0), {-150, 0});
+    settle();
+    QQuickItem* const area = itemIn(*row(0), "area");
+    ASSERT_TRUE(waitFor([area] { return !area->property("moving").toBool(); }));
+    const double moved = area->property("contentX").toDouble();
+    EXPECT_GT(moved, 50);
+    EXPECT_EQ(top().cellAtRow(0)->view->contentOffset, moved);
+    EXPECT_EQ(contentY(), list()->property("originY").toDouble());
+    show(entries({{"Long", std::string(200, 'y')}, {"Other", "1"}}));
+    EXPECT_EQ(area->property("contentX").toDouble(), moved);
+    show(entries({{"Long", "short"}, {"Other", "1"}}));
+    EXPECT_EQ(area->property("contentX").toDouble(), 0);
+}
+
+TEST_F(PaneScreenTest, VerticalDragOverALongValueScrollsTheList)
+{
+    open();
+    show(manyLeaves(100, std::string(200, 'x')));
+    ASSERT_TRUE(waitFor([this] { return row(3); }));
+    drag(row(8), {0, -200});
+    settle();
+    EXPECT_GT(contentY(), 50);
+    for (int index = 0; index < 100; ++index) {
+        const QQuickItem* shown = row(index);
+        EXPECT_TRUE(!shown || itemIn(*shown, "area")->property("contentX").toDouble() == 0) << index;
+    }
+}
+
+TEST_F(PaneScreenTest, TouchingALongValueIsATouchOfItsRow)
+{
+    open();
+    show(entries({{"Long", std::string(200, 'x')}}));
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    touch(row(0));
+    EXPECT_EQ(list()->property("currentIndex").toInt(), 0);
+    EXPECT_EQ(openPaths(), "/ ");
+}
+
+TEST_F(PaneScreenTest, KeyboardBrowsesAsAFingerDoes)
+{
+    open();
+    show(nested());
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    key(Qt::Key_Return);
+    EXPECT_EQ(openPaths(), "/ /Cells ");
+    settle();
+    key(Qt::Key_Right);
+    EXPECT_EQ(openPaths(), "/ /Cells /Cells/Serving ");
+    settle();
+    key(Qt::Key_Escape);
+    settle();
+    key(Qt::Key_Backspace);
+    settle();
+    EXPECT_EQ(openPaths(), "/ ");
+    key(Qt::Key_Backspace); // the root pane stays
+    key(Qt::Key_End);
+    EXPECT_EQ(list()->property("currentIndex").toInt(), 2);
+    key(Qt::Key_Home);
+    EXPECT_EQ(list()->property("currentIndex").toInt(), 0);
+}
+
+TEST_F(PaneScreenTest, ArrowsScrollALongValueAndThenGoBack)
+{
+    open();
+    show(entries({{"Inner", entries({{"Long", std::string(200, 'x')}})}}));
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    key(Qt::Key_Return);
+    settle();
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    key(Qt::Key_Right);
+    EXPECT_EQ(itemIn(*row(0), "area")->property("contentX").toDouble(), 80);
+    key(Qt::Key_Left);
+    EXPECT_EQ(itemIn(*row(0), "area")->property("contentX").toDouble(), 0);
+    key(Qt::Key_Left);
+    EXPECT_EQ(openPaths(), "/ ");
+    settle();
+}
+
+TEST_F(PaneScreenTest, WhateverANameOrValueHoldsIsShownAsOneLineOfPlainText)
+{
+    open();
+    show(entries({{"<b>Name</b>", "<img src='x'>\nnext\xFF"}}));
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    EXPECT_THAT(shownRows(), ElementsAre("<b>Name</b>: <img src='x'>\uFFFDnext\uFFFD"));
+    EXPECT_EQ(itemIn(*row(0), "value")->property("lineCount").toInt(), 1);
+}
+
+TEST_F(PaneScreenTest, WhatAThumbPressesIsLargeEnough)
+{
+    openAllowingSave();
+    show(nested());
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    EXPECT_GE(row(0)->height(), 44);
+    touch(row(0));
+    settle();
+    for (const char* name : {"back", "save"}) {
+        EXPECT_GE(item(name)->width(), 44) << name;
+        EXPECT_GE(item(name)->height(), 44) << name;
+    }
+}
+
+TEST_F(PaneScreenTest, AScreenReaderHearsWhatIsShown)
+{
+    openAllowingSave();
+    show(nested());
+    ASSERT_TRUE(waitFor([this] { return row(2); }));
+    const auto spoken = [](QQuickItem* shown) {
+        QAccessibleInterface* interface = QAccessible::queryAccessibleInterface(shown);
+        return interface ? interface->text(QAccessible::Name).toStdString() : "(silent)";
+    };
+    EXPECT_EQ(spoken(row(0)), "Cells");
+    EXPECT_EQ(QAccessible::queryAccessibleInterface(row(0))->role(), QAccessible::Button);
+    EXPECT_EQ(spoken(row(2)), "Band, 3");
+    EXPECT_EQ(QAccessible::queryAccessibleInterface(row(2))->role(), QAccessible::ListItem);
+    EXPECT_EQ(spoken(item("save")), "Save snapshot");
+    EXPECT_EQ(spoken(item("status")), "Connecting...");
+}
+
+TEST_F(PaneScreenTest, ClosingTheWindowAsksToEndAndLeavesTheHidingToTheApplication)
+{
+    open();
+    window().close();
+    EXPECT_EQ(quits, 1);
+    EXPECT_TRUE(window().isVisible());
+    app->applicationWillTerminate();
+    EXPECT_FALSE(window().isVisible());
+}
+
+TEST_F(PaneScreenTest, NarrowAndWideWindowsLayTheRowsOutAnew)
+{
+    open(400, 700);
+    show(entries({{"Name", "1"}}));
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    for (const int width : {320, 1200}) {
+        window().resize(width, 600);
+        ASSERT_TRUE(waitFor([this, width] { return page()->width() == width; }));
+        const Rect value = top().cellAtRow(0)->value->frame;
+        EXPECT_DOUBLE_EQ(value.x + value.width, itemIn(*row(0), "area")->width());
+        EXPECT_LE(row(0)->width(), 760);
+    }
+}
+
+} // namespace
+} // namespace spectrel

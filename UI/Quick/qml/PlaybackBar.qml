@@ -1,0 +1,162 @@
+import QtQuick
+import QtQuick.Layouts
+import QtQuick.Templates as T
+import Spectrel.Quick
+
+// A recording's time line: where the screens stand in it, and the buttons that move them.
+Rectangle {
+    id: bar
+
+    required property PlaybackModel playback
+
+    implicitHeight: 112
+    color: Theme.surface
+
+    Rectangle {
+        width: parent.width
+        height: 1
+        color: Theme.line
+    }
+    RowLayout {
+        id: texts
+        x: 20
+        y: 10
+        width: parent.width - 40
+
+        Text {
+            objectName: "playbackTime"
+            text: bar.playback.timeText
+            font.pixelSize: 13
+            color: Theme.text
+            Accessible.role: Accessible.StaticText
+            Accessible.name: text
+        }
+        Text {
+            objectName: "playbackMessages"
+            visible: bar.width >= 420
+            Layout.fillWidth: true
+            text: bar.playback.messagesText
+            font.pixelSize: 13
+            color: Theme.faint
+            elide: Text.ElideRight
+            horizontalAlignment: Text.AlignHCenter
+            Accessible.role: Accessible.StaticText
+            Accessible.name: text
+        }
+        Item {
+            visible: bar.width < 420
+            Layout.fillWidth: true
+        }
+        Text {
+            objectName: "playbackState"
+            text: bar.playback.stateText
+            font.pixelSize: 13
+            font.bold: true
+            color: Theme.accent
+            Accessible.role: Accessible.StaticText
+            Accessible.name: text
+        }
+    }
+    T.Slider {
+        id: line
+        objectName: "playbackLine"
+        anchors.top: texts.bottom
+        x: 12
+        width: parent.width - 24
+        height: 32
+        focusPolicy: Qt.TabFocus
+        value: bar.playback.fraction
+        stepSize: 0
+        live: true
+        onMoved: bar.playback.seekToFraction(value)
+        // A drag has cut the line off from the playback.
+        onPressedChanged: {
+            if (!pressed)
+                value = Qt.binding(() => bar.playback.fraction);
+        }
+        Accessible.role: Accessible.Slider
+        Accessible.name: qsTr("Time line")
+
+        background: Rectangle {
+            x: 8
+            y: (parent.height - height) / 2
+            width: parent.width - 16
+            height: 4
+            radius: 2
+            color: Theme.line
+
+            Rectangle {
+                width: line.visualPosition * parent.width
+                height: parent.height
+                radius: 2
+                color: Theme.accent
+            }
+        }
+        handle: Rectangle {
+            x: line.visualPosition * (line.width - 16)
+            y: (line.height - height) / 2
+            width: 16
+            height: 16
+            radius: 8
+            color: Theme.accent
+            border.width: line.visualFocus ? 3 : 0
+            border.color: Theme.text
+        }
+    }
+    RowLayout {
+        anchors.bottom: parent.bottom
+        anchors.horizontalCenter: parent.horizontalCenter
+        height: Theme.touch
+        spacing: 0
+
+        IconButton {
+            objectName: "slower"
+            shape: Glyph.Minus
+            size: 20
+            text: qsTr("Slower")
+            onClicked: bar.playback.changeSpeed(-1)
+        }
+        IconButton {
+            objectName: "seekBack"
+            shape: Glyph.SkipBack
+            size: 20
+            text: qsTr("Ten seconds back")
+            onClicked: bar.playback.seekStep(-1)
+        }
+        IconButton {
+            objectName: "stepBack"
+            shape: Glyph.StepBack
+            size: 20
+            text: qsTr("One message back")
+            onClicked: bar.playback.stepMessage(-1)
+        }
+        IconButton {
+            objectName: "play"
+            shape: bar.playback.isPlaying ? Glyph.Pause : Glyph.Play
+            size: 26
+            text: bar.playback.isPlaying ? qsTr("Pause") : qsTr("Play")
+            onClicked: bar.playback.togglePlaying()
+        }
+        IconButton {
+            objectName: "stepForward"
+            shape: Glyph.StepForward
+            size: 20
+            text: qsTr("One message on")
+            onClicked: bar.playback.stepMessage(1)
+        }
+        IconButton {
+            objectName: "seekForward"
+            shape: Glyph.SkipForward
+            size: 20
+            text: qsTr("Ten seconds on")
+            onClicked: bar.playback.seekStep(1)
+        }
+        IconButton {
+            objectName: "faster"
+            shape: Glyph.Plus
+            size: 20
+            text: qsTr("Faster")
+            onClicked: bar.playback.changeSpeed(1)
+        }
+    }
+}

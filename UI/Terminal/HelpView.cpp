@@ -1,0 +1,93 @@
+#include "UI/Terminal/HelpView.h"
+
+#include "UI/AboutText.h"
+#include "UI/Terminal/Box.h"
+
+#include <algorithm>
+
+namespace spectrel {
+
+namespace {
+
+const std::vector<std::string> BrowsingKeys {
+    "Up Down  j k      move",
+    "PgUp PgDn         move a page",
+    "Home End          first, last row",
+    "Enter Right       open",
+    "Backspace Left    back (also Esc)",
+    "Right  h l        scroll a long value",
+    "/                 find a name or value here and below",
+    "n N               next, last find",
+    "y Y               copy the value, the whole pane",
+    "s                 save a snapshot, if allowed",
+    "Control-L         draw again",
+    "?                 this list",
+    "q                 quit",
+};
+
+const std::vector<std::string> PlayingKeys {
+    "Space             play, pause",
+    ". ,               next, last message",
+    "] [               next, last tick (2 s)",
+    "> <               10 s on, back",
+    "0 ... 9  $        to so many tenths, to the end",
+    "+ -               faster, slower",
+};
+
+} // namespace
+
+void HelpView::open(bool plays)
+{
+    _isOpen = true;
+    _top = 0;
+    _lines = {"Keys", ""};
+    if (plays) {
+        _lines.insert(_lines.end(), PlayingKeys.begin(), PlayingKeys.end());
+        _lines.emplace_back();
+    }
+    _lines.insert(_lines.end(), BrowsingKeys.begin(), BrowsingKeys.end());
+    const AboutText about = AboutText::text();
+    _lines.insert(_lines.end(), {"", about.name + " " + about.version, about.summary});
+}
+
+void HelpView::draw(Grid& grid) const
+{
+    const std::size_t room = boxRoom(grid.height());
+    drawBox(grid, _lines, std::min(_top, _lines.size() > room ? _lines.size() - room : 0));
+}
+
+/// False when it does not move.
+bool HelpView::scroll(std::ptrdiff_t by, int height)
+{
+    const auto room = static_cast<std::ptrdiff_t>(boxRoom(height));
+    const auto last = std::max<std::ptrdiff_t>(0, static_cast<std::ptrdiff_t>(_lines.size()) - room);
+    _top = static_cast<std::size_t>(
+        std::clamp<std::ptrdiff_t>(std::min(static_cast<std::ptrdiff_t>(_top), last) + by, 0, last));
+    return last > 0;
+}
+
+void HelpView::handle(const KeyEvent& event, int height)
+{
+    const auto page = static_cast<std::ptrdiff_t>(boxRoom(height));
+    std::ptrdiff_t by = 0;
+    if (event.key == Key::Down || event == KeyEvent {Key::Character, U'j'})
+        by = 1;
+    else if (event.key == Key::Up || event == KeyEvent {Key::Character, U'k'})
+        by = -1;
+    else if (event.key == Key::PageDown || event == KeyEvent {Key::Character, U' '})
+        by = page;
+    else if (event.key == Key::PageUp)
+        by = -page;
+    if (by == 0 || !scroll(by, height))
+        _isOpen = false;
+}
+
+void HelpView::handle(const MouseEvent& event, int height)
+{
+    if (event.action == MouseEvent::Action::Press)
+        _isOpen = false;
+    else // a turn of the wheel presses nothing
+        scroll(event.action == MouseEvent::Action::WheelUp ? -1 : 1, height);
+}
+
+} // namespace spectrel

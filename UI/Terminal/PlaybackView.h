@@ -1,0 +1,22 @@
+#pragma once
+
+#include "UI/PlaybackController.h"
+#include "UI/Terminal/Grid.h"
+#include "UI/Terminal/TerminalInput.h"
+
+namespace spectrel {
+
+/// The line of a recording that is played: its state, the time, the messages, and the time line as a bar.
+class PlaybackView {
+public:
+    void draw(Grid& grid, int y, const PlaybackController& controller);
+    /// False when the key is none of the time line's.
+    static bool handle(const KeyEvent& event, PlaybackController& controller);
+    /// A press on the bar seeks, one beside it plays or pauses.
+    void press(int x, PlaybackController& controller) const;
+
+private:
+    Span _bar; // where it is shown; empty when it is not
+};
+
+} // namespace spectrel
