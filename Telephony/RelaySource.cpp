@@ -189,6 +189,8 @@ void RelaySource::finishWriter()
         + (_input->takesFurtherWriters() ? "; waiting for the next one" : "; the stream is over"));
     _stream.reset();
     _ending.reset();
+    if (!_technology && !_input->takesFurtherWriters())
+        _runLoop.async(_onFailure); // no channel could ever be opened
 }
 
 void RelaySource::settleSoon()
@@ -208,6 +210,8 @@ void RelaySource::settleSoon()
 
 std::string RelaySource::status() const
 {
+    if (_messages == 0 && !_stream)
+        return _input->name() + ": no writer so far";
     std::string text = _input->name() + ": " + std::to_string(_messages) + " messages relayed";
     if (_skippedPlaces > 0)
         text += ", " + std::to_string(_skippedBytes) + " bytes skipped at " + std::to_string(_skippedPlaces)

@@ -100,8 +100,11 @@ void describe(CLI::App& program, ServiceOptions& options)
                 [&options](const std::string& name) { options.simulate.technology = technologyNamed(name); },
                 "A simulated baseband of this technology")
             ->check(IsTechnology);
-    auto* replay = source->add_option("--replay", options.replay.files,
-        "Recordings (captures, snapshots, DLF files), one after the other, to each channel from their start");
+    auto* replay =
+        source
+            ->add_option("--replay", options.replay.files,
+                "Recordings (captures, snapshots, DLF files), one after the other, to each channel from their start")
+            ->type_name("FILE");
     source
         ->add_option("--relay", options.relay,
             "A live stream of capture (pcap) or DLF bytes: - (standard input), a FIFO, unix:PATH or "

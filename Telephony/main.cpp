@@ -138,13 +138,13 @@ int serve(ServiceOptions& options)
         return fail("cannot take the telephony service's port in " + Places::portDirectory()
             + ": another service runs there, or the folder is not this user's own");
     StatusReport report(clock, service, *source);
-    const TerminationSignals signals(
+    const TerminationSignals terminationSignals(
         [&](int signal) { signal == SIGUSR1 ? tellStatus(report) : runLoop.quit(); }, {SIGUSR1});
     std::optional<RegularReport> regularReport;
     if (options.statusInterval)
         regularReport.emplace(runLoop, report, *options.statusInterval);
     ManagerStatus managerStatus(runLoop, manager, service, report);
-    tell("serving " + source->status() + " in " + Places::portDirectory());
+    tell("serving in " + Places::portDirectory() + ": " + source->status());
     if (!tellReady(options.readyDescriptor))
         return fail("--ready-fd: the descriptor cannot be written");
     managerStatus.tellManager("READY=1\n");

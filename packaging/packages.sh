@@ -12,7 +12,7 @@ test_packages=(
     "${build_packages[@]}"
     libgtest-dev libgmock-dev libbenchmark-dev
     clang clang-format libclang-rt-14-dev
-    python3 tmux git procps dbus-daemon
+    python3 tmux git procps dbus-daemon systemd tcpdump
     python3-dbusmock modemmanager
     xvfb xdotool imagemagick appstream desktop-file-utils
 )

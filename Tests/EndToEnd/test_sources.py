@@ -5,6 +5,7 @@ import json
 import os
 import plistlib
 import re
+import shutil
 import signal
 import socket
 import struct
@@ -18,19 +19,13 @@ TOP = os.path.join(os.path.dirname(os.path.abspath(__file__)), "..", "..")
 
 
 class Sources(Place):
-    def start_logged(self, *arguments, **options):
+    def start_logged(self, *arguments, stdin=subprocess.DEVNULL):
         """A service whose standard error the test reads; ready when it serves its port."""
-        log = self.path("service.log")
-        process = self.start("spectrel-telephonyd", *arguments, stderr=open(log, "a"), **options) \
-            if options else self.start_service_into(log, arguments)
-        self.wait_until(lambda: "serving" in self.log(), "the service did not start")
-        return process
-
-    def start_service_into(self, log, arguments):
-        with open(log, "a") as file:
+        with open(self.path("service.log"), "a") as log:
             process = subprocess.Popen([os.path.join(BIN, "spectrel-telephonyd"), *arguments], env=self.environment,
-                                       stdin=subprocess.DEVNULL, stderr=file)
+                                       stdin=stdin, stderr=log, bufsize=0)
         self.processes.append(process)
+        self.wait_until(lambda: "serving" in self.log(), "the service did not start")
         return process
 
     def log(self):
@@ -116,13 +111,11 @@ class Relay(Sources):
     def test_standard_input_in_pieces_of_any_length(self):
         process = self.start_logged("--relay", "-", stdin=subprocess.PIPE)
         data = capture([serving_cell(number) for number in range(1, 6)])
-        process.stdin.buffer.write(data[:24])
-        process.stdin.flush()
+        process.stdin.write(data[:24])
         self.wait_for_log("a stream of technology lte")
         watching = self.start_watch("--format", "json")
         for byte in data[24:]:
-            process.stdin.buffer.write(bytes([byte]))
-            process.stdin.flush()
+            process.stdin.write(bytes([byte]))
         self.watch_until(watching, 5)
         process.stdin.close()
         self.wait_for_log("the stream is over")
@@ -330,6 +323,11 @@ class Killed(Sources):
         listed = subprocess.run(["tcpdump", "-r", self.path("r.pcap"), "-n", "-q"], capture_output=True, text=True)
         self.assertEqual(listed.returncode, 0, listed.stderr)
         self.assertEqual(len([line for line in listed.stdout.splitlines() if re.match(r"\d\d:", line)]), 20)
+        for reader in ("capinfos", "tshark"):  # heavy ones, where they are installed
+            if shutil.which(reader):
+                done = subprocess.run([reader, *(["-r"] if reader == "tshark" else []), self.path("r.pcap")],
+                                      capture_output=True, text=True)
+                self.assertEqual(done.returncode, 0, done.stderr)
 
 
 class Status(Sources):

@@ -222,6 +222,20 @@ TEST_F(RelaySourceTest, OnlyStreamThatCannotBeUsedIsAFailure)
     EXPECT_EQ(failures, 1);
 }
 
+TEST_F(RelaySourceTest, OnlyStreamThatEndsWithoutTellingItsTechnologyIsAFailure)
+{
+    open();
+    input->furtherWriters = false;
+    input->end();
+    loop.runQueued();
+    EXPECT_EQ(failures, 1);
+    open(Technology::LTE);
+    input->furtherWriters = false;
+    input->end();
+    loop.runQueued();
+    EXPECT_EQ(failures, 1) << "with a technology the service stays, silent";
+}
+
 TEST_F(RelaySourceTest, EndOfAClientInTheMiddleOfTheStreamIsNoHarm)
 {
     open();

@@ -6,18 +6,21 @@
 #include "Platform/TelephonyConstants.h"
 #include "Platform/TelephonyProtocol.h"
 #include "Telephony/Simulator/SimulatorSource.h"
+#include "Telephony/StatusReport.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/FakeMessagePorts.h"
 #include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Fakes/RecordBuilder.h"
 #include "Tests/Telephony/Collector.h"
 
+#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 namespace spectrel {
 namespace {
 
 using namespace std::chrono_literals;
+using testing::ElementsAre;
 
 /// Hands its messages over at once and remembers who listens.
 class ListSource final : public LogSource {
@@ -51,16 +54,25 @@ public:
     {
         return Technology::GSM;
     }
-    std::unique_ptr<LogStream> start(MessageSink& sink) override
+    bool isReady() const override
     {
-        return std::make_unique<Stream>(*this, sink);
+        return ready;
+    }
+    std::string status() const override
+    {
+        return "a list";
     }
     void setTechnologyHandler(std::function<void()> handler) override
     {
         technologyHandler = std::move(handler);
     }
+    std::unique_ptr<LogStream> start(MessageSink& sink) override
+    {
+        return std::make_unique<Stream>(*this, sink);
+    }
     std::vector<Bytes> messages;
     int streams = 0;
+    bool ready = true;
     std::function<void()> technologyHandler;
 };
 
@@ -208,6 +220,45 @@ TEST_F(TelephonyServiceTest, FullClientStopsTheStreamUntilThereIsRoom)
     isFull = false;
     ports.makeRoom();
     EXPECT_EQ(ports.sent.size(), 4u);
+}
+
+TEST_F(TelephonyServiceTest, SourceThatIsNotReadyHasNoChannels)
+{
+    source.ready = false;
+    const Value wish = Dictionary::make({{"CreateLogChannel", "client"}});
+    EXPECT_EQ((*ask("org.spectrel.Telephony", 1, wish).dictionary())["Error"].int32(), 11);
+    EXPECT_EQ(service.channels(), 0u);
+    source.ready = true;
+    EXPECT_EQ((*ask("org.spectrel.Telephony", 1, wish).dictionary())["Error"].int32(), 0);
+}
+
+TEST_F(TelephonyServiceTest, StatusTellsWhatIsStreamedToWhom)
+{
+    StatusReport report(loop, service, source);
+    EXPECT_THAT(report.lines(), ElementsAre("a list; 0 clients"));
+    const std::string channel = openChannel("org.spectrel.Watch.7.BasebandStateReport.LogChannel");
+    EXPECT_TRUE(report.hasNews());
+    EXPECT_THAT(report.lines(),
+        ElementsAre("a list; 1 client, 0.0 messages/s", "  channel 1 to org.spectrel.Watch.7: not started"));
+    start(channel, codes({0xB0C2}), codes({1}));
+    loop.advance(2s);
+    EXPECT_THAT(report.lines(),
+        ElementsAre("a list; 1 client, 1.0 messages/s",
+            "  channel 1 to org.spectrel.Watch.7: 2 codes, 1.0 messages/s, 2 sent, 1 not asked for, 0 queued"));
+    EXPECT_FALSE(report.hasNews());
+    loop.advance(2s);
+    EXPECT_EQ(report.headline(), "a list; 1 client, 0.0 messages/s") << "rates count from the report before";
+}
+
+TEST_F(TelephonyServiceTest, ComingAndGoingOfChannelsIsAChange)
+{
+    int changes = 0;
+    service.setChangeHandler([&changes] { ++changes; });
+    openChannel();
+    EXPECT_EQ(changes, 1);
+    ports.killPeers();
+    loop.runQueued();
+    EXPECT_EQ(changes, 2);
 }
 
 TEST_F(TelephonyServiceTest, ChangeOfTechnologyEndsAllChannelsAndTheServiceStays)
