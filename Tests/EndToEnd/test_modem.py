@@ -9,6 +9,7 @@ import signal
 import socket
 import struct
 import subprocess
+import time
 import unittest
 
 from harness import WAIT, Place
@@ -86,10 +87,10 @@ class Channel:
 
     def wait_for(self, code, condition):
         """The next payload of the code that fulfils the condition."""
-        while True:
-            payload = self.payload(code)
-            if condition(payload):
-                return payload
+        end = time.monotonic() + WAIT
+        while not condition(payload := self.payload(code)):
+            self.place.assertLess(time.monotonic(), end, f"the last of code {code} was {payload}")
+        return payload
 
     def close(self):
         for held in (self.port, self.inbound, self.requests, self.lock):
@@ -256,6 +257,7 @@ class Streaming(ModemPlace):
         self.command("traffic", received=5_000_000_000, sent=7)
         contexts = channel.wait_for(CONTEXTS, lambda contexts: contexts[0]["Bytes Sent"] == "7")
         self.assertEqual(contexts[0]["Bytes Received"], "5000000000")
+        self.wait_until(lambda: self.rates() == [2], "the signal was not asked for")  # which measures it once
         self.command("signal", technology="lte", values={"rsrp": -77.0})
         channel.wait_for(CELLS, lambda cells: cells[0].get("kRKCellMonitorRSRP") == -77)
 

@@ -12,6 +12,9 @@ from harness import BIN, Place, capture, serving_cell, sim_files
 
 MARKER = "VexelInternal/Library/PreferenceBundles/Carrier Settings.bundle"
 WIDTH, HEIGHT = 480, 800
+ROW = 90  # the middle of the first row; each has 50 pixels
+with open(os.path.join(BIN, "Resources", "LTE.plist"), "rb") as template:
+    LTE_SECTIONS = list(plistlib.load(template))
 
 
 class Window(Place):
@@ -137,10 +140,10 @@ class Session(Window):
 
         # Three levels down by the mouse, and back.
         self.wait_until_still(0, 60, WIDTH, 600)
-        self.click(150, 190)
+        self.click(150, ROW + 50 * LTE_SECTIONS.index("PDP Context Info"))
         self.see_title(process, "PDP Context Info")
         self.wait_until_still(0, 60, WIDTH, 600)
-        self.click(150, 90)
+        self.click(150, ROW)
         self.see_title(process, "0")
         self.wait_until_still(0, 0, WIDTH, 60)
         self.click(28, 30)
@@ -203,7 +206,7 @@ class Session(Window):
         self.replay(serving_cell(321), sim_files(ICCID="8" * 80, IMSI="42"))
         process = self.open("--gui")
         self.see_row()
-        self.key("Down", "Down", "Return")
+        self.key(*["Down"] * (1 + LTE_SECTIONS.index("SIM Info")), "Return")  # the first marks the first row
         self.see_title(process, "SIM Info")
         self.wait_until_still(0, 60, WIDTH, 600)
         row = self.picture(0, 65, WIDTH, 48)
