@@ -30,23 +30,33 @@ QPointF middleOf(const QQuickItem& item)
     return item.mapToScene({item.width() / 2, item.height() / 2});
 }
 
-/// The toolkit's application object, without a screen.
-QGuiApplication& application()
-{
-    static int count = 1;
-    static char name[] = "test_quick";
-    static char* arguments[] = {name, nullptr};
-    static bool isPrepared = qputenv("QT_QPA_PLATFORM", "offscreen") && qputenv("QT_QUICK_BACKEND", "software");
-    static QGuiApplication made(count, arguments);
-    Q_UNUSED(isPrepared)
-    return made;
-}
+/// The toolkit's application object, without a screen. It goes before the toolkit's own statics do, as in a program.
+class ToolkitEnvironment final : public testing::Environment {
+public:
+    void SetUp() override
+    {
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+        qputenv("QT_QUICK_BACKEND", "software");
+        _application = std::make_unique<QGuiApplication>(_count, _arguments);
+    }
+    void TearDown() override
+    {
+        _application.reset();
+    }
+
+private:
+    int _count = 1;
+    char _name[11] = "test_quick";
+    char* _arguments[2] = {_name, nullptr};
+    std::unique_ptr<QGuiApplication> _application;
+};
+
+const testing::Environment* const Toolkit = testing::AddGlobalTestEnvironment(new ToolkitEnvironment);
 
 } // namespace
 
 QuickFixture::QuickFixture()
 {
-    application();
     static QPointingDevice* const finger = QTest::createTouchDevice();
     _finger = finger;
 }
