@@ -3,7 +3,7 @@
 #include <QEvent>
 #include <QGuiApplication>
 #include <QPalette>
-#include <QtDBus/QDBusMessage>
+#include <QtDBus/QDBusVariant>
 
 #include <utility>
 
@@ -33,8 +33,7 @@ ColorScheme::ColorScheme(QDBusConnection bus)
     QGuiApplication::instance()->installEventFilter(this);
     if (!bus.isConnected())
         return;
-    bus.connect(
-        Service, Path, Interface, "SettingChanged", this, SLOT(settingDidChange(QString, QString, QDBusVariant)));
+    bus.connect(Service, Path, Interface, "SettingChanged", this, SLOT(settingDidChange(QDBusMessage)));
     QDBusMessage question = QDBusMessage::createMethodCall(Service, Path, Interface, "Read");
     question << Group << Key;
     const QDBusMessage answer = bus.call(question, QDBus::Block, Patience);
@@ -57,10 +56,11 @@ bool ColorScheme::eventFilter(QObject* watched, QEvent* event)
     return false;
 }
 
-void ColorScheme::settingDidChange(const QString& group, const QString& key, const QDBusVariant& value)
+void ColorScheme::settingDidChange(const QDBusMessage& signal)
 {
-    if (group == Group && key == Key)
-        setPreference(unwrapped(value.variant()).toUInt());
+    const QVariantList arguments = signal.arguments(); // group, key, value
+    if (arguments.size() == 3 && arguments[0].toString() == Group && arguments[1].toString() == Key)
+        setPreference(unwrapped(arguments[2]).toUInt());
 }
 
 void ColorScheme::setPreference(uint number)

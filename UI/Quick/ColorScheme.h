@@ -2,7 +2,7 @@
 
 #include <QObject>
 #include <QtDBus/QDBusConnection>
-#include <QtDBus/QDBusVariant>
+#include <QtDBus/QDBusMessage>
 
 namespace spectrel {
 
@@ -22,7 +22,7 @@ signals:
     void changed();
 
 private slots:
-    void settingDidChange(const QString& group, const QString& key, const QDBusVariant& value);
+    void settingDidChange(const QDBusMessage& signal);
 
 private:
     enum class Preference { None, Dark, Light }; // the portal's numbers

@@ -6,6 +6,7 @@
 
 #include <QDBusConnection>
 #include <QDBusMessage>
+#include <QDBusVariant>
 #include <QDBusVirtualObject>
 #include <QGuiApplication>
 #include <QPalette>
@@ -35,6 +36,14 @@ public:
         _thread.quit();
         _thread.wait();
         QDBusConnection::disconnectFromBus(PortalConnection);
+    }
+    /// Tells that a setting has another value now.
+    static void tellChange(const QString& key, uint value)
+    {
+        QDBusMessage signal = QDBusMessage::createSignal(
+            "/org/freedesktop/portal/desktop", "org.freedesktop.portal.Settings", "SettingChanged");
+        signal << "org.freedesktop.appearance" << key << QVariant::fromValue(QDBusVariant(value));
+        EXPECT_TRUE(QDBusConnection(PortalConnection).send(signal));
     }
     QString introspect(const QString&) const override
     {
@@ -97,6 +106,21 @@ TEST_F(ColorSchemeTest, PortalOverrulesThePalette)
     setPalette(Qt::white, Qt::black);
     const ColorScheme colors(desktop());
     EXPECT_TRUE(colors.isDark());
+}
+
+TEST_F(ColorSchemeTest, FollowsThePortal)
+{
+    startBus();
+    const Portal portal(bus->address(), 1);
+    setPalette(Qt::white, Qt::black);
+    const ColorScheme colors(desktop());
+    QSignalSpy changes(&colors, &ColorScheme::changed);
+    Portal::tellChange("accent-color", 2);
+    Portal::tellChange("color-scheme", 2);
+    EXPECT_TRUE(waitFor([&colors] { return !colors.isDark(); }));
+    Portal::tellChange("color-scheme", 1);
+    EXPECT_TRUE(waitFor([&colors] { return colors.isDark(); }));
+    EXPECT_EQ(changes.count(), 2);
 }
 
 TEST_F(ColorSchemeTest, BusWithoutAPortalLeavesItToThePalette)
