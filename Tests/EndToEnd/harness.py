@@ -13,6 +13,8 @@ import unittest
 
 BIN = os.environ["SPECTREL_BIN_DIR"]
 LINK_TYPES = {"ifx": 147, "gsm": 148, "cdma": 149, "lte": 150, "utran": 151}
+with open(os.path.join(BIN, "Resources", "LTE.plist"), "rb") as _template:
+    LTE_SECTIONS = list(plistlib.load(_template))  # in the order of the screen
 WAIT = 60  # seconds until a test gives up on something that is bound to come
 
 

@@ -9,7 +9,7 @@ import subprocess
 import sys
 import unittest
 
-from harness import Place, capture, record, serving_cell, sim_files
+from harness import LTE_SECTIONS, Place, capture, record, serving_cell, sim_files
 
 
 class Watch(Place):
@@ -23,7 +23,7 @@ class Watch(Place):
         displays = self.displays(done)
         self.assertEqual(len(displays), 3)
         for display in displays:
-            self.assertEqual(list(display), ["Serving Cell Info", "SIM Info", "PDP Context Info"])
+            self.assertEqual(list(display), LTE_SECTIONS)
             self.assertNotEqual(display["Serving Cell Info"]["Physical Cell ID"], "-")
             self.assertNotEqual(display["SIM Info"]["EF-ICCID"], "-")
             self.assertTrue(display["PDP Context Info"])
@@ -62,7 +62,7 @@ class Watch(Place):
         self.start_service("--replay", file, "--speed", "0", "--loop")
         done = self.run_spectrel("watch", "--format", "json", "--count", "2")
         self.assertEqual([list(display) for display in self.displays(done)],
-                         2 * [["Serving Cell Info", "SIM Info", "PDP Context Info"]])
+                         2 * [LTE_SECTIONS])
 
     def test_several_programs_watch_at_once(self):
         self.start_service("--simulate", "lte")

@@ -59,8 +59,9 @@ class View(TerminalPlace):
                 ("0", "0:00:00.000", 1, 0)):
             with self.subTest(keys=keys):
                 self.keys(keys)
-                screen = self.see(f"{time} /", f"message {message} of 7")
-                self.assertRegex(screen, rf"Physical Cell ID +{identity}\b")
+                self.see(f"{time} /", f"message {message} of 7")
+                self.wait_until(lambda: re.search(rf"Physical Cell ID +{identity}\b", self.screen()),
+                                "the tree did not follow")
         self.leave()
 
     def test_plays_and_pauses(self):

@@ -8,13 +8,11 @@ import subprocess
 import time
 import unittest
 
-from harness import BIN, Place, capture, serving_cell, sim_files
+from harness import LTE_SECTIONS, Place, capture, serving_cell, sim_files
 
 MARKER = "VexelInternal/Library/PreferenceBundles/Carrier Settings.bundle"
 WIDTH, HEIGHT = 480, 800
 ROW = 90  # the middle of the first row; each has 50 pixels
-with open(os.path.join(BIN, "Resources", "LTE.plist"), "rb") as template:
-    LTE_SECTIONS = list(plistlib.load(template))
 
 
 class Window(Place):

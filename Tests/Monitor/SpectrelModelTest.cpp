@@ -132,8 +132,8 @@ TEST_F(SpectrelModelTest, StartAsksForTheTechnologyThenSendsTheStartCommand)
     EXPECT_EQ(start.replyMode, ReplyMode::None);
     const Bytes command(start.body.begin(), start.body.end());
     EXPECT_EQ(displayText(*parsePropertyList(command)),
-        "{\"SetState\": \"Streaming\", \"SetZephyrLogCodes\": [int 45250, int 45249], "
-        "\"SetRkExtraCodes\": [int 1, int 0, int 2]}");
+        "{\"SetState\": \"Streaming\", \"SetZephyrLogCodes\": [int 45250, int 45249, int 45433, int 45439, int 45440, "
+        "int 45446], \"SetRkExtraCodes\": [int 1, int 0, int 2]}");
     EXPECT_EQ(loop.timers(), 1u);
 }
 
