@@ -19,7 +19,7 @@ class Window(Place):
     @classmethod
     def setUpClass(cls):
         read_end, write_end = os.pipe()
-        cls.server = subprocess.Popen(["Xvfb", "-displayfd", str(write_end), "-screen", "0", "800x1000x24"],
+        cls.server = subprocess.Popen(["Xvfb", "-noreset", "-displayfd", str(write_end), "-screen", "0", "800x1000x24"],
                                       pass_fds=[write_end], stderr=subprocess.DEVNULL)
         os.close(write_end)
         with os.fdopen(read_end) as answer:
