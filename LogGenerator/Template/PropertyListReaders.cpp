@@ -5,6 +5,8 @@
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyConstants.h"
 
+#include <algorithm>
+#include <optional>
 #include <span>
 
 namespace spectrel {
@@ -12,6 +14,21 @@ namespace spectrel {
 namespace {
 
 const Value NoValue;
+
+/// The payload's property list; none when it does not parse. The latest is kept: several sections read the same
+/// record one after the other, and many a record tells what the one before it told. Whoever holds its nodes only reads
+/// them.
+const std::optional<Value>& parsedPayload(RecordView record)
+{
+    static Bytes latest;
+    static std::optional<Value> parsed;
+    const ByteView payload = record.payload();
+    if (!std::ranges::equal(payload, latest)) {
+        parsed = parsePropertyList(payload);
+        latest.assign(payload.begin(), payload.end());
+    }
+    return parsed;
+}
 
 bool isText(const Value& value, std::string_view text)
 {
@@ -47,12 +64,12 @@ std::vector<DictionaryRef> cellsOf(const Value& value, std::string_view technolo
 
 LogCode_0xFF0000::LogCode_0xFF0000(RecordView record)
 {
-    auto files = parsePropertyList(record.payload());
+    const auto& files = parsedPayload(record);
     if (!files) {
         SPECTREL_LOG(Priority::Error, "SIM File dictionary data could not be constructed");
         throw UnknownDataException();
     }
-    _files = std::move(*files);
+    _files = *files;
 }
 
 const Value& LogCode_0xFF0000::operator[](std::string_view key) const
@@ -63,14 +80,14 @@ const Value& LogCode_0xFF0000::operator[](std::string_view key) const
 
 ContextArrayReader::ContextArrayReader(RecordView record)
 {
-    if (const auto contexts = parsePropertyList(record.payload()))
+    if (const auto& contexts = parsedPayload(record))
         _contexts = contexts->list();
 }
 
 CellInfoArrayReader::CellInfoArrayReader(RecordView record)
 {
-    if (auto cells = parsePropertyList(record.payload()))
-        _cells = std::move(*cells);
+    if (const auto& cells = parsedPayload(record))
+        _cells = *cells;
     else
         SPECTREL_LOG(Priority::Error, "Cell Info Array data could not be constructed");
 }

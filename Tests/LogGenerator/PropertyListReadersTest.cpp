@@ -1,0 +1,58 @@
+#include "LogGenerator/Template/PropertyListReaders.h"
+
+#include "Platform/Dictionary.h"
+#include "Tests/Fakes/DisplayText.h"
+#include "Tests/Fakes/LogRecorder.h"
+#include "Tests/Fakes/RecordBuilder.h"
+
+#include <gtest/gtest.h>
+
+namespace spectrel {
+namespace {
+
+RecordBuilder contexts(std::string_view name)
+{
+    return RecordBuilder::withPropertyList(
+        ContextArrayReader::Code, Value(List::make({Value(Dictionary::make({{"APN", name}}))})));
+}
+
+std::string shown(const RecordBuilder& record)
+{
+    return displayText((*ContextArrayReader(RecordView(record)).contexts())[0]);
+}
+
+class PropertyListReadersTest : public testing::Test {
+protected:
+    LogRecorder log;
+};
+
+TEST_F(PropertyListReadersTest, RecordsThatTellTheSameAreParsedOnce)
+{
+    const RecordBuilder first = contexts("a");
+    const RecordBuilder same = contexts("a");
+    const DictionaryRef node = (*ContextArrayReader(RecordView(first)).contexts())[0].dictionary();
+    EXPECT_EQ((*ContextArrayReader(RecordView(same)).contexts())[0].dictionary(), node);
+}
+
+TEST_F(PropertyListReadersTest, AnotherRecordIsParsedAnew)
+{
+    EXPECT_EQ(shown(contexts("a")), "{\"APN\": \"a\"}");
+    EXPECT_EQ(shown(contexts("b")), "{\"APN\": \"b\"}");
+    EXPECT_EQ(shown(contexts("a")), "{\"APN\": \"a\"}");
+}
+
+TEST_F(PropertyListReadersTest, EveryReaderTellsOfAPayloadThatDoesNotParse)
+{
+    const Bytes garbage {'<', 'x', '>'};
+    const RecordBuilder record = RecordBuilder::withPayload(CellInfoArrayReader::Code, garbage);
+    for (int reader = 0; reader < 2; ++reader) {
+        EXPECT_FALSE(CellInfoArrayReader(RecordView(record)).holdsAnything());
+        EXPECT_EQ(log.takeLog(), "<3>Cell Info Array data could not be constructed\n");
+    }
+    EXPECT_THROW(LogCode_0xFF0000 {RecordView(record)}, LogCode_0xFF0000::UnknownDataException);
+    EXPECT_FALSE(ContextArrayReader(RecordView(record)).contexts());
+    EXPECT_EQ(shown(contexts("a")), "{\"APN\": \"a\"}");
+}
+
+} // namespace
+} // namespace spectrel
