@@ -243,6 +243,18 @@ TEST_F(PaneScreenTest, LabelsStandWhereTheCellHasThem)
     EXPECT_DOUBLE_EQ(brief.value->frame.x + brief.value->frame.width, itemIn(*row(0), "area")->width());
 }
 
+TEST_F(PaneScreenTest, LongNameOfAnInnerNodeEndsBeforeItsMark)
+{
+    open(240);
+    show(entries({{"Connected mode LTE Intra-frequency Measurement", entries({})}}));
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    const QQuickItem* const name = itemIn(*row(0), "name");
+    const QQuickItem* const mark = itemIn(*row(0), "disclosure");
+    ASSERT_TRUE(name && mark);
+    EXPECT_LE(name->mapToScene({name->width(), 0}).x(), mark->mapToScene({0, 0}).x());
+    EXPECT_TRUE(name->property("truncated").toBool());
+}
+
 TEST_F(PaneScreenTest, LongValueScrollsSidewaysInItsRowAndKeepsItsPlace)
 {
     open();

@@ -92,11 +92,15 @@ Item {
             onLongPressed: row.held(row.mapFromItem(area, point.position))
         }
         Text {
+            // The name of an inner node makes room for the disclosure mark.
+            readonly property real room: area.width - disclosure.width - x
+            readonly property bool isTooLong: row.isInner && row.nameFrame.width > room
             objectName: "name"
             x: row.nameFrame.x
             y: row.nameFrame.y
-            width: row.nameFrame.width
+            width: isTooLong ? room : row.nameFrame.width
             height: row.nameFrame.height
+            elide: isTooLong ? Text.ElideRight : Text.ElideNone
             text: row.name
             textFormat: Text.PlainText
             font: row.pane.nameFont
@@ -141,6 +145,7 @@ Item {
         }
     }
     Glyph {
+        id: disclosure
         objectName: "disclosure"
         visible: row.isInner
         anchors.right: parent.right
