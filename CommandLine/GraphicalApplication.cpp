@@ -1,16 +1,13 @@
 #include "CommandLine/GraphicalApplication.h"
 
-#include "CommandLine/Ending.h"
 #include "CommandLine/ExitStatus.h"
-#include "CommandLine/LiveServices.h"
+#include "CommandLine/LiveApplication.h"
 #include "CommandLine/Report.h"
 #include "CommandLine/SingleInstance.h"
 #include "CommandLine/ViewedFile.h"
 #include "Monitor/Snapshot.h"
-#include "Platform/Environment.h"
 #include "Platform/Preferences.h"
 #include "Platform/Qt/QtClock.h"
-#include "Platform/Qt/QtPreferences.h"
 #include "Platform/Qt/QtRunLoop.h"
 #include "Platform/Qt/TerminationSignals.h"
 #include "UI/Quick/QuickFrontEnd.h"
@@ -32,59 +29,25 @@ std::string takeActivationToken()
     return taken;
 }
 
-/// The application in a window: its services, its screens and the application object, for one run.
-class GraphicalApplication {
-public:
-    explicit GraphicalApplication(const GraphicalArguments& arguments)
-        : _preferences(Places::preferencesDirectory())
-        , _instance(_live.services().ports)
-        , _frontEnd(arguments.appearance)
-    {
-        _frontEnd.onQuit = [this] { _live.runLoop().quit(); };
-    }
-    ~GraphicalApplication()
-    {
-        Ending::remove();
-    }
-    GraphicalApplication(const GraphicalApplication&) = delete;
-    GraphicalApplication& operator=(const GraphicalApplication&) = delete;
-
-    int run()
-    {
-        if (_instance.activateOther(takeActivationToken()))
-            return ExitStatus::Done;
-        std::string reason;
-        if (!_frontEnd.start(reason)) {
-            report("cannot open the graphical screens: " + reason);
-            return ExitStatus::Failed;
-        }
-        const TerminationSignals endings([this](int) { _live.runLoop().quit(); });
-        _instance.serve([this](const std::string& token) { _frontEnd.raise(token); });
-        SpectrelApp application({_live.runLoop(), _live.clock(), _preferences, _frontEnd.toolkit(),
-            [this](SpectrelModelObserver& observer) { return makeModel(observer); }, writeSnapshot,
-            Places::crashLogDirectory()});
-        application.applicationDidFinishLaunching();
-        _live.runLoop().run();
-        Ending::remove();
-        application.applicationWillTerminate();
-        _frontEnd.stop();
+int runApplication(const GraphicalArguments& arguments)
+{
+    LiveServices live;
+    SingleInstance instance(live.services().ports);
+    QuickFrontEnd frontEnd(arguments.appearance);
+    if (instance.activateOther(takeActivationToken()))
         return ExitStatus::Done;
+    frontEnd.onQuit = [&live] { live.runLoop().quit(); };
+    std::string reason;
+    if (!frontEnd.start(reason)) {
+        report("cannot open the graphical screens: " + reason);
+        return ExitStatus::Failed;
     }
-
-private:
-    std::unique_ptr<MonitorModel> makeModel(SpectrelModelObserver& observer)
-    {
-        auto model =
-            std::make_unique<SpectrelModel>(_live.services(), observer, std::string(SpectrelModel::ApplicationPrefix));
-        Ending::install(*model, {});
-        return model;
-    }
-
-    LiveServices _live;
-    QtPreferences _preferences;
-    SingleInstance _instance;
-    QuickFrontEnd _frontEnd;
-};
+    const TerminationSignals endings([&live](int) { live.runLoop().quit(); });
+    instance.serve([&frontEnd](const std::string& token) { frontEnd.raise(token); });
+    runLiveApplication(live, frontEnd.toolkit(), {});
+    frontEnd.stop();
+    return ExitStatus::Done;
+}
 
 /// The screens in a window over a file, for one run. No session is started, nothing is saved.
 class GraphicalViewing {
@@ -142,7 +105,7 @@ int runGraphicalApplication(const GraphicalArguments& arguments)
 {
     if (arguments.viewedFile)
         return GraphicalViewing(arguments).run(arguments.technology);
-    return GraphicalApplication(arguments).run();
+    return runApplication(arguments);
 }
 
 } // namespace spectrel
