@@ -412,7 +412,7 @@ class ServiceManager(Sources):
             self.write("units/spectrel-telephonyd.socket", file.read())
         os.mkdir(self.path("run"), 0o700)
         done = subprocess.run(
-            ["systemd-analyze", "--user", "verify", os.path.join(units, "spectrel-telephonyd.service"),
+            ["systemd-analyze", "--user", "--man=no", "verify", os.path.join(units, "spectrel-telephonyd.service"),
              os.path.join(units, "spectrel-telephonyd.socket")],
             env={**self.environment, "XDG_RUNTIME_DIR": self.path("run"), "SYSTEMD_UNIT_PATH": units + ":"},
             capture_output=True, text=True)

@@ -13,6 +13,7 @@ import threading
 import uuid
 
 import dbus
+import dbus.mainloop
 import dbus.mainloop.glib
 from dbusmock.mockobject import DBusMockObject
 from gi.repository import GLib
@@ -68,6 +69,7 @@ def obey(bus, port, command):
 
 
 def main():
+    dbus.mainloop.glib.threads_init()
     dbus.mainloop.glib.DBusGMainLoop(set_as_default=True)
     bus = dbus.SystemBus()
     polkit = DBusMockObject(dbus.service.BusName(POLKIT, bus), AUTHORITY, POLKIT + ".Authority", {}, logfile="/dev/null")
@@ -78,9 +80,10 @@ def main():
     loop = GLib.MainLoop()
 
     def commands():
-        # A thread of its own: the daemon asks the authority above while it carries a command out.
+        # A thread and a connection of its own, which the loop must not touch: the daemon asks the authority above
+        # while it carries a command out.
         for line in sys.stdin:
-            obey(dbus.SystemBus(private=True), port, line.strip())
+            obey(dbus.SystemBus(private=True, mainloop=dbus.mainloop.NULL_MAIN_LOOP), port, line.strip())
             print("done", flush=True)
         loop.quit()
 
