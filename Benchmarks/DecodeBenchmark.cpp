@@ -6,14 +6,12 @@
 #include "Platform/Recording.h"
 #include "Platform/Resources.h"
 #include "Sections/LTE/LTELogGenerator.h"
+#include "Tests/Fakes/ScratchFolder.h"
 
 #include <array>
 #include <benchmark/benchmark.h>
 #include <charconv>
-#include <cstdio>
-#include <cstdlib>
 #include <string>
-#include <unistd.h>
 
 namespace spectrel {
 namespace {
@@ -27,20 +25,15 @@ class Capture {
 public:
     Capture()
     {
-        char pattern[] = "/tmp/spectrel-benchmark-XXXXXX";
-        ::close(::mkstemp(pattern));
-        path = pattern;
         std::string reason;
         const auto writer = createRecording(path, Technology::LTE, reason);
         for (int number = 0; number < Records; ++number)
             writer->write(Moment(std::chrono::milliseconds(number)), servingCell(number));
         writer->flush();
     }
-    ~Capture()
-    {
-        std::remove(path.c_str());
-    }
-    std::string path;
+
+    ScratchFolder folder;
+    std::string path = folder.file("cells.pcap");
 
 private:
     Bytes servingCell(int number)

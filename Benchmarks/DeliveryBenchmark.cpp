@@ -3,11 +3,10 @@
 #include "Benchmarks/Yardstick.h"
 #include "Platform/Qt/QtRunLoop.h"
 #include "Platform/Sockets/SocketMessagePorts.h"
+#include "Tests/Fakes/ScratchFolder.h"
 
 #include <array>
 #include <benchmark/benchmark.h>
-#include <cstdlib>
-#include <filesystem>
 #include <string>
 #include <sys/socket.h>
 #include <unistd.h>
@@ -75,14 +74,12 @@ private:
 
 void DeliverMessages(benchmark::State& run)
 {
-    std::string folder = "/tmp/spectrel-benchmark-XXXXXX";
-    if (!::mkdtemp(folder.data()))
-        return run.SkipWithError("no folder");
+    const ScratchFolder folder;
     std::array<int, 2> sockets {};
     if (::socketpair(AF_UNIX, SOCK_SEQPACKET, 0, sockets.data()) != 0)
         return run.SkipWithError("no sockets");
     {
-        Ports ports(folder);
+        Ports ports(folder.path().string());
         if (!ports.deliver())
             run.SkipWithError("messages were lost");
         const double floor = bestSeconds([&] { deliverRaw(sockets); });
@@ -95,7 +92,6 @@ void DeliverMessages(benchmark::State& run)
     }
     ::close(sockets[0]);
     ::close(sockets[1]);
-    std::filesystem::remove_all(folder);
 }
 BENCHMARK(DeliverMessages)->Unit(benchmark::kMillisecond)->Iterations(9);
 

@@ -7,36 +7,15 @@
 #include "Platform/Resources.h"
 #include "Telephony/Encoders/RecordWriter.h"
 #include "Telephony/Simulator/SimulatedRecording.h"
+#include "Tests/Fakes/CountedAllocations.h"
+#include "Tests/Fakes/ScratchFolder.h"
 
 #include <array>
 #include <benchmark/benchmark.h>
 #include <cstdio>
-#include <cstdlib>
 #include <map>
-#include <new>
 #include <string>
-#include <unistd.h>
 #include <vector>
-
-namespace {
-std::size_t allocations = 0;
-}
-
-void* operator new(std::size_t size)
-{
-    ++allocations;
-    if (void* const memory = std::malloc(size ? size : 1))
-        return memory;
-    throw std::bad_alloc();
-}
-void operator delete(void* memory) noexcept
-{
-    std::free(memory);
-}
-void operator delete(void* memory, std::size_t) noexcept
-{
-    std::free(memory);
-}
 
 namespace spectrel {
 namespace {
@@ -49,21 +28,13 @@ class Drive {
 public:
     explicit Drive(Technology technology)
     {
-        char pattern[] = "/tmp/spectrel-benchmark-XXXXXX";
-        ::close(::mkstemp(pattern));
-        path = pattern;
         std::string reason;
         const auto baseband = makeBaseband(technology, Scene::Drive, 1);
         isWritten = baseband && writeSimulatedRecording(*baseband, path, DriveLength, reason);
     }
-    ~Drive()
-    {
-        std::remove(path.c_str());
-    }
-    Drive(const Drive&) = delete;
-    Drive& operator=(const Drive&) = delete;
 
-    std::string path;
+    ScratchFolder folder;
+    std::string path = folder.file("drive.pcap");
     bool isWritten = false;
 };
 
@@ -145,13 +116,13 @@ void decodeCode(benchmark::State& run, Technology technology, const Messages& me
     };
     decodeOnce();
     std::size_t records = 0;
-    const std::size_t before = allocations;
+    const std::size_t before = allocationCount();
     for (auto _ : run) {
         decodeOnce();
         records += messages.size();
     }
     const auto each = static_cast<double>(records);
-    run.counters["allocations"] = static_cast<double>(allocations - before) / each;
+    run.counters["allocations"] = static_cast<double>(allocationCount() - before) / each;
     run.counters["record"] =
         benchmark::Counter(each, benchmark::Counter::kIsRate | benchmark::Counter::kInvert); // seconds each
 }

@@ -1,27 +1,5 @@
+#include "Tests/Fakes/CountedAllocations.h"
 #include "Tests/Platform/PortFixture.h"
-
-#include <cstdlib>
-#include <new>
-
-namespace {
-std::size_t allocations = 0;
-}
-
-void* operator new(std::size_t size)
-{
-    ++allocations;
-    if (void* const memory = std::malloc(size ? size : 1))
-        return memory;
-    throw std::bad_alloc();
-}
-void operator delete(void* memory) noexcept
-{
-    std::free(memory);
-}
-void operator delete(void* memory, std::size_t) noexcept
-{
-    std::free(memory);
-}
 
 namespace spectrel {
 namespace {
@@ -45,9 +23,9 @@ TEST_F(AllocationTest, MessagesInTheSteadyStateAllocateNothing)
         }
     };
     exchange(100);
-    const std::size_t before = allocations;
+    const std::size_t before = allocationCount();
     exchange(100 + Count);
-    EXPECT_LT(allocations - before, Count / 10); // what the turns of the loop take, none for each message
+    EXPECT_LT(allocationCount() - before, Count / 10); // what the turns of the loop take, none for each message
 }
 
 } // namespace

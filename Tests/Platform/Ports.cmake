@@ -8,7 +8,7 @@ spectrel_test(test_qt_platform
     USES spectrel_qt spectrel_syslog spectrel_port_fixtures Qt6::DBus)
 
 spectrel_test(test_message_ports
-    SOURCES AllocationTest.cpp LocalPortTest.cpp PortNameTest.cpp RemotePortTest.cpp WireTest.cpp
+    SOURCES AllocationTest.cpp ${CMAKE_SOURCE_DIR}/Tests/Fakes/CountedAllocations.cpp LocalPortTest.cpp PortNameTest.cpp RemotePortTest.cpp WireTest.cpp
     USES spectrel_qt spectrel_ports spectrel_fakes spectrel_port_fixtures)
 
 spectrel_test(test_telephony_server

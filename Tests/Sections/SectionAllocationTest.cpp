@@ -4,33 +4,12 @@
 #include "Sections/GSMUMTS/ZPH_GSMClassIndex.h"
 #include "Sections/LTE/LTEClassIndex.h"
 #include "Sections/UTRAN/UTRANClassIndex.h"
+#include "Tests/Fakes/CountedAllocations.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/RecordBuilder.h"
 
-#include <cstdlib>
 #include <gtest/gtest.h>
-#include <new>
 #include <stdexcept>
-
-namespace {
-std::size_t allocations = 0;
-}
-
-void* operator new(std::size_t size)
-{
-    ++allocations;
-    if (void* const memory = std::malloc(size ? size : 1))
-        return memory;
-    throw std::bad_alloc();
-}
-void operator delete(void* memory) noexcept
-{
-    std::free(memory);
-}
-void operator delete(void* memory, std::size_t) noexcept
-{
-    std::free(memory);
-}
 
 namespace spectrel {
 namespace {
@@ -78,9 +57,9 @@ protected:
     std::size_t cost(const RecordBuilder& of) const
     {
         const RecordView view(of);
-        const std::size_t before = allocations;
+        const std::size_t before = allocationCount();
         section().updateWithData(view, GetParam().code);
-        return allocations - before;
+        return allocationCount() - before;
     }
 
     Value node {Dictionary::make()};
