@@ -96,7 +96,7 @@ std::string Grid::styles() const
         std::string line;
         for (int x = 0; x < _width; ++x) {
             const Style& style = at(x, y).style;
-            line += style.isBold && style.isReversed ? 'X'
+            line += style.isBold && style.isReversed ? 'M'
                 : style.isBold                       ? 'B'
                 : style.isReversed                   ? 'R'
                 : style.isFaint                      ? 'f'

@@ -74,7 +74,7 @@ public:
 
     /// The screen as lines of text without the blanks at their ends, each with a newline.
     std::string text() const;
-    /// One letter a column: B bold, R reversed, X both, f faint, '.' plain; lines as in `text`.
+    /// One letter a column: B bold, R reversed, M (marked twice) both, f faint, '.' plain; lines as in `text`.
     std::string styles() const;
 
 private:

@@ -20,8 +20,8 @@ TEST_F(PaneViewTest, ARootPaneShowsTitleRowsAndStatus)
         "\n"
         " Updated 2024-03-05 at 14:07:31\n");
     EXPECT_EQ(styles(),
-        "XXXXXXXXXXXXXXXXXXXXXXXXXXXXXXXXXRRRRRRX\n"
-        "RXXXXXXXXXXXXXXXXXRRRRRRRRRRRRRRRRRRRRRR\n"
+        "MMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMMRRRRRRM\n"
+        "RMMMMMMMMMMMMMMMMMRRRRRRRRRRRRRRRRRRRRRR\n"
         ".BBBBB..................................\n"
         "........................................\n"
         "........................................\n"
