@@ -5,7 +5,6 @@
 #include <charconv>
 #include <cstdio>
 #include <cstring>
-#include <fcntl.h>
 #include <filesystem>
 #include <unistd.h>
 
@@ -29,15 +28,6 @@ std::uint64_t numberOf(const std::string& name)
     const char* const first = name.data() + FolderPrefix.size();
     const auto end = std::from_chars(first, name.data() + name.size(), number);
     return end.ec == std::errc() && *end.ptr == '-' ? number : 0;
-}
-
-/// Makes an empty file of that name; false when there is one already, so that two recorders never share a file.
-bool reserve(const fs::path& path)
-{
-    const int file = ::open(path.c_str(), O_CREAT | O_EXCL | O_WRONLY | O_CLOEXEC, 0666);
-    if (file >= 0)
-        ::close(file);
-    return file >= 0 || errno != EEXIST; // what else is wrong, the writer tells
 }
 
 std::string folderName(std::uint64_t number, Technology technology)
@@ -126,11 +116,8 @@ bool RecordingFiles::beginNext(Technology technology, Moment time)
         return failed("standard output", "one stream cannot tell of another technology; the recording ends");
     if (!flush())
         return false;
-    _path = nextPath(technology);
-    std::string reason;
-    _writer = createRecording(_path, technology, reason);
-    if (!_writer)
-        return failed(_path, reason);
+    if (!createNext(technology))
+        return false;
     ++_count;
     _technology = technology;
     _bytes = FileHeaderLength;
@@ -139,21 +126,30 @@ bool RecordingFiles::beginNext(Technology technology, Moment time)
     return true;
 }
 
-std::string RecordingFiles::nextPath(Technology technology)
+/// Two recorders never share a file, for a number that is taken is passed over.
+bool RecordingFiles::createNext(Technology technology)
+{
+    if (_isFolder)
+        _number = latestNumber();
+    std::string reason;
+    do {
+        ++_number;
+        _path = numberedPath(technology);
+        const bool isTarget = _path == _options.target;
+        _writer = (isTarget ? createRecording : createNewRecording)(_path, technology, reason);
+    } while (!_writer && reason.empty());
+    return _writer || failed(_path, reason);
+}
+
+std::string RecordingFiles::numberedPath(Technology technology) const
 {
     const fs::path target(_options.target);
     if (_isFolder)
-        _number = latestNumber();
-    if (++_number == 1 && !_isFolder)
+        return (target / folderName(_number, technology)).string();
+    if (_number == 1)
         return _options.target;
-    for (;; ++_number) {
-        const std::string name = _isFolder
-            ? folderName(_number, technology)
-            : target.stem().string() + "-" + std::to_string(_number) + target.extension().string();
-        const fs::path path = (_isFolder ? target : target.parent_path()) / name;
-        if (reserve(path))
-            return path.string();
-    }
+    const std::string name = target.stem().string() + "-" + std::to_string(_number) + target.extension().string();
+    return (target.parent_path() / name).string();
 }
 
 /// What cannot be removed stays.

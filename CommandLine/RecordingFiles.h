@@ -53,7 +53,8 @@ public:
 private:
     bool isFull(std::size_t message, Moment time) const;
     bool beginNext(Technology technology, Moment time);
-    std::string nextPath(Technology technology);
+    bool createNext(Technology technology);
+    std::string numberedPath(Technology technology) const;
     std::uint64_t latestNumber() const;
     void removeOldest();
     bool failed(const std::string& path, const std::string& reason);

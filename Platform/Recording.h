@@ -60,6 +60,11 @@ public:
 };
 
 /// Null when the file cannot be made, with `reason` telling why. "-" is standard output.
+///
+/// A program that is killed, at whatever time, leaves a file that can be read: a new one has its head from the start.
 std::unique_ptr<RecordingWriter> createRecording(const std::string& path, Technology technology, std::string& reason);
+/// The same for a name that no file has yet: null with an empty `reason` when one has it.
+std::unique_ptr<RecordingWriter> createNewRecording(
+    const std::string& path, Technology technology, std::string& reason);
 
 } // namespace spectrel

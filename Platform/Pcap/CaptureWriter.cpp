@@ -1,4 +1,5 @@
 #include "Platform/MessagePort.h"
+#include "Platform/Pcap/CaptureOutput.h"
 #include "Platform/Pcap/LinkTypes.h"
 #include "Platform/Recording.h"
 
@@ -8,7 +9,6 @@
 #include <cstring>
 #include <limits>
 #include <pcap/pcap.h>
-#include <unistd.h>
 
 namespace spectrel {
 
@@ -98,28 +98,17 @@ bool CaptureWriter::flush()
     return !_isBroken || failed(std::strerror(errno));
 }
 
-std::FILE* openForWriting(const std::string& path)
+std::unique_ptr<RecordingWriter> create(
+    const std::string& path, Technology technology, CaptureOutput::IfThere ifThere, std::string& reason)
 {
-    if (path != "-")
-        return std::fopen(path.c_str(), "wbe");
-    const int output = ::dup(STDOUT_FILENO);
-    return output < 0 ? nullptr : ::fdopen(output, "wb");
-}
-
-} // namespace
-
-std::unique_ptr<RecordingWriter> createRecording(const std::string& path, Technology technology, std::string& reason)
-{
-    std::FILE* file = openForWriting(path);
-    if (!file) {
-        reason = std::strerror(errno);
+    auto output = CaptureOutput::open(path, ifThere, reason);
+    if (!output)
         return nullptr;
-    }
     auto buffer = std::make_unique_for_overwrite<char[]>(BufferSize);
-    std::setvbuf(file, buffer.get(), _IOFBF, BufferSize);
+    std::setvbuf(output->stream(), buffer.get(), _IOFBF, BufferSize);
     const auto link = std::ranges::find(LinkTypes, technology, &LinkType::technology);
     const Capture capture(pcap_open_dead(link->number, LargestMessage));
-    Dumper dumper(pcap_dump_fopen(capture.get(), file)); // closes the file when it fails
+    Dumper dumper(pcap_dump_fopen(capture.get(), output->stream())); // closes the file when it fails
     if (!dumper) {
         reason = pcap_geterr(capture.get());
         return nullptr;
@@ -129,7 +118,19 @@ std::unique_ptr<RecordingWriter> createRecording(const std::string& path, Techno
         reason = writer->error();
         return nullptr;
     }
-    return writer;
+    return output->publish(reason) ? std::move(writer) : nullptr;
+}
+
+} // namespace
+
+std::unique_ptr<RecordingWriter> createRecording(const std::string& path, Technology technology, std::string& reason)
+{
+    return create(path, technology, CaptureOutput::IfThere::Overwrite, reason);
+}
+
+std::unique_ptr<RecordingWriter> createNewRecording(const std::string& path, Technology technology, std::string& reason)
+{
+    return create(path, technology, CaptureOutput::IfThere::Refuse, reason);
 }
 
 } // namespace spectrel

@@ -3,8 +3,11 @@
 #include "Tests/Platform/RecordingText.h"
 
 #include <algorithm>
+#include <filesystem>
 #include <gtest/gtest.h>
 #include <malloc.h>
+#include <sys/inotify.h>
+#include <unistd.h>
 
 namespace spectrel {
 
@@ -116,6 +119,84 @@ TEST(CaptureTest, FlushedMessagesAreInTheFileWhileTheWriterLives)
     ASSERT_TRUE(writer->write(at(0), viewOf("message")));
     ASSERT_TRUE(writer->flush());
     EXPECT_EQ(readRecording(folder.file("x")).messages.size(), 1u);
+}
+
+/// What happens to the names of a folder from now on: "created x", "renamed to y".
+class FolderEvents {
+public:
+    explicit FolderEvents(const ScratchFolder& folder)
+        : _descriptor(::inotify_init1(IN_NONBLOCK | IN_CLOEXEC))
+    {
+        ::inotify_add_watch(_descriptor, folder.path().c_str(), IN_CREATE | IN_MOVED_TO);
+    }
+    ~FolderEvents()
+    {
+        ::close(_descriptor);
+    }
+    std::vector<std::string> take() const
+    {
+        alignas(inotify_event) char buffer[4096];
+        std::vector<std::string> texts;
+        const ssize_t length = ::read(_descriptor, buffer, sizeof buffer);
+        for (ssize_t place = 0; place < length;) {
+            const auto* const event = reinterpret_cast<const inotify_event*>(buffer + place);
+            texts.push_back((event->mask & IN_CREATE ? "created " : "renamed to ") + std::string(event->name));
+            place += static_cast<ssize_t>(sizeof *event + event->len);
+        }
+        return texts;
+    }
+
+private:
+    int _descriptor;
+};
+
+TEST(CaptureTest, NewFileGetsItsNameWithItsHead)
+{
+    const ScratchFolder folder;
+    const FolderEvents events(folder);
+    std::string reason;
+    const std::string hidden = "created .x.pcap-" + std::to_string(::getpid());
+    for (const auto create : {createRecording, createNewRecording}) {
+        const auto writer = create(folder.file("x.pcap"), Technology::LTE, reason);
+        EXPECT_EQ(events.take(), (std::vector<std::string> {hidden, "renamed to x.pcap"}));
+        EXPECT_EQ(folder.read("x.pcap"), CaptureBytes(0xA1B2C3D4, 150).bytes);
+        std::filesystem::remove(folder.file("x.pcap"));
+    }
+}
+
+TEST(CaptureTest, OverwrittenFileKeepsItsPlaceAndItsOldPacketsGo)
+{
+    const ScratchFolder folder;
+    folder.write("x.pcap", CaptureBytes(0xA1B2C3D4, 149).packet(1, 1, "old").packet(2, 2, "older").bytes);
+    const FolderEvents events(folder);
+    std::string reason;
+    auto writer = createRecording(folder.file("x.pcap"), Technology::LTE, reason);
+    EXPECT_EQ(folder.read("x.pcap"), CaptureBytes(0xA1B2C3D4, 150).bytes);
+    EXPECT_TRUE(writer->write(at(1'000'001), viewOf("new")));
+    writer.reset();
+    EXPECT_EQ(folder.read("x.pcap"), CaptureBytes(0xA1B2C3D4, 150).packet(1, 1, "new").bytes);
+    EXPECT_TRUE(events.take().empty());
+}
+
+TEST(CaptureTest, OverwrittenShortFileOfAnotherKindIsACapture)
+{
+    const ScratchFolder folder;
+    folder.write("x.pcap", "text");
+    std::string reason;
+    EXPECT_TRUE(createRecording(folder.file("x.pcap"), Technology::LTE, reason));
+    EXPECT_EQ(folder.read("x.pcap"), CaptureBytes(0xA1B2C3D4, 150).bytes);
+}
+
+TEST(CaptureTest, NewRecordingLeavesAFileOfItsNameAlone)
+{
+    const ScratchFolder folder;
+    folder.write("x.pcap", "mine");
+    std::string reason = "none";
+    EXPECT_FALSE(createNewRecording(folder.file("x.pcap"), Technology::LTE, reason));
+    EXPECT_EQ(reason, "");
+    EXPECT_EQ(folder.read("x.pcap"), "mine");
+    const auto files = std::filesystem::directory_iterator(folder.path());
+    EXPECT_EQ(std::distance(begin(files), end(files)), 1) << "nothing hidden stays";
 }
 
 TEST(CaptureTest, FullDiskIsReported)
