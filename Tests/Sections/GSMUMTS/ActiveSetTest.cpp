@@ -1,5 +1,6 @@
 #include "Sections/GSMUMTS/ActiveSet.h"
 
+#include "Sections/GSMUMTS/UMTSCellSets.h"
 #include "Tests/Sections/GSMUMTS/UMTSCellSetsRecord.h"
 #include "Tests/Sections/SectionFixture.h"
 
@@ -92,6 +93,17 @@ TEST_F(ActiveSetTest, CellsPastTheEndOfTheRecordReadAsZeros)
         countOf("{\"Scrambling Code\": \"7\", \"RSCP\": \"-106 dB\", \"Energy Per Chip\": \"0 dB\"}", display()), 1u);
     EXPECT_EQ(
         countOf("{\"Scrambling Code\": \"0\", \"RSCP\": \"-106 dB\", \"Energy Per Chip\": \"0 dB\"}", display()), 254u);
+}
+
+TEST_F(ActiveSetTest, ReadingACellPastTheCountRaises)
+{
+    const RecordBuilder record = umtsCellSets(-512, {{7, 0, {SevenBelow, 0, 0}}});
+    const UMTSCellSets sets {RecordView(record)};
+    EXPECT_EQ(sets.scramblingCode(0), 7u);
+    EXPECT_THROW(sets.setType(1), ArrayOutOfBoundsException);
+    EXPECT_THROW(sets.scramblingCode(1), ArrayOutOfBoundsException);
+    EXPECT_EQ(sets.energy(0), SevenBelow);
+    EXPECT_THROW(sets.energy(1), ArrayOutOfBoundsException);
 }
 
 TEST_F(ActiveSetTest, OtherCodeIsLoggedAsUnknownAndLeavesTheList)
