@@ -44,6 +44,12 @@ TEST_F(ActiveSetTest, LevelIsDividedTowardsZero)
 {
     deliver(0x417A, umtsCellSets(-1000, {{9, 0, {SevenBelow, 0, 0}}}));
     EXPECT_EQ(display(), "[{\"Scrambling Code\": \"9\", \"RSCP\": \"-161 dB\", \"Energy Per Chip\": \"-7 dB\"}]");
+    const std::pair<std::int16_t, const char*> around[] = {
+        {-522, "-107 dB"}, {-521, "-106 dB"}, {-503, "-106 dB"}, {-502, "-105 dB"}};
+    for (const auto& [level, power] : around) {
+        deliver(0x417A, umtsCellSets(level, {{9, 0, {0, 0, 0}}}));
+        EXPECT_NE(display().find(power), std::string::npos) << level << " shows " << display();
+    }
 }
 
 TEST_F(ActiveSetTest, LevelsAtBothEndsOfTheirRange)
