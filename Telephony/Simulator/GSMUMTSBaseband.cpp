@@ -164,7 +164,7 @@ constexpr auto Cadences = std::to_array<Cadence<World>>({
     {10s, true, umtsCell},
     {100ms, false, onChange<&Situation::umtsCell, umtsCell>},
     {600ms, false, onUMTS<cellSets>},
-    {100ms, false, onChange<&Situation::system, cellSets>},
+    {100ms, false, onChange<&Situation::umtsCell, cellSets>}, // its strongest cell is the serving one at any moment
     {1s, true, onUMTS<ranking>},
     {100ms, false, onChange<&Situation::measuresGSM, onUMTS<ranking>>},
     {5s, false, onGSM<ranking>},

@@ -70,6 +70,21 @@ TEST_F(GSMUMTSBasebandRoundTripTest, StressIsTakenWithoutComplaint)
     EXPECT_EQ(recorder.takeLog(), "") << "nothing unreadable, nothing unknown";
 }
 
+TEST_F(GSMUMTSBasebandRoundTripTest, StrongestCellOfTheActiveSetIsTheServingOneAtAnyMoment)
+{
+    const auto baseband = makeBaseband(Technology::GSM, Scene::Drive, 1);
+    std::set<std::string> cells;
+    for (int step = 0; step < 6000 && !HasFailure(); ++step) {
+        receive(*baseband, Baseband::Step);
+        if (list("Active Set").count() == 0)
+            continue;
+        const std::string serving = shown("UMTS RR Info", "Scrambling Code");
+        EXPECT_EQ(text(entry("Active Set", 0), "Scrambling Code"), serving) << "in step " << step;
+        cells.insert(serving);
+    }
+    EXPECT_GT(cells.size(), 5u);
+}
+
 TEST_F(GSMUMTSBasebandRoundTripTest, ActiveSetIsEmptyWhileOnGSM)
 {
     const auto baseband = makeBaseband(Technology::GSM, Scene::Drive, 1);

@@ -1,5 +1,6 @@
 #include "Sections/GSMUMTS/ActiveSet.h"
 
+#include "Sections/GSMUMTS/UMTSCellSets.h"
 #include "Tests/Sections/GSMUMTS/UMTSCellSetsRecord.h"
 #include "Tests/Sections/SectionFixture.h"
 
@@ -43,6 +44,12 @@ TEST_F(ActiveSetTest, LevelIsDividedTowardsZero)
 {
     deliver(0x417A, umtsCellSets(-1000, {{9, 0, {SevenBelow, 0, 0}}}));
     EXPECT_EQ(display(), "[{\"Scrambling Code\": \"9\", \"RSCP\": \"-161 dB\", \"Energy Per Chip\": \"-7 dB\"}]");
+    const std::pair<std::int16_t, const char*> around[] = {
+        {-522, "-107 dB"}, {-521, "-106 dB"}, {-503, "-106 dB"}, {-502, "-105 dB"}};
+    for (const auto& [level, power] : around) {
+        deliver(0x417A, umtsCellSets(level, {{9, 0, {0, 0, 0}}}));
+        EXPECT_NE(display().find(power), std::string::npos) << level << " shows " << display();
+    }
 }
 
 TEST_F(ActiveSetTest, LevelsAtBothEndsOfTheirRange)
@@ -92,6 +99,17 @@ TEST_F(ActiveSetTest, CellsPastTheEndOfTheRecordReadAsZeros)
         countOf("{\"Scrambling Code\": \"7\", \"RSCP\": \"-106 dB\", \"Energy Per Chip\": \"0 dB\"}", display()), 1u);
     EXPECT_EQ(
         countOf("{\"Scrambling Code\": \"0\", \"RSCP\": \"-106 dB\", \"Energy Per Chip\": \"0 dB\"}", display()), 254u);
+}
+
+TEST_F(ActiveSetTest, ReadingACellPastTheCountRaises)
+{
+    const RecordBuilder record = umtsCellSets(-512, {{7, 0, {SevenBelow, 0, 0}}});
+    const UMTSCellSets sets {RecordView(record)};
+    EXPECT_EQ(sets.scramblingCode(0), 7u);
+    EXPECT_THROW(sets.setType(1), ArrayOutOfBoundsException);
+    EXPECT_THROW(sets.scramblingCode(1), ArrayOutOfBoundsException);
+    EXPECT_EQ(sets.energy(0), SevenBelow);
+    EXPECT_THROW(sets.energy(1), ArrayOutOfBoundsException);
 }
 
 TEST_F(ActiveSetTest, OtherCodeIsLoggedAsUnknownAndLeavesTheList)

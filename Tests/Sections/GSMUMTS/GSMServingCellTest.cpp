@@ -48,8 +48,8 @@ TEST_F(GSMServingCellTest, OfTheDedicatedChannelOnlyTheLowByteIsShown)
 
 TEST_F(GSMServingCellTest, MeasurementIsShownInOrderWithTheLowHalvesOfItsCriteria)
 {
-    deliver(0x5137, RecordBuilder(0x5137, 29).u8(15, 200).u32(16, 0x12348001).u32(20, 0xFFFFFFFF));
-    EXPECT_EQ(display(), "{\"RSSI\": \"200 dBm\", \"C1 Value\": \"32769\", \"C2 Value\": \"65535\"}");
+    deliver(0x5137, RecordBuilder(0x5137, 29).u8(15, 200).u32(16, 0x12348001).u32(20, 0x5678FFFE));
+    EXPECT_EQ(display(), "{\"RSSI\": \"200 dBm\", \"C1 Value\": \"32769\", \"C2 Value\": \"65534\"}");
     EXPECT_EQ(log(), Trace);
 }
 

@@ -41,6 +41,15 @@ protected:
         collect(display(), "", found);
         return found;
     }
+    /// The labels of "UMTS RR Info" from the top down.
+    std::string radioResourceRows()
+    {
+        std::string rows;
+        const Value umts = (*display().dictionary())["UMTS"];
+        for (const auto& row : (*umts.dictionary())["UMTS RR Info"].dictionary()->entries())
+            rows += row.key + ", ";
+        return rows;
+    }
     /// One record of every code, all bytes 1: counts of one, and names of their own in every table.
     void receiveOneOfEach()
     {
@@ -150,6 +159,16 @@ TEST_F(ZPH_GSMTemplateTest, ListsAreEmptyUntilSomethingArrivesAndThenFilled)
         "[{\"Mobile Country Code\": \"111\", \"Mobile Network Code\": \"111\"}]");
     EXPECT_EQ(list("GSM", "GSM Set"),
         "[{\"ARFCN\": \"257\", \"BSIC\": \"257\", \"RSSI\": \"1 dBm\", \"Ranking Value\": \"257\"}]");
+}
+
+TEST_F(ZPH_GSMTemplateTest, RowThatComesAndGoesMovesNoOther)
+{
+    const std::string before = radioResourceRows();
+    receiveOneOfEach(); // the last takes the channel away and brings it back
+    EXPECT_EQ(radioResourceRows(), before);
+    EXPECT_EQ(before,
+        "RRC State, Cell ID, Downlink Frequency, Uplink Frequency, Scrambling Code, URA ID, Transmit Power, Ciphering, "
+        "UARFCN, ");
 }
 
 TEST_F(ZPH_GSMTemplateTest, NextServingCellRecordTakesTheChannelOfTheCellInformationAway)
