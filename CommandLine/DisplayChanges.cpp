@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <charconv>
+#include <functional>
 #include <utility>
 
 namespace spectrel {
@@ -28,6 +29,7 @@ void DisplayChanges::updateNode(Shadow& shadow, bool isNew, const Value& value, 
         if (!isNew && shadow.isLeaf)
             reportGone(shadow, report);
         shadow.isLeaf = false;
+        shadow.isTold = false;
         return updateChildren(shadow, value, report);
     }
     if (!isNew && !shadow.isLeaf) {
@@ -35,11 +37,12 @@ void DisplayChanges::updateNode(Shadow& shadow, bool isNew, const Value& value, 
         shadow.children.clear();
     }
     const std::string_view text = value.string() ? std::string_view(*value.string()) : std::string_view(UnknownText);
-    if (isNew || !shadow.isLeaf || shadow.value != text) {
+    shadow.isTold = isNew || !shadow.isLeaf || shadow.value != text;
+    shadow.isLeaf = true;
+    if (shadow.isTold) {
         shadow.value = text;
         report(_path, &shadow.value);
     }
-    shadow.isLeaf = true;
 }
 
 void DisplayChanges::updateChildren(Shadow& shadow, const Value& value, const Report& report)
@@ -61,6 +64,8 @@ void DisplayChanges::updateChildren(Shadow& shadow, const Value& value, const Re
             visit({name, static_cast<std::size_t>(end - name)}, element);
         }
     }
+    if (value.dictionary() && value.dictionary()->contains(SortedMarker))
+        settleNamesakes(shadow, position, parentPath, report);
     for (std::size_t gone = position; gone < shadow.children.size(); ++gone) {
         _path = pathByAppending(parentPath, shadow.children[gone].name);
         reportGone(shadow.children[gone], report);
@@ -78,10 +83,38 @@ DisplayChanges::Shadow& DisplayChanges::shadowOf(
     const auto found = std::find_if(place, children.end(), [name](const Shadow& child) { return child.name == name; });
     if (found == children.end()) {
         isNew = true;
-        return *children.insert(place, Shadow {std::string(name), {}, false, {}});
+        return *children.insert(place, Shadow {std::string(name), {}, false, false, {}});
     }
     std::rotate(place, found, found + 1);
     return *place;
+}
+
+/// Children under different keys may share a name, and so a path, where the last of them stands. That one is told once
+/// more behind an earlier one's change, and none is gone while a namesake stays. The first `count` children are there.
+void DisplayChanges::settleNamesakes(
+    Shadow& parent, std::size_t count, const std::string& parentPath, const Report& report)
+{
+    std::vector<Shadow*> byName;
+    byName.reserve(parent.children.size());
+    for (Shadow& child : parent.children)
+        byName.push_back(&child);
+    std::ranges::stable_sort(byName, {}, &Shadow::name);
+    const Shadow* const end = parent.children.data() + count;
+    for (auto first = byName.begin(); first != byName.end();) {
+        const auto behind =
+            std::find_if(first, byName.end(), [first](const Shadow* child) { return child->name != (*first)->name; });
+        const auto gone = std::find_if(first, behind, [end](const Shadow* child) { return child >= end; });
+        if (gone != first && gone[-1]->isLeaf) {
+            Shadow& last = *gone[-1];
+            const bool isDisturbed = gone != behind || std::any_of(first, gone - 1, std::mem_fn(&Shadow::isTold));
+            for (auto lost = gone; lost != behind; ++lost)
+                (*lost)->isLeaf = false; // so that it goes without a word
+            _path = pathByAppending(parentPath, last.name);
+            if (isDisturbed && !last.isTold)
+                report(_path, &last.value);
+        }
+        first = behind;
+    }
 }
 
 void DisplayChanges::reportGone(const Shadow& shadow, const Report& report)

@@ -18,7 +18,8 @@ public:
     using Report = std::function<void(const std::string& path, const std::string* value)>;
 
     /// Reports new and changed leaves in display order, and within each container then those that went away.
-    /// An absent display has no leaves.
+    /// Where leaves share a path (two fingers on one pilot), each change is told, and what the last one holds is told
+    /// last. An absent display has no leaves.
     void update(const Value& display, const Report& report);
 
 private:
@@ -26,12 +27,14 @@ private:
         std::string name;
         std::string value; // of a leaf
         bool isLeaf = false;
+        bool isTold = false; // in this update
         std::vector<Shadow> children;
     };
 
     void updateNode(Shadow& shadow, bool isNew, const Value& value, const Report& report);
     void updateChildren(Shadow& shadow, const Value& value, const Report& report);
     Shadow& shadowOf(Shadow& parent, std::size_t position, std::string_view name, bool& isNew);
+    void settleNamesakes(Shadow& parent, std::size_t count, const std::string& parentPath, const Report& report);
     void reportGone(const Shadow& shadow, const Report& report);
 
     Shadow _root;

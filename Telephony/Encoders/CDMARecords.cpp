@@ -101,10 +101,17 @@ Bytes activeSetContent(const CDMAWorld& world)
 constexpr std::uint16_t UnassignedPN = 0xFFFF;
 constexpr std::size_t Fingers = 4;
 
-/// Two fingers on the serving pilot, one on each further; the others are free. Pairs of PN and C/I (linear).
-std::vector<std::pair<std::uint16_t, double>> fingers(const CDMAWorld& world)
+using FingerList = std::vector<std::pair<std::uint16_t, double>>; // PN and C/I (linear)
+
+FingerList freeFingers()
 {
-    std::vector<std::pair<std::uint16_t, double>> assigned;
+    return FingerList(Fingers, {UnassignedPN, 0});
+}
+
+/// Two fingers on the serving pilot, one on each further; the others are free.
+FingerList fingers(const CDMAWorld& world)
+{
+    FingerList assigned;
     const auto pilots = world.activePilots();
     assigned.emplace_back(pilots.front().pn, 0.8 * world.servingSignal());
     assigned.emplace_back(pilots.front().pn, 0.2 * world.servingSignal());
@@ -218,9 +225,7 @@ Bytes evdoAirLinkRecord(const CDMAWorld& world, Moment time)
 
 Bytes evdoPilotsRecord(const CDMAWorld& world, Moment time)
 {
-    if (!hasEVDO(world))
-        return {};
-    const auto pilots = world.activePilots();
+    const auto pilots = hasEVDO(world) ? world.activePilots() : std::vector<CDMAPilot>();
     RecordWriter record(0x12B6, time);
     record.u8(2).u8(0).u8(static_cast<std::uint8_t>(pilots.size())).zeros(9); // search windows
     for (const CDMAPilot& pilot : pilots)
@@ -230,11 +235,9 @@ Bytes evdoPilotsRecord(const CDMAWorld& world, Moment time)
 
 Bytes evdoFingersRecord(const CDMAWorld& world, Moment time)
 {
-    if (!hasEVDO(world))
-        return {};
     RecordWriter record(0x108A, time);
     record.zeros(9).u8(Fingers);
-    for (const auto& [pn, ratio] : fingers(world))
+    for (const auto& [pn, ratio] : hasEVDO(world) ? fingers(world) : freeFingers())
         record.u16(pn).zeros(4).u16(energyOf(ratio)).zeros(6); // path and lock states
     return record.take();
 }

@@ -21,10 +21,10 @@ Bytes cdmaFrameRecord(const CDMAWorld& world, Moment time);
 /// 0x1183, EV-DO air link, 50 bytes.
 Bytes evdoAirLinkRecord(const CDMAWorld& world, Moment time);
 
-/// 0x12B6, pilots of the EV-DO active set; not while 1x has the radio.
+/// 0x12B6, pilots of the EV-DO active set; none while 1x has the radio.
 Bytes evdoPilotsRecord(const CDMAWorld& world, Moment time);
 
-/// 0x108A, C/I of the fingers; not while 1x has the radio.
+/// 0x108A, C/I of the EV-DO carrier's fingers; all are free while 1x has the radio.
 Bytes evdoFingersRecord(const CDMAWorld& world, Moment time);
 
 /// 0x1192, packets received on the forward link since the beginning, 241 bytes; not while 1x has the radio.

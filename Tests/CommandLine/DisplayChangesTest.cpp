@@ -58,6 +58,35 @@ TEST_F(DisplayChangesTest, OrderAloneIsNoChange)
     EXPECT_EQ(update(Dictionary::make({{"C", "3"}, {"A", "1"}, {"B", "2"}})), "");
 }
 
+TEST_F(DisplayChangesTest, OfLeavesAtOnePathTheLastIsToldLast)
+{
+    const auto fingers = [](const Value& first, const Value& second, const Value& third) {
+        return Dictionary::make({{"_sorted", "_sorted"}, {"0;12", first}, {"1;4", second}, {"2;12", third}});
+    };
+    EXPECT_EQ(update(fingers("a", "b", "c")), "/12=a\n/4=b\n/12=c\n");
+    EXPECT_EQ(update(fingers("a", "b", "c")), "");
+    EXPECT_EQ(update(fingers("a", "b", "C")), "/12=C\n");
+    EXPECT_EQ(update(fingers("A", "b", "C")), "/12=A\n/12=C\n");
+    EXPECT_EQ(update(fingers("A", "B", "C")), "/4=B\n");
+}
+
+TEST_F(DisplayChangesTest, LeafIsNotGoneWhileAnotherStandsAtItsPath)
+{
+    const auto fingers = [](const Value& first, const Value& second) {
+        return Dictionary::make({{"_sorted", "_sorted"}, {"0;12", first}, {"1;4", "b"}, {"2;12", second}});
+    };
+    update(fingers("a", "c"));
+    EXPECT_EQ(update(fingers("a", {})), "/12=a\n");
+    update(fingers("a", "c"));
+    EXPECT_EQ(update(fingers({}, "c")), "/12=c\n");
+    EXPECT_EQ(update(fingers({}, {})), "/12 gone\n");
+    update(fingers("a", "c"));
+    EXPECT_EQ(update(fingers({}, {})), "/12 gone\n/12 gone\n");
+    update(fingers("a", "c"));
+    EXPECT_EQ(update(fingers("a", List::make({"x"}))), "/12 gone\n/12/0=x\n");
+    EXPECT_EQ(update(fingers("a", {})), "/12=a\n/12/0 gone\n");
+}
+
 TEST_F(DisplayChangesTest, ShorterListLosesItsLastElements)
 {
     update(List::make({Dictionary::make({{"k", "1"}}), Dictionary::make({{"k", "2"}, {"l", "3"}})}));

@@ -116,6 +116,7 @@ TEST_F(ThroughputTest, ReverseCountersHaveTheirPacketSizesInAllTheirPlaces)
         RecordBuilder others(0x127E, 1750);
         for (const std::size_t place : {34, 38, 322, 326})
             others.u32(24 * rate + place, 1);
+        others.u32(1746, 1); // behind the third block
         deliver(others);
         ASSERT_EQ(kept("RLDataSent"), "int 0") << rate;
     }
