@@ -65,7 +65,11 @@ public:
     QString reason() const;
     static QFont statusFont();
     bool canSave() const;
-    int selectedRow() const;
+    /// -1: none.
+    int selectedRow() const
+    {
+        return _selectedRow;
+    }
     static QFont nameFont();
     static QFont valueFont();
 
@@ -100,6 +104,7 @@ private:
     QVariant nodeData(std::size_t row, int role) const;
     void tellChanged(int first, int end);
     void adoptNode();
+    void adoptSelection();
 
     std::shared_ptr<SpectrelPaneController> _pane;
     bool _isRoot;
