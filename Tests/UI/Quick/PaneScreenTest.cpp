@@ -113,6 +113,23 @@ TEST_F(PaneScreenTest, TouchingALeafOpensNothingAndLeavesNothingSelected)
     EXPECT_EQ(top().tableView().selectedRow(), std::nullopt);
 }
 
+TEST_F(PaneScreenTest, RowThatOpenedAPaneIsPlainAgainOnceThatIsClosed)
+{
+    open();
+    show(nested());
+    ASSERT_TRUE(waitFor([this] { return row(2); }));
+    const QQuickItem* const card = itemIn(*row(0), "card");
+    const auto colour = [card] { return card->property("color").value<QColor>().name().toStdString(); };
+    const std::string plain = colour();
+    touch(row(0));
+    EXPECT_NE(colour(), plain); // while its pane slides in
+    settle();
+    touch(item("back"));
+    settle();
+    ASSERT_EQ(openPaths(), "/ ");
+    EXPECT_EQ(colour(), plain);
+}
+
 TEST_F(PaneScreenTest, PageThatSlidesAwayTakesNoTouch)
 {
     open();
@@ -142,6 +159,30 @@ TEST_F(PaneScreenTest, ReloadChangesTheRowsInPlaceAndKeepsTheScrollPosition)
     EXPECT_EQ(contentY(), scrolled);
     EXPECT_EQ(row(middle), before);
     EXPECT_EQ(itemIn(*before, "value")->property("text").toString().toStdString(), "b" + std::to_string(middle));
+}
+
+TEST_F(PaneScreenTest, EveryRowInSightShowsItsOwnValueWhenRowsComeAndGoAboveThem)
+{
+    open();
+    show(manyLeaves(200, "v"));
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    drag(list(), {0, -320});
+    drag(list(), {0, -320});
+    settle();
+    const DictionaryRef more = Dictionary::make({});
+    for (int number = 0; number < 30; ++number)
+        more->set("New " + std::to_string(number), Value("n" + std::to_string(number)));
+    for (int number = 0; number < 200; ++number)
+        more->set("Leaf " + std::to_string(number), Value("v" + std::to_string(number)));
+    for (const Value& display : {Value(more), manyLeaves(200, "w")}) {
+        show(display);
+        waitForFrame();
+        settle();
+        const auto tree = treeRows();
+        EXPECT_GE(shownRows().size(), 10U);
+        for (const std::string& shown : shownRows())
+            EXPECT_THAT(tree, testing::Contains(shown));
+    }
 }
 
 TEST_F(PaneScreenTest, EveryRowInSightShowsItsOwnValueWhileScrolling)
@@ -272,6 +313,25 @@ TEST_F(PaneScreenTest, LongValueScrollsSidewaysInItsRowAndKeepsItsPlace)
     EXPECT_EQ(area->property("contentX").toDouble(), moved);
     show(entries({{"Long", "short"}, {"Other", "1"}}));
     EXPECT_EQ(area->property("contentX").toDouble(), 0);
+}
+
+TEST_F(PaneScreenTest, LongValueKeepsItsPlaceInAScrolledListToo)
+{
+    open();
+    show(manyLeaves(100, std::string(200, 'x')));
+    ASSERT_TRUE(waitFor([this] { return row(3); }));
+    drag(list(), {0, -200});
+    settle();
+    const int middle = static_cast<int>(contentY() / 50) + 4;
+    drag(row(middle), {-150, 0});
+    QQuickItem* const area = itemIn(*row(middle), "area");
+    ASSERT_TRUE(waitFor([area] { return !area->property("moving").toBool(); }));
+    const double moved = area->property("contentX").toDouble();
+    EXPECT_GT(moved, 50);
+    for (int refresh = 0; refresh < 3; ++refresh) {
+        show(manyLeaves(100, std::string(200, 'y')));
+        EXPECT_EQ(area->property("contentX").toDouble(), moved);
+    }
 }
 
 TEST_F(PaneScreenTest, VerticalDragOverALongValueScrollsTheList)

@@ -33,6 +33,7 @@ Item {
     // Rounded where the card begins and ends, straight between.
     Rectangle {
         id: card
+        objectName: "card"
         readonly property color shown: row.isPressed || row.pane.selectedRow === row.index ? Theme.pressed : Theme.surface
         anchors.fill: parent
         radius: row.index === 0 || row.isLast ? Theme.radius : 0
