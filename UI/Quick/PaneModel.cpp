@@ -266,6 +266,12 @@ void PaneModel::tap(int row)
     adoptSelection();
 }
 
+void PaneModel::goBack()
+{
+    if (isTop())
+        SpectrelApp::sharedApplication()->navController()->popViewController(Animation::Animated);
+}
+
 void PaneModel::didScrollSideways(int row, double offset)
 {
     SpectrelCell* cell = row < 0 ? nullptr : _pane->cellAtRow(static_cast<std::size_t>(row));

@@ -77,6 +77,8 @@ public:
     Q_INVOKABLE void setVisibleRows(int first, int count, double width);
     /// A finger, or the Return key, on the row.
     Q_INVOKABLE void tap(int row);
+    /// The back arrow, or what stands for it: closes the pane; nothing while it is not the one in sight.
+    Q_INVOKABLE void goBack();
     /// The finger has moved the row's content to this offset.
     Q_INVOKABLE void didScrollSideways(int row, double offset);
     /// Moves the row's content; false when it stayed where it was.

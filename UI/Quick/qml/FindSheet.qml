@@ -113,6 +113,11 @@ Popup {
             Accessible.role: Accessible.StaticText
             Accessible.name: text
         }
+        EdgeSwipe {
+            z: 1
+            height: parent.height
+            onSwiped: sheet.find.close()
+        }
         ListView {
             id: list
             objectName: "finds"

@@ -29,7 +29,7 @@ FocusScope {
         id: titleBar
         width: parent.width
         pane: page.pane
-        onBackPressed: page.screen.back()
+        onBackPressed: page.pane.goBack()
         onFindPressed: page.screen.find.open()
         onMenuPressed: page.openMenu()
     }
@@ -91,6 +91,12 @@ FocusScope {
         pane: page.pane
     }
 
+    EdgeSwipe {
+        height: parent.height
+        enabled: !page.pane.isRoot
+        onSwiped: page.pane.goBack()
+    }
+
     ActionMenu { id: menu }
     Connections {
         target: page.pane
@@ -126,11 +132,11 @@ FocusScope {
             return;
         case Qt.Key_Left:
             if (!pane.scrollSideways(list.currentIndex, -sidewaysStep))
-                screen.back();
+                pane.goBack();
             return;
         case Qt.Key_Backspace:
         case Qt.Key_Escape:
-        case Qt.Key_Back: return screen.back();
+        case Qt.Key_Back: return pane.goBack();
         }
         event.accepted = screen.playback.isThere && playbackKey(event.text);
     }

@@ -52,7 +52,7 @@ Item {
         visible: !row.isLast
         anchors.bottom: parent.bottom
         anchors.left: parent.left
-        anchors.leftMargin: Theme.margin / 2 + 10
+        anchors.leftMargin: Theme.edge - Theme.margin + 10
         anchors.right: parent.right
         height: 1
         color: Theme.line
@@ -73,7 +73,7 @@ Item {
         id: area
         objectName: "area"
         anchors.fill: parent
-        anchors.leftMargin: Theme.margin / 2
+        anchors.leftMargin: Theme.edge - Theme.margin
         anchors.rightMargin: Theme.margin + 4
         contentWidth: row.rowContentWidth
         contentHeight: height
