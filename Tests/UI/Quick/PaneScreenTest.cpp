@@ -566,6 +566,35 @@ TEST_F(PaneScreenTest, AScreenReaderHearsWhatIsShown)
     EXPECT_EQ(spoken(item("status")), "Connecting...");
 }
 
+TEST_F(PaneScreenTest, AScreenReaderHearsNoRowThatIsGone)
+{
+    open();
+    const auto spoken = [this] {
+        std::vector<std::string> rows;
+        const QAccessibleInterface* const rowsList = QAccessible::queryAccessibleInterface(list());
+        for (int index = 0; index < rowsList->childCount(); ++index) {
+            const QAccessibleInterface* const shown = rowsList->child(index);
+            if (shown->role() == QAccessible::ListItem && !shown->state().invisible)
+                rows.push_back(shown->text(QAccessible::Name).replace(", ", ": ").toStdString());
+        }
+        return rows;
+    };
+    show(manyLeaves(100, "v"));
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    for (int swipe = 0; swipe < 3; ++swipe) {
+        drag(list(), {0, -330});
+        settle();
+        waitForFrame();
+        auto rows = shownRows();
+        rows.emplace_back("Leaf 0: v0"); // where the keyboard is: the list keeps it
+        EXPECT_THAT(spoken(), testing::UnorderedElementsAreArray(rows));
+    }
+    show(manyLeaves(3, "v"));
+    ASSERT_TRUE(waitFor([this] { return shownRows() == treeRows(); }));
+    waitForFrame();
+    EXPECT_THAT(spoken(), testing::UnorderedElementsAreArray(shownRows()));
+}
+
 TEST_F(PaneScreenTest, AScreenReaderFollowsTheKeyboardsRow)
 {
     open();

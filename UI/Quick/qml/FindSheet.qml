@@ -150,6 +150,8 @@ Popup {
                 Accessible.role: Accessible.Button
                 Accessible.name: name + ", " + value + ", " + panePath
                 Accessible.onPressAction: sheet.find.tap(index)
+                ListView.onPooled: visible = false
+                ListView.onReused: visible = true
 
                 Rectangle {
                     anchors.fill: parent

@@ -169,7 +169,12 @@ Item {
     }
 
     onRowContentOffsetChanged: takeOffset()
-    ListView.onReused: takeOffset()
+    // A row that waits to be used again is only out of the picture; a screen reader would still find it.
+    ListView.onPooled: visible = false
+    ListView.onReused: {
+        visible = true;
+        takeOffset();
+    }
 
     function takeOffset() {
         if (!area.moving && area.contentX !== rowContentOffset)
