@@ -41,11 +41,15 @@ std::shared_ptr<SpectrelCell> SpectrelCell::initWithStyle(
     return cell;
 }
 
-void SpectrelCell::didMoveToRow()
+double SpectrelCell::contentOffset() const
 {
-    // Another row's value starts at its beginning.
-    if (view)
-        view->contentOffset = 0;
+    return view ? view->contentOffset : 0;
+}
+
+void SpectrelCell::setContentOffset(double offset)
+{
+    if (view && accessory == CellAccessory::None) // the name of an inner node stays in sight
+        view->scrollBy(offset - view->contentOffset);
 }
 
 /// Places the name label; its size.

@@ -43,7 +43,8 @@ public:
     void setLayoutKey();
     /// Layout of a leaf's row.
     void setLayout();
-    void didMoveToRow() override;
+    double contentOffset() const override;
+    void setContentOffset(double offset) override;
 
     Label key;
     std::optional<Label> value;

@@ -44,8 +44,7 @@ void TableView::fill(std::size_t first, std::size_t end, const std::vector<CellR
         CellRef cell = kept.empty() ? nullptr : kept[row - first];
         if (!cell) {
             cell = _source.cellForRow(*this, row);
-            if (std::exchange(cell->_row, row) != row)
-                cell->didMoveToRow();
+            cell->setContentOffset(0);
         }
         _visible.push_back(std::move(cell));
     }
@@ -80,12 +79,20 @@ void TableView::setVisibleRows(std::size_t first, std::size_t count, const Rect&
 
 void TableView::reloadData()
 {
-    for (CellRef& cell : _visible)
+    const std::size_t firstBefore = _firstVisible;
+    std::vector<double> offsets;
+    for (CellRef& cell : _visible) {
+        offsets.push_back(cell->contentOffset());
         enqueue(std::move(cell));
+    }
     _visible.clear();
     const std::size_t rows = numberOfRows();
-    const std::size_t first = std::min(_firstVisible, rows);
+    const std::size_t first = std::min(firstBefore, rows);
     fill(first, first + std::min(_wantedRows, rows - first), {});
+    if (first == firstBefore) {
+        for (std::size_t index = 0; index < std::min(offsets.size(), _visible.size()); ++index)
+            _visible[index]->setContentOffset(offsets[index]);
+    }
     _selectedRow.reset();
     _toolkit.screenDidChange(ScreenPart::Rows, Animation::None);
 }

@@ -49,8 +49,14 @@ public:
     {
         contentBounds = bounds;
     }
-    /// The cell was taken for another row than the one it showed last.
-    virtual void didMoveToRow() { }
+    /// How far the row's content is moved to the left, pt; always 0 in a row whose content does not scroll. A row that
+    /// comes into sight begins at 0; what stays in sight keeps its offset through a reload, whichever cell it gets.
+    virtual double contentOffset() const
+    {
+        return 0;
+    }
+    /// As far as the content goes.
+    virtual void setContentOffset(double) { }
 
     CellAccessory accessory = CellAccessory::None;
     Label textLabel; // the standard label; rows with labels of their own leave it empty
@@ -61,7 +67,6 @@ private:
     friend class TableView;
     CellStyle _style;
     std::string _reuseIdentifier;
-    std::optional<std::size_t> _row; // shown last
 };
 
 using CellRef = std::shared_ptr<TableCell>;

@@ -176,6 +176,24 @@ TEST_F(SpectrelPaneControllerTest, ValuesAreScrolledBackWhenTheirRowShowsAnother
     EXPECT_EQ(top().cellAtRow(1)->view->contentOffset, 0);
 }
 
+TEST_F(SpectrelPaneControllerTest, AScrolledValueKeepsItsPlaceThroughReloadsWhicheverCellItsRowGets)
+{
+    launch();
+    const std::string longText(100, 'x');
+    show(entries({{"a", "1"}, {"b", longText}, {"c", longText}, {"d", "4"}}));
+    TableView& table = top().tableView();
+    table.setVisibleRows(0, 4, {0, 0, 320, 50});
+    table.setVisibleRows(1, 2, {0, 0, 320, 50}); // two cells wait in the pool
+    ASSERT_TRUE(top().cellAtRow(1)->view->scrollBy(50));
+    for (int refresh = 0; refresh < 3; ++refresh) {
+        top().reloadWithNode(top().node());
+        EXPECT_EQ(top().cellAtRow(1)->view->contentOffset, 50);
+        EXPECT_EQ(top().cellAtRow(2)->view->contentOffset, 0);
+    }
+    show(entries({{"a", "1"}, {"b", "short"}, {"c", longText}, {"d", "4"}}));
+    EXPECT_EQ(top().cellAtRow(1)->view->contentOffset, 0);
+}
+
 TEST_F(SpectrelPaneControllerTest, ANewWidthLaysTheRowsInSightOutAgain)
 {
     launch();

@@ -144,9 +144,16 @@ void PaneModel::rowsDidChange()
 {
     if (_pane->node() != _node)
         adoptNode();
-    if (std::exchange(_selectedRow, selectedRow()) != selectedRow())
-        emit selectedRowChanged();
+    adoptSelection();
     emit rowToShowChanged();
+}
+
+void PaneModel::adoptSelection()
+{
+    const auto selected = _pane->tableView().selectedRow();
+    const int row = selected ? static_cast<int>(*selected) : -1;
+    if (std::exchange(_selectedRow, row) != row)
+        emit selectedRowChanged();
 }
 
 int PaneModel::takeRowToShow()
@@ -172,12 +179,6 @@ void PaneModel::adoptNode()
         endInsertRows();
     }
     tellChanged(0, _count);
-}
-
-int PaneModel::selectedRow() const
-{
-    const auto row = _pane->tableView().selectedRow();
-    return row ? static_cast<int>(*row) : -1;
 }
 
 QFont PaneModel::nameFont()
@@ -259,8 +260,16 @@ bool PaneModel::isTop() const
 
 void PaneModel::tap(int row)
 {
-    if (isTop() && row >= 0)
-        _pane->tableView().selectRow(static_cast<std::size_t>(row));
+    if (!isTop() || row < 0)
+        return;
+    _pane->tableView().selectRow(static_cast<std::size_t>(row));
+    adoptSelection();
+}
+
+void PaneModel::goBack()
+{
+    if (isTop())
+        SpectrelApp::sharedApplication()->navController()->popViewController(Animation::Animated);
 }
 
 void PaneModel::didScrollSideways(int row, double offset)

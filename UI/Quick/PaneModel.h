@@ -65,7 +65,11 @@ public:
     QString reason() const;
     static QFont statusFont();
     bool canSave() const;
-    int selectedRow() const;
+    /// -1: none.
+    int selectedRow() const
+    {
+        return _selectedRow;
+    }
     static QFont nameFont();
     static QFont valueFont();
 
@@ -73,6 +77,8 @@ public:
     Q_INVOKABLE void setVisibleRows(int first, int count, double width);
     /// A finger, or the Return key, on the row.
     Q_INVOKABLE void tap(int row);
+    /// The back arrow, or what stands for it: closes the pane; nothing while it is not the one in sight.
+    Q_INVOKABLE void goBack();
     /// The finger has moved the row's content to this offset.
     Q_INVOKABLE void didScrollSideways(int row, double offset);
     /// Moves the row's content; false when it stayed where it was.
@@ -100,6 +106,7 @@ private:
     QVariant nodeData(std::size_t row, int role) const;
     void tellChanged(int first, int end);
     void adoptNode();
+    void adoptSelection();
 
     std::shared_ptr<SpectrelPaneController> _pane;
     bool _isRoot;

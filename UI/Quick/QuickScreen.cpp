@@ -181,13 +181,6 @@ void QuickScreen::resize(double width, double height)
     _size = {width, height};
 }
 
-void QuickScreen::back()
-{
-    SpectrelApp* app = SpectrelApp::sharedApplication();
-    if (app && app->navController())
-        app->navController()->popViewController(Animation::Animated);
-}
-
 void QuickScreen::closeAlert()
 {
     if (!hasAlert())

@@ -86,8 +86,6 @@ public:
     /// The QML is there: it is told of every pane that is open already.
     Q_INVOKABLE void begin(double width, double height);
     Q_INVOKABLE void resize(double width, double height);
-    /// The back arrow: closes the top pane.
-    Q_INVOKABLE void back();
     Q_INVOKABLE void closeAlert();
     /// A row of the top pane, or all of them, onto the clipboard.
     Q_INVOKABLE void copyRow(int row);

@@ -53,22 +53,24 @@ void HelpView::open(bool plays)
 void HelpView::draw(Grid& grid) const
 {
     const std::size_t room = boxRoom(grid.height());
-    drawBox(grid, _lines, std::min(_top, _lines.size() > room ? _lines.size() - room : 0));
+    const auto lines = brokenForBox(_lines, grid.width());
+    drawBox(grid, lines, std::min(_top, lines.size() > room ? lines.size() - room : 0));
 }
 
 /// False when it does not move.
-bool HelpView::scroll(std::ptrdiff_t by, int height)
+bool HelpView::scroll(std::ptrdiff_t by, const Grid& screen)
 {
-    const auto room = static_cast<std::ptrdiff_t>(boxRoom(height));
-    const auto last = std::max<std::ptrdiff_t>(0, static_cast<std::ptrdiff_t>(_lines.size()) - room);
+    const auto room = static_cast<std::ptrdiff_t>(boxRoom(screen.height()));
+    const auto count = static_cast<std::ptrdiff_t>(brokenForBox(_lines, screen.width()).size());
+    const auto last = std::max<std::ptrdiff_t>(0, count - room);
     _top = static_cast<std::size_t>(
         std::clamp<std::ptrdiff_t>(std::min(static_cast<std::ptrdiff_t>(_top), last) + by, 0, last));
     return last > 0;
 }
 
-void HelpView::handle(const KeyEvent& event, int height)
+void HelpView::handle(const KeyEvent& event, const Grid& screen)
 {
-    const auto page = static_cast<std::ptrdiff_t>(boxRoom(height));
+    const auto page = static_cast<std::ptrdiff_t>(boxRoom(screen.height()));
     std::ptrdiff_t by = 0;
     if (event.key == Key::Down || event == KeyEvent {Key::Character, U'j'})
         by = 1;
@@ -78,16 +80,16 @@ void HelpView::handle(const KeyEvent& event, int height)
         by = page;
     else if (event.key == Key::PageUp)
         by = -page;
-    if (by == 0 || !scroll(by, height))
+    if (by == 0 || !scroll(by, screen))
         _isOpen = false;
 }
 
-void HelpView::handle(const MouseEvent& event, int height)
+void HelpView::handle(const MouseEvent& event, const Grid& screen)
 {
     if (event.action == MouseEvent::Action::Press)
         _isOpen = false;
     else // a turn of the wheel presses nothing
-        scroll(event.action == MouseEvent::Action::WheelUp ? -1 : 1, height);
+        scroll(event.action == MouseEvent::Action::WheelUp ? -1 : 1, screen);
 }
 
 } // namespace spectrel

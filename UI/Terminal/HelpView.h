@@ -19,12 +19,12 @@ public:
     /// `plays`: with the keys of a recording's time line.
     void open(bool plays);
     void draw(Grid& grid) const;
-    /// Scrolls where there is more to see; any other key closes it. `height` is the screen's.
-    void handle(const KeyEvent& event, int height);
-    void handle(const MouseEvent& event, int height);
+    /// Scrolls where there is more to see; any other key closes it. `screen` is what it was drawn on.
+    void handle(const KeyEvent& event, const Grid& screen);
+    void handle(const MouseEvent& event, const Grid& screen);
 
 private:
-    bool scroll(std::ptrdiff_t by, int height);
+    bool scroll(std::ptrdiff_t by, const Grid& screen);
 
     bool _isOpen = false;
     std::vector<std::string> _lines;

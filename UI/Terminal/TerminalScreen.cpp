@@ -98,7 +98,7 @@ bool TerminalScreen::coverTakes(const KeyEvent& event)
     }
     if (!_help.isOpen())
         return false;
-    _help.handle(event, _grid.height());
+    _help.handle(event, _grid);
     return true;
 }
 
@@ -111,7 +111,7 @@ bool TerminalScreen::coverTakes(const MouseEvent& event)
     }
     if (!_help.isOpen())
         return false;
-    _help.handle(event, _grid.height());
+    _help.handle(event, _grid);
     return true;
 }
 
@@ -218,7 +218,8 @@ const Grid& TerminalScreen::draw()
         drawPane(*app, *view);
     if (!_alerts.empty()) {
         const Alert& alert = _alerts.front();
-        drawBox(_grid, {alert.title, "", alert.message, "", "[" + alert.button + "]"}, 0);
+        const std::vector<std::string> lines {alert.title, "", alert.message, "", "[" + alert.button + "]"};
+        drawBox(_grid, brokenForBox(lines, _grid.width()), 0);
     } else if (_help.isOpen()) {
         _help.draw(_grid);
     }

@@ -1,4 +1,5 @@
 #include "Tests/UI/Quick/QuickFixture.h"
+#include "UI/Quick/PaneModel.h"
 
 #include <QAccessible>
 #include <QQuickItem>
@@ -19,6 +20,10 @@ protected:
     static Rect frame(const QQuickItem& item)
     {
         return {item.x(), item.y(), item.width(), item.height()};
+    }
+    PaneModel& pane() const
+    {
+        return *page()->property("pane").value<PaneModel*>();
     }
     double contentY() const
     {
@@ -113,6 +118,23 @@ TEST_F(PaneScreenTest, TouchingALeafOpensNothingAndLeavesNothingSelected)
     EXPECT_EQ(top().tableView().selectedRow(), std::nullopt);
 }
 
+TEST_F(PaneScreenTest, RowThatOpenedAPaneIsPlainAgainOnceThatIsClosed)
+{
+    open();
+    show(nested());
+    ASSERT_TRUE(waitFor([this] { return row(2); }));
+    const QQuickItem* const card = itemIn(*row(0), "card");
+    const auto colour = [card] { return card->property("color").value<QColor>().name().toStdString(); };
+    const std::string plain = colour();
+    touch(row(0));
+    EXPECT_NE(colour(), plain); // while its pane slides in
+    settle();
+    touch(item("back"));
+    settle();
+    ASSERT_EQ(openPaths(), "/ ");
+    EXPECT_EQ(colour(), plain);
+}
+
 TEST_F(PaneScreenTest, PageThatSlidesAwayTakesNoTouch)
 {
     open();
@@ -142,6 +164,30 @@ TEST_F(PaneScreenTest, ReloadChangesTheRowsInPlaceAndKeepsTheScrollPosition)
     EXPECT_EQ(contentY(), scrolled);
     EXPECT_EQ(row(middle), before);
     EXPECT_EQ(itemIn(*before, "value")->property("text").toString().toStdString(), "b" + std::to_string(middle));
+}
+
+TEST_F(PaneScreenTest, EveryRowInSightShowsItsOwnValueWhenRowsComeAndGoAboveThem)
+{
+    open();
+    show(manyLeaves(200, "v"));
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    drag(list(), {0, -320});
+    drag(list(), {0, -320});
+    settle();
+    const DictionaryRef more = Dictionary::make({});
+    for (int number = 0; number < 30; ++number)
+        more->set("New " + std::to_string(number), Value("n" + std::to_string(number)));
+    for (int number = 0; number < 200; ++number)
+        more->set("Leaf " + std::to_string(number), Value("v" + std::to_string(number)));
+    for (const Value& display : {Value(more), manyLeaves(200, "w")}) {
+        show(display);
+        waitForFrame();
+        settle();
+        const auto tree = treeRows();
+        EXPECT_GE(shownRows().size(), 10U);
+        for (const std::string& shown : shownRows())
+            EXPECT_THAT(tree, testing::Contains(shown));
+    }
 }
 
 TEST_F(PaneScreenTest, EveryRowInSightShowsItsOwnValueWhileScrolling)
@@ -274,6 +320,25 @@ TEST_F(PaneScreenTest, LongValueScrollsSidewaysInItsRowAndKeepsItsPlace)
     EXPECT_EQ(area->property("contentX").toDouble(), 0);
 }
 
+TEST_F(PaneScreenTest, LongValueKeepsItsPlaceInAScrolledListToo)
+{
+    open();
+    show(manyLeaves(100, std::string(200, 'x')));
+    ASSERT_TRUE(waitFor([this] { return row(3); }));
+    drag(list(), {0, -200});
+    settle();
+    const int middle = static_cast<int>(contentY() / 50) + 4;
+    drag(row(middle), {-150, 0});
+    QQuickItem* const area = itemIn(*row(middle), "area");
+    ASSERT_TRUE(waitFor([area] { return !area->property("moving").toBool(); }));
+    const double moved = area->property("contentX").toDouble();
+    EXPECT_GT(moved, 50);
+    for (int refresh = 0; refresh < 3; ++refresh) {
+        show(manyLeaves(100, std::string(200, 'y')));
+        EXPECT_EQ(area->property("contentX").toDouble(), moved);
+    }
+}
+
 TEST_F(PaneScreenTest, VerticalDragOverALongValueScrollsTheList)
 {
     open();
@@ -296,6 +361,129 @@ TEST_F(PaneScreenTest, TouchingALongValueIsATouchOfItsRow)
     touch(row(0));
     EXPECT_EQ(list()->property("currentIndex").toInt(), 0);
     EXPECT_EQ(openPaths(), "/ ");
+}
+
+class EdgeSwipeTest : public PaneScreenTest {
+protected:
+    /// Two panes are open over the root pane, the top one with long values.
+    void openPanes()
+    {
+        open();
+        show(panes("x"));
+        for (int level = 0; level < 2; ++level) {
+            ASSERT_TRUE(waitFor([this] { return row(0); }));
+            touch(row(0));
+            settle();
+        }
+        ASSERT_TRUE(waitFor([this] { return row(3); }));
+        ASSERT_EQ(openPaths(), Both);
+    }
+    static Value panes(const std::string& value)
+    {
+        return entries({{"One", entries({{"Two", manyLeaves(100, value + std::string(200, 'x'))}})}});
+    }
+
+    static constexpr const char* Both = "/ /One /One/Two ";
+    static constexpr QPointF Edge {4, 300};
+};
+
+TEST_F(EdgeSwipeTest, GoesBackPaneByPaneAndLeavesTheRootPane)
+{
+    openPanes();
+    for (const char* left : {"/ /One ", "/ ", "/ "}) {
+        drag(Edge, {160, 10});
+        EXPECT_EQ(openPaths(), left);
+        settle();
+    }
+}
+
+TEST_F(EdgeSwipeTest, ShortOrDrawnBackOrTakenAwayItDoesNothing)
+{
+    openPanes();
+    drag(Edge, {40, 0});
+    EXPECT_EQ(openPaths(), Both);
+    press(Edge);
+    moveFinger(Edge, Edge + QPointF(160, 0));
+    EXPECT_NE(item("edgeSign"), nullptr);
+    moveFinger(Edge + QPointF(160, 0), Edge + QPointF(20, 0));
+    release(Edge + QPointF(20, 0));
+    EXPECT_EQ(openPaths(), Both);
+    press(Edge);
+    moveFinger(Edge, Edge + QPointF(160, 0));
+    cancelTouch();
+    EXPECT_EQ(openPaths(), Both);
+    EXPECT_EQ(item("edgeSign"), nullptr);
+}
+
+TEST_F(EdgeSwipeTest, BesideTheEdgeAValueScrollsInstead)
+{
+    openPanes();
+    QQuickItem* const area = itemIn(*row(3), "area");
+    pane().scrollSideways(3, 120);
+    ASSERT_EQ(area->property("contentX").toDouble(), 120);
+    const double left = area->mapToScene({0, 0}).x();
+    drag({left + 1, row(3)->mapToScene({0, 25}).y()}, {160, 0});
+    ASSERT_TRUE(waitFor([area] { return !area->property("moving").toBool(); }));
+    EXPECT_LT(area->property("contentX").toDouble(), 120);
+    EXPECT_EQ(openPaths(), Both);
+}
+
+TEST_F(EdgeSwipeTest, AValueIsNotMovedByASwipeFromTheEdge)
+{
+    openPanes();
+    pane().scrollSideways(3, 120);
+    QQuickItem* const area = itemIn(*row(3), "area");
+    const QPointF from {4, row(3)->mapToScene({0, 25}).y()};
+    press(from);
+    moveFinger(from, from + QPointF(160, 0));
+    EXPECT_EQ(area->property("contentX").toDouble(), 120);
+    release(from + QPointF(160, 0));
+    EXPECT_EQ(openPaths(), "/ /One ");
+    settle();
+}
+
+TEST_F(EdgeSwipeTest, VerticalDragsAndTouchesAtTheEdgeAreTheLists)
+{
+    openPanes();
+    drag({15, 300}, {3, -200});
+    settle();
+    EXPECT_GT(contentY(), 50);
+    EXPECT_EQ(openPaths(), Both);
+    touch(item("back"));
+    settle();
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    const QPointF at {15, row(0)->mapToScene({0, 25}).y()};
+    press(at);
+    release(at);
+    EXPECT_EQ(openPaths(), Both);
+    settle();
+}
+
+TEST_F(EdgeSwipeTest, PaneThatVanishesDuringASwipeTakesNoOtherAlong)
+{
+    openPanes();
+    press(Edge);
+    moveFinger(Edge, Edge + QPointF(160, 0));
+    show(entries({{"One", entries({{"Other", "1"}})}}));
+    release(Edge + QPointF(160, 0));
+    settle();
+    EXPECT_EQ(openPaths(), "/ /One ");
+}
+
+TEST_F(PaneScreenTest, BackArrowOfAPageThatSlidesAwayClosesNoOtherPane)
+{
+    open();
+    show(nested());
+    for (int level = 0; level < 2; ++level) {
+        ASSERT_TRUE(waitFor([this] { return row(0); }));
+        touch(row(0));
+        settle();
+    }
+    const QPointF finger = press(item("back"));
+    show(entries({{"Cells", entries({})}}));
+    release(finger);
+    settle();
+    EXPECT_EQ(openPaths(), "/ /Cells ");
 }
 
 TEST_F(PaneScreenTest, KeyboardBrowsesAsAFingerDoes)
@@ -376,6 +564,64 @@ TEST_F(PaneScreenTest, AScreenReaderHearsWhatIsShown)
     EXPECT_EQ(QAccessible::queryAccessibleInterface(row(2))->role(), QAccessible::ListItem);
     EXPECT_EQ(spoken(item("save")), "Save snapshot");
     EXPECT_EQ(spoken(item("status")), "Connecting...");
+}
+
+TEST_F(PaneScreenTest, AScreenReaderHearsNoRowThatIsGone)
+{
+    open();
+    const auto spoken = [this] {
+        std::vector<std::string> rows;
+        const QAccessibleInterface* const rowsList = QAccessible::queryAccessibleInterface(list());
+        for (int index = 0; index < rowsList->childCount(); ++index) {
+            const QAccessibleInterface* const shown = rowsList->child(index);
+            if (shown->role() == QAccessible::ListItem && !shown->state().invisible)
+                rows.push_back(shown->text(QAccessible::Name).replace(", ", ": ").toStdString());
+        }
+        return rows;
+    };
+    show(manyLeaves(100, "v"));
+    ASSERT_TRUE(waitFor([this] { return row(0); }));
+    for (int swipe = 0; swipe < 3; ++swipe) {
+        drag(list(), {0, -330});
+        settle();
+        waitForFrame();
+        auto rows = shownRows();
+        rows.emplace_back("Leaf 0: v0"); // where the keyboard is: the list keeps it
+        EXPECT_THAT(spoken(), testing::UnorderedElementsAreArray(rows));
+    }
+    show(manyLeaves(3, "v"));
+    ASSERT_TRUE(waitFor([this] { return shownRows() == treeRows(); }));
+    waitForFrame();
+    EXPECT_THAT(spoken(), testing::UnorderedElementsAreArray(shownRows()));
+}
+
+TEST_F(PaneScreenTest, AScreenReaderFollowsTheKeyboardsRow)
+{
+    open();
+    show(nested());
+    ASSERT_TRUE(waitFor([this] { return row(2); }));
+    const auto isFocused = [this](int index) {
+        return QAccessible::queryAccessibleInterface(row(index))->state().focused == 1;
+    };
+    EXPECT_TRUE(isFocused(0));
+    key(Qt::Key_Down); // which only shows where the keyboard is
+    key(Qt::Key_Down);
+    EXPECT_FALSE(isFocused(0));
+    EXPECT_TRUE(isFocused(1));
+    show(entries({{"Empty", entries({})}}));
+    ASSERT_TRUE(waitFor([this] { return shownRows() == treeRows(); }));
+    key(Qt::Key_Home); // the keys are still the page's
+    EXPECT_TRUE(isFocused(0));
+    show(nested());
+    ASSERT_TRUE(waitFor([this] { return row(2); }));
+    key(Qt::Key_Home);
+    key(Qt::Key_Return);
+    EXPECT_EQ(openPaths(), "/ /Cells ");
+    settle();
+    key(Qt::Key_Escape);
+    EXPECT_EQ(openPaths(), "/ ");
+    settle();
+    EXPECT_TRUE(isFocused(0));
 }
 
 TEST_F(PaneScreenTest, ClosingTheWindowAsksToEndAndLeavesTheHidingToTheApplication)

@@ -212,13 +212,34 @@ QPointF QuickFixture::press(QQuickItem* target)
 {
     const QPointF at = target ? middleOf(*target) : QPointF();
     EXPECT_NE(target, nullptr);
-    QTest::touchEvent(&window(), _finger).press(0, at.toPoint(), &window());
+    press(at);
     return at;
+}
+
+void QuickFixture::press(QPointF at)
+{
+    QTest::touchEvent(&window(), _finger).press(0, at.toPoint(), &window());
+}
+
+void QuickFixture::moveFinger(QPointF from, QPointF to)
+{
+    constexpr int Steps = 10;
+    for (int step = 1; step <= Steps; ++step) {
+        QTest::touchEvent(&window(), _finger).move(0, (from + (to - from) * step / Steps).toPoint(), &window());
+        QTest::qWait(1); // a finger takes its time, or it would be a flick
+    }
 }
 
 void QuickFixture::release(QPointF at)
 {
     QTest::touchEvent(&window(), _finger).release(0, at.toPoint(), &window());
+}
+
+/// What a window system does that takes the finger for a gesture of its own.
+void QuickFixture::cancelTouch()
+{
+    QTouchEvent cancelling(QEvent::TouchCancel, _finger);
+    QCoreApplication::sendEvent(&window(), &cancelling);
 }
 
 void QuickFixture::touch(QQuickItem* target)
@@ -228,13 +249,15 @@ void QuickFixture::touch(QQuickItem* target)
 
 void QuickFixture::drag(QQuickItem* target, QPointF by)
 {
-    constexpr int Steps = 10;
-    const QPointF start = press(target);
-    for (int step = 1; step <= Steps; ++step) {
-        QTest::touchEvent(&window(), _finger).move(0, (start + by * step / Steps).toPoint(), &window());
-        QTest::qWait(1); // a finger takes its time, or it would be a flick
-    }
-    release(start + by);
+    ASSERT_NE(target, nullptr);
+    drag(middleOf(*target), by);
+}
+
+void QuickFixture::drag(QPointF from, QPointF by)
+{
+    press(from);
+    moveFinger(from, from + by);
+    release(from + by);
 }
 
 void QuickFixture::key(int key, int modifiers)

@@ -53,10 +53,14 @@ protected:
 
     void touch(QQuickItem* target);
     QPointF press(QQuickItem* target);
+    void press(QPointF at);
+    void moveFinger(QPointF from, QPointF to);
     void release(QPointF at);
     void cancelTouch();
     /// A finger drags from the middle of the item.
     void drag(QQuickItem* target, QPointF by);
+    /// A finger drags from that point of the window.
+    void drag(QPointF from, QPointF by);
     void key(int key, int modifiers = 0);
     void type(const std::string& text);
 

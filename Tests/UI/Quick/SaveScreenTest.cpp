@@ -68,6 +68,15 @@ TEST_F(SaveScreenTest, ListsEveryEntryWithACheckmark)
     EXPECT_EQ(rows->height(), rows->property("contentHeight").toDouble()); // sized to fit its contents
 }
 
+TEST_F(SaveScreenTest, ItsTitleIsWholeOnTheSmallestPhone)
+{
+    openSaveScreen();
+    window().resize(320, 480);
+    ASSERT_TRUE(waitFor([this] { return page()->width() == 320; }));
+    waitForFrame();
+    EXPECT_FALSE(item("saveTitle")->property("truncated").toBool());
+}
+
 TEST_F(SaveScreenTest, WritesTheDescriptionThatWasTypedButNotConfirmed)
 {
     openSaveScreen();

@@ -91,6 +91,16 @@ TEST_F(ToolsTest, FindThatIsClosedOpensNothing)
     waitUntilFindIsClosed();
 }
 
+TEST_F(ToolsTest, SwipeFromTheEdgeClosesTheSearch)
+{
+    openWithTree();
+    openFind();
+    type("pci");
+    drag(QPointF(4, 400), {160, 0});
+    waitUntilFindIsClosed();
+    EXPECT_EQ(openPaths(), "/ ");
+}
+
 TEST_F(ToolsTest, FindsFollowTheTree)
 {
     openWithTree();
@@ -144,6 +154,8 @@ TEST_F(ToolsTest, AboutSaysWhatItIs)
     ASSERT_TRUE(waitFor([this] { return item("aboutClose"); }));
     EXPECT_EQ(shownText("aboutName"), AboutText::text().name);
     EXPECT_EQ(shownText("aboutVersion"), AboutText::text().version);
+    const auto middle = [this](const char* name) { return item(name)->mapToScene({item(name)->width() / 2, 0}).x(); };
+    EXPECT_NEAR(middle("aboutMark"), middle("aboutName"), 1);
     touch(item("aboutClose"));
     EXPECT_TRUE(waitFor([this] { return !item("aboutClose"); }));
 }
@@ -185,6 +197,21 @@ TEST_F(PlaybackLineTest, ButtonsPlayStepSeekAndChangeTheSpeed)
         {"play", "play", "stepForward", "stepBack", "seekForward", "seekBack", "faster", "slower"})
         touch(item(button));
     EXPECT_EQ(takeCalls(), "play pause message+ message- seek 46000 seek 26000 speed 2 speed 1 ");
+}
+
+TEST_F(PlaybackLineTest, ItsButtonsAreInSightAndLargeEnoughOnTheSmallestPhone)
+{
+    window().resize(320, 480);
+    ASSERT_TRUE(waitFor([this] { return page()->width() == 320; }));
+    waitForFrame();
+    for (const char* name :
+        {"play", "stepForward", "stepBack", "seekForward", "seekBack", "faster", "slower", "playbackLine"}) {
+        const QPointF corner = item(name)->mapToScene({0, 0});
+        EXPECT_GE(corner.x(), 0) << name;
+        EXPECT_LE(corner.x() + item(name)->width(), 320) << name;
+        EXPECT_GE(item(name)->width(), 44) << name;
+        EXPECT_GE(item(name)->height(), 44) << name;
+    }
 }
 
 TEST_F(PlaybackLineTest, DraggingTheLineSeeksAndLeavesItFollowing)

@@ -47,6 +47,25 @@ TEST_F(HelpViewTest, InASmallWindowItScrolls)
     EXPECT_THAT(text(), Not(HasSubstr("more above")));
 }
 
+TEST_F(HelpViewTest, InANarrowWindowWhatAKeyDoesGoesOnBelow)
+{
+    open(36, 30);
+    EXPECT_THAT(text(), HasSubstr("│ /                 find a name or │"));
+    EXPECT_THAT(text(), HasSubstr("│                   value here and │"));
+    EXPECT_THAT(text(), HasSubstr("│ Live radio diagnostics: which    │"));
+    for (const int width : {20, 24, 40}) {
+        press(Key::Escape);
+        open(width, 12);
+        std::string seen;
+        for (int step = 0; step < 60; ++step) {
+            seen += text();
+            wheel(MouseEvent::Action::WheelDown);
+        }
+        for (const char* word : {"below", "pane", "allowed", "quit", "else"})
+            EXPECT_THAT(seen, HasSubstr(word)) << width;
+    }
+}
+
 TEST_F(HelpViewTest, EveryKeyIsReachedInEveryWindow)
 {
     for (const int height : {1, 2, 4, 5, 12}) {

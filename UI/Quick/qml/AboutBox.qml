@@ -40,7 +40,8 @@ Popup {
         Keys.onEnterPressed: box.close()
 
         Glyph {
-            x: (box.width - width) / 2
+            objectName: "aboutMark"
+            anchors.horizontalCenter: parent.horizontalCenter
             width: 48
             height: 48
             shape: Glyph.Mark

@@ -113,6 +113,11 @@ Popup {
             Accessible.role: Accessible.StaticText
             Accessible.name: text
         }
+        EdgeSwipe {
+            z: 1
+            height: parent.height
+            onSwiped: sheet.find.close()
+        }
         ListView {
             id: list
             objectName: "finds"
@@ -145,6 +150,8 @@ Popup {
                 Accessible.role: Accessible.Button
                 Accessible.name: name + ", " + value + ", " + panePath
                 Accessible.onPressAction: sheet.find.tap(index)
+                ListView.onPooled: visible = false
+                ListView.onReused: visible = true
 
                 Rectangle {
                     anchors.fill: parent

@@ -11,6 +11,7 @@ FocusScope {
     property bool showsCursor: false // the keyboard is in use
 
     readonly property real rowHeight: 50
+    readonly property real gapAbove: 4 // the first row
     readonly property real sidewaysStep: 80 // px
 
     Accessible.role: Accessible.Pane
@@ -28,7 +29,7 @@ FocusScope {
         id: titleBar
         width: parent.width
         pane: page.pane
-        onBackPressed: page.screen.back()
+        onBackPressed: page.pane.goBack()
         onFindPressed: page.screen.find.open()
         onMenuPressed: page.openMenu()
     }
@@ -47,7 +48,7 @@ FocusScope {
         boundsBehavior: Flickable.DragOverBounds
         keyNavigationEnabled: false
         highlightFollowsCurrentItem: false
-        header: Item { height: 4 }
+        header: Item { height: page.gapAbove }
         footer: Item { height: Theme.margin }
         ScrollBar.vertical: ScrollBar { }
         Accessible.role: Accessible.List
@@ -70,12 +71,15 @@ FocusScope {
         }
 
         onContentYChanged: tellVisibleRows()
+        onOriginYChanged: tellVisibleRows()
         onHeightChanged: tellVisibleRows()
         onWidthChanged: tellVisibleRows()
         Component.onCompleted: tellVisibleRows()
 
         function tellVisibleRows() {
-            const first = Math.max(0, Math.floor(contentY / page.rowHeight));
+            // The list moves its origin rather than the rows in sight when rows come or go above them.
+            const top = contentY - originY - page.gapAbove;
+            const first = Math.max(0, Math.floor(top / page.rowHeight));
             const room = Math.ceil(height / page.rowHeight) + 1;
             page.pane.setVisibleRows(first, room, width - 1.5 * Theme.margin - 4);
         }
@@ -85,6 +89,12 @@ FocusScope {
         anchors.bottom: parent.bottom
         width: parent.width
         pane: page.pane
+    }
+
+    EdgeSwipe {
+        height: parent.height
+        enabled: !page.pane.isRoot
+        onSwiped: page.pane.goBack()
     }
 
     ActionMenu { id: menu }
@@ -122,11 +132,11 @@ FocusScope {
             return;
         case Qt.Key_Left:
             if (!pane.scrollSideways(list.currentIndex, -sidewaysStep))
-                screen.back();
+                pane.goBack();
             return;
         case Qt.Key_Backspace:
         case Qt.Key_Escape:
-        case Qt.Key_Back: return screen.back();
+        case Qt.Key_Back: return pane.goBack();
         }
         event.accepted = screen.playback.isThere && playbackKey(event.text);
     }

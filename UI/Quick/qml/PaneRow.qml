@@ -33,6 +33,7 @@ Item {
     // Rounded where the card begins and ends, straight between.
     Rectangle {
         id: card
+        objectName: "card"
         readonly property color shown: row.isPressed || row.pane.selectedRow === row.index ? Theme.pressed : Theme.surface
         anchors.fill: parent
         radius: row.index === 0 || row.isLast ? Theme.radius : 0
@@ -51,7 +52,7 @@ Item {
         visible: !row.isLast
         anchors.bottom: parent.bottom
         anchors.left: parent.left
-        anchors.leftMargin: Theme.margin / 2 + 10
+        anchors.leftMargin: Theme.edge - Theme.margin + 10
         anchors.right: parent.right
         height: 1
         color: Theme.line
@@ -72,7 +73,7 @@ Item {
         id: area
         objectName: "area"
         anchors.fill: parent
-        anchors.leftMargin: Theme.margin / 2
+        anchors.leftMargin: Theme.edge - Theme.margin
         anchors.rightMargin: Theme.margin + 4
         contentWidth: row.rowContentWidth
         contentHeight: height
@@ -168,7 +169,12 @@ Item {
     }
 
     onRowContentOffsetChanged: takeOffset()
-    ListView.onReused: takeOffset()
+    // A row that waits to be used again is only out of the picture; a screen reader would still find it.
+    ListView.onPooled: visible = false
+    ListView.onReused: {
+        visible = true;
+        takeOffset();
+    }
 
     function takeOffset() {
         if (!area.moving && area.contentX !== rowContentOffset)

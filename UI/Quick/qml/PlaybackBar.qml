@@ -9,8 +9,14 @@ Rectangle {
 
     required property PlaybackModel playback
 
-    implicitHeight: 112
+    implicitHeight: 118
     color: Theme.surface
+
+    component BarButton: IconButton {
+        Layout.fillWidth: true // they share the width of a window too narrow for all
+        Layout.preferredWidth: 1
+        size: 20
+    }
 
     Rectangle {
         width: parent.width
@@ -63,7 +69,7 @@ Rectangle {
         anchors.top: texts.bottom
         x: 12
         width: parent.width - 24
-        height: 32
+        height: 44
         focusPolicy: Qt.TabFocus
         value: bar.playback.fraction
         stepSize: 0
@@ -106,55 +112,50 @@ Rectangle {
     RowLayout {
         anchors.bottom: parent.bottom
         anchors.horizontalCenter: parent.horizontalCenter
+        width: Math.min(parent.width, 7 * Theme.touch)
         height: Theme.touch
         spacing: 0
 
-        IconButton {
+        BarButton {
             objectName: "slower"
             shape: Glyph.Minus
-            size: 20
             text: qsTr("Slower")
             onClicked: bar.playback.changeSpeed(-1)
         }
-        IconButton {
+        BarButton {
             objectName: "seekBack"
             shape: Glyph.SkipBack
-            size: 20
             text: qsTr("Ten seconds back")
             onClicked: bar.playback.seekStep(-1)
         }
-        IconButton {
+        BarButton {
             objectName: "stepBack"
             shape: Glyph.StepBack
-            size: 20
             text: qsTr("One message back")
             onClicked: bar.playback.stepMessage(-1)
         }
-        IconButton {
+        BarButton {
             objectName: "play"
             shape: bar.playback.isPlaying ? Glyph.Pause : Glyph.Play
             size: 26
             text: bar.playback.isPlaying ? qsTr("Pause") : qsTr("Play")
             onClicked: bar.playback.togglePlaying()
         }
-        IconButton {
+        BarButton {
             objectName: "stepForward"
             shape: Glyph.StepForward
-            size: 20
             text: qsTr("One message on")
             onClicked: bar.playback.stepMessage(1)
         }
-        IconButton {
+        BarButton {
             objectName: "seekForward"
             shape: Glyph.SkipForward
-            size: 20
             text: qsTr("Ten seconds on")
             onClicked: bar.playback.seekStep(1)
         }
-        IconButton {
+        BarButton {
             objectName: "faster"
             shape: Glyph.Plus
-            size: 20
             text: qsTr("Faster")
             onClicked: bar.playback.changeSpeed(1)
         }

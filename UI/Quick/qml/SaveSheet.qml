@@ -83,8 +83,11 @@ Popup {
             }
             Text {
                 Layout.fillWidth: true
+                objectName: "saveTitle"
                 text: qsTr("Save Snapshot")
                 font.pixelSize: 17
+                fontSizeMode: Text.HorizontalFit
+                minimumPixelSize: 12
                 font.bold: true
                 color: Theme.text
                 elide: Text.ElideRight
@@ -147,7 +150,7 @@ Popup {
             anchors.topMargin: 6
             x: Theme.margin
             width: parent.width - 2 * Theme.margin
-            height: Math.min(contentHeight, parent.height - y - Theme.margin)
+            height: Math.max(0, Math.min(contentHeight, parent.height - y - Theme.margin))
             clip: true
             model: sheet.save
             boundsBehavior: Flickable.StopAtBounds
@@ -167,6 +170,7 @@ Popup {
                 height: 46
                 Accessible.role: Accessible.ListItem
                 Accessible.name: entryText
+                Accessible.checkable: true
                 Accessible.checked: isChecked
 
                 Rectangle {

@@ -20,6 +20,7 @@ QtObject {
 
     readonly property real touch: 48 // px, the least height and width of what a thumb presses
     readonly property real margin: 12
+    readonly property real edge: 1.5 * margin // px, from the left edge to what scrolls sideways
     readonly property real radius: 12
     readonly property real columnWidth: 760 // px, the widest that a column of rows gets
 
