@@ -7,8 +7,6 @@
 #include "Telephony/Simulator/GSMUMTSWorld.h"
 
 #include <cmath>
-#include <cstdio>
-#include <string>
 
 namespace spectrel {
 
@@ -76,21 +74,13 @@ DictionaryRef gsmNeighbour(const GSMCell& cell, bool isMeasured)
     return dictionary;
 }
 
-std::string hexadecimal(const char* format, unsigned first, unsigned second = 0)
-{
-    char text[32];
-    std::snprintf(text, sizeof text, format, first, second);
-    return text;
-}
-
 } // namespace
 
 Bytes gsmumtsSIMFilesRecord(const MobilityManagement& mobility, Moment time)
 {
     const Place& routing = mobility.knownRouting();
-    const std::string location = hexadecimal("00F110 %04X FE", mobility.knownLocation().locationArea);
-    const std::string packets = hexadecimal("00F110 %04X %02X", routing.locationArea, routing.routingArea);
-    return simFilesRecord(time, {location, packets, "UTRAN preferred"});
+    return simFilesRecord(
+        time, {mobility.knownLocation().locationArea, routing.locationArea, routing.routingArea, "UTRAN preferred"});
 }
 
 Bytes gsmumtsCellInformationRecord(const GSMUMTSWorld& world, Moment time)
@@ -111,21 +101,9 @@ Bytes gsmumtsCellInformationRecord(const GSMUMTSWorld& world, Moment time)
 
 Bytes packetContextsRecord(const GSMUMTSWorld& world, Moment time)
 {
-    auto contexts = List::make();
-    if (world.now().hasSession) {
-        contexts->append(Dictionary::make({
-            {"Context ID", "5"},
-            {"APN", "internet.test"},
-            {"Type", "IPv4"},
-            {"Address", "192.0.2.17"},
-            {"NSAPI", "5"},
-            {"Traffic Class", "Interactive"},
-            {"State", "Active"},
-            {"Bytes Received", std::to_string(world.bytesReceived())},
-            {"Bytes Sent", std::to_string(world.bytesSent())},
-        }));
-    }
-    return propertyListRecord(0xFF0002, contexts, time);
+    if (!world.now().hasSession)
+        return propertyListRecord(0xFF0002, List::make(), time);
+    return packetContextRecord(world.bytesReceived(), world.bytesSent(), time);
 }
 
 } // namespace spectrel

@@ -7,6 +7,7 @@
 #include "Telephony/Encoders/RecordWriter.h"
 #include "Telephony/Simulator/LTEWorld.h"
 
+#include <cstdio>
 #include <string>
 
 namespace spectrel {
@@ -30,6 +31,14 @@ DictionaryRef cellDictionary(const LTECell& cell, std::string_view type)
     return dictionary;
 }
 
+/// A test network's area: MCC 001, MNC 01, its location area, and what follows.
+std::string areaText(unsigned locationArea, unsigned last)
+{
+    char text[32];
+    std::snprintf(text, sizeof text, "00F110 %04X %02X", locationArea, last);
+    return text;
+}
+
 } // namespace
 
 Bytes propertyListRecord(std::uint32_t code, const Value& payload, Moment time)
@@ -46,8 +55,8 @@ Bytes simFilesRecord(Moment time, const SIMFiles& files)
             {"kSimFile_MSISDN", "+10015550100"},
             {"kSimFile_MBDN", "+10015550199"},
             {"kSimFile_HPPLMN", "60 min"},
-            {"kSimFile_LOCI", files.location},
-            {"kSimFile_PSLOCI", files.packetLocation},
+            {"kSimFile_LOCI", areaText(files.locationArea, 0xFE)},
+            {"kSimFile_PSLOCI", areaText(files.packetLocationArea, files.routingArea)},
             {"kSimFile_ACC", "0001"},
             {"kSimFile_AD", "80 00 00 02"},
             {"kSimFile_FPLMN", "001-02, 001-03"},
@@ -66,6 +75,23 @@ Bytes lteCellInformationRecord(const LTEWorld& world, Moment time)
     for (const LTECell* neighbour : world.neighbours(NeighboursTold))
         cells->append(cellDictionary(*neighbour, kRKCellMonitorCellTypeNeighbor));
     return propertyListRecord(0xFF0001, cells, time);
+}
+
+Bytes packetContextRecord(std::uint64_t bytesReceived, std::uint64_t bytesSent, Moment time)
+{
+    return propertyListRecord(0xFF0002,
+        List::make({Dictionary::make({
+            {"Context ID", "5"},
+            {"APN", "internet.test"},
+            {"Type", "IPv4"},
+            {"Address", "192.0.2.17"},
+            {"NSAPI", "5"},
+            {"Traffic Class", "Interactive"},
+            {"State", "Active"},
+            {"Bytes Received", std::to_string(bytesReceived)},
+            {"Bytes Sent", std::to_string(bytesSent)},
+        })}),
+        time);
 }
 
 Bytes contextsRecord(std::uint64_t bytesReceived, std::uint64_t bytesSent, Moment time)

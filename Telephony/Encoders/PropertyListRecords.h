@@ -16,8 +16,9 @@ Bytes propertyListRecord(std::uint32_t code, const Value& payload, Moment time);
 
 /// What a phone changes on its SIM.
 struct SIMFiles {
-    std::string_view location = "00F110 04B1 FE"; // EF-LOCI: where calls reach it
-    std::string_view packetLocation = "00F110 04B1 01";
+    std::uint16_t locationArea = 1201; // EF-LOCI: where calls reach it
+    std::uint16_t packetLocationArea = 1201; // EF-PSLOCI: where packets do
+    std::uint8_t routingArea = 1;
     std::string_view ratMode = "LTE preferred";
 };
 
@@ -27,7 +28,10 @@ Bytes simFilesRecord(Moment time, const SIMFiles& files = {});
 /// 0xFF0001: the serving cell and its strongest neighbours.
 Bytes lteCellInformationRecord(const LTEWorld& world, Moment time);
 
-/// 0xFF0002: the packet data contexts, with what they have transferred.
+/// 0xFF0002: the one context of a phone before LTE, with what it has transferred.
+Bytes packetContextRecord(std::uint64_t bytesReceived, std::uint64_t bytesSent, Moment time);
+
+/// 0xFF0002: an LTE phone's contexts, with what they have transferred.
 Bytes contextsRecord(std::uint64_t bytesReceived, std::uint64_t bytesSent, Moment time);
 
 } // namespace spectrel

@@ -118,6 +118,11 @@ Bytes utranTransportChannelRecord(const TransportReport& report, Moment time)
     return record.take();
 }
 
+Bytes utranSIMFilesRecord(const UTRANCell& cell, Moment time)
+{
+    return simFilesRecord(time, {cell.locationArea, cell.locationArea, 1, "UTRAN preferred"});
+}
+
 Bytes utranCellInformationRecord(const UTRANWorld& world, Moment time)
 {
     auto cells = List::make({cellDictionary(world.servingCell(), kRKCellMonitorCellTypeServing)});

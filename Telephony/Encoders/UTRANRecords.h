@@ -26,6 +26,9 @@ Bytes utranGSMNeighbourRecord(std::span<const GSMNeighbour> cells, Moment time);
 /// ones have 8 and begin at byte 289, 34 bytes later for each transport channel.
 Bytes utranTransportChannelRecord(const TransportReport& report, Moment time);
 
+/// 0xFF0000: the SIM's files, which know the serving cell's location area.
+Bytes utranSIMFilesRecord(const UTRANCell& cell, Moment time);
+
 /// 0xFF0001: the serving cell and its strongest neighbours.
 Bytes utranCellInformationRecord(const UTRANWorld& world, Moment time);
 

@@ -17,12 +17,19 @@ Bytes transportChannels(const UTRANWorld& world, Moment time)
     return report.channels.empty() ? Bytes() : utranTransportChannelRecord(report, time);
 }
 
-constexpr std::array<Cadence<UTRANWorld>, 8> Cadences {{
-    {30s, true, [](const UTRANWorld&, Moment time) { return simFilesRecord(time); }},
+/// Those of an ended connection would stay on the screen.
+Bytes noTransportChannels(const UTRANWorld& world, Moment time)
+{
+    const TransportReport report = world.transportChannels();
+    return report.channels.empty() ? utranTransportChannelRecord(report, time) : Bytes();
+}
+
+constexpr std::array<Cadence<UTRANWorld>, 9> Cadences {{
+    {30s, true, [](const UTRANWorld& world, Moment time) { return utranSIMFilesRecord(world.servingCell(), time); }},
     {5s, true, [](const UTRANWorld& world, Moment time) { return utranCellInformationRecord(world, time); }},
     {2s, true,
         [](const UTRANWorld& world, Moment time) {
-            return contextsRecord(world.bytesReceived(), world.bytesSent(), time);
+            return packetContextRecord(world.bytesReceived(), world.bytesSent(), time);
         }},
     {500ms, true,
         [](const UTRANWorld& world, Moment time) { return utranRRCRecord(world.mode(), world.isInService(), time); }},
@@ -34,6 +41,7 @@ constexpr std::array<Cadence<UTRANWorld>, 8> Cadences {{
     {2s, true,
         [](const UTRANWorld& world, Moment time) { return utranGSMNeighbourRecord(world.gsmNeighbours(), time); }},
     {400ms, false, transportChannels},
+    {2s, false, noTransportChannels},
 }};
 
 } // namespace

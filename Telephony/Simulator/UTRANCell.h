@@ -16,10 +16,11 @@ struct UTRANCell {
     double rscp = -130; // dBm, of its common control channel, now
 };
 
-/// What the network broadcasts for reselection (3GPP TS 25.304, 5.2.3 and 5.2.6), the same in every cell.
+/// What the network broadcasts for reselection (3GPP TS 25.304, 5.2.3 and 5.2.6), the same in every cell. It broadcasts
+/// no Sintrasearch: a phone measures the serving cell's channel always.
 namespace UTRANThresholds {
 constexpr double LeastRSCP = -103; // dBm, Qrxlevmin
-constexpr double SearchBelow = 50; // dB of Srxlev, Sintrasearch
+constexpr double SearchBelow = 50; // dB of Srxlev, Sintersearch
 constexpr double Hysteresis = 4; // dB, Qhyst1s
 } // namespace UTRANThresholds
 

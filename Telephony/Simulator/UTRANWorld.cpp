@@ -140,14 +140,14 @@ void UTRANWorld::measure()
 void UTRANWorld::reselect(std::chrono::milliseconds step)
 {
     const auto others = otherCells();
-    const UTRANCell& best = *others.front();
-    const auto index = static_cast<std::size_t>(&best - _cells.data());
-    const bool isRankedAbove = receiveLevel() <= UTRANThresholds::SearchBelow && best.rscp > UTRANThresholds::LeastRSCP
-        && best.rscp > servingCell().rscp + UTRANThresholds::Hysteresis;
+    const auto best = std::ranges::find_if(others, [this](const UTRANCell* cell) { return isMeasured(*cell); });
+    const bool isRankedAbove = best != others.end() && (*best)->rscp > UTRANThresholds::LeastRSCP
+        && (*best)->rscp > servingCell().rscp + UTRANThresholds::Hysteresis;
     if (!isRankedAbove) {
         _candidateFor = 0ms;
         return;
     }
+    const auto index = static_cast<std::size_t>(*best - _cells.data());
     _candidateFor = index == _candidate ? _candidateFor + step : step;
     _candidate = index;
     if (_candidateFor >= ReselectionTime) {
@@ -172,6 +172,17 @@ bool UTRANWorld::isNamed(const UTRANCell& cell) const
     return between(cell.position, servingCell().position) <= NamedDistance;
 }
 
+bool UTRANWorld::isMeasured(const UTRANCell& cell) const
+{
+    return cell.channel == servingCell().channel || _connection.isOnDedicatedChannel()
+        || receiveLevel() <= UTRANThresholds::SearchBelow;
+}
+
+bool UTRANWorld::isDetected(const UTRANCell& cell) const
+{
+    return _connection.isOnDedicatedChannel() && cell.channel == servingCell().channel && cell.rscp > Detectable;
+}
+
 std::vector<UTRANNeighbour> UTRANWorld::neighbours() const
 {
     std::vector<UTRANNeighbour> told;
@@ -182,12 +193,13 @@ std::vector<UTRANNeighbour> UTRANWorld::neighbours() const
     };
     if (_connection.isOnDedicatedChannel())
         tell(servingCell(), UTRANCellSet::Active);
-    if (receiveLevel() > UTRANThresholds::SearchBelow)
-        return told;
     for (const UTRANCell* cell : otherCells()) {
-        const bool isMonitored = isNamed(*cell);
-        if (cell->rscp > (isMonitored ? Audible : Detectable) && told.size() < NeighboursTold)
-            tell(*cell, isMonitored ? UTRANCellSet::Monitored : UTRANCellSet::Detected);
+        if (told.size() == NeighboursTold)
+            break;
+        if (!isNamed(*cell) && isDetected(*cell))
+            tell(*cell, UTRANCellSet::Detected);
+        else if (isNamed(*cell) && isMeasured(*cell) && cell->rscp > Audible)
+            tell(*cell, UTRANCellSet::Monitored);
     }
     return told;
 }

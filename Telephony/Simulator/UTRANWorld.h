@@ -39,8 +39,9 @@ public:
     }
     /// The other cells, strongest first.
     std::vector<const UTRANCell*> otherCells() const;
-    /// In a connection the serving cell is the active set. Of the others those that the network names are monitored
-    /// whenever the serving cell has fallen far enough, and strong ones that it does not name are detected.
+    /// The cells that the network names are monitored: those on the serving cell's channel always, those on others on a
+    /// dedicated channel or when the serving cell has fallen far enough. On a dedicated channel the serving cell is the
+    /// active set, and strong cells on its channel that the network does not name are detected.
     std::vector<UTRANNeighbour> neighbours() const;
     /// Strongest first.
     std::vector<GSMNeighbour> gsmNeighbours() const;
@@ -60,6 +61,8 @@ private:
     void measure();
     void reselect(std::chrono::milliseconds step);
     bool isNamed(const UTRANCell& cell) const;
+    bool isMeasured(const UTRANCell& cell) const;
+    bool isDetected(const UTRANCell& cell) const;
     void controlPower();
 
     Dice _dice;

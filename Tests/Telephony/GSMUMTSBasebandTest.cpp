@@ -1,13 +1,8 @@
-#include "Telephony/Encoders/RecordWriter.h"
-#include "Telephony/Simulator/Baseband.h"
-
 #include "Platform/Dictionary.h"
 #include "Platform/List.h"
-#include "Platform/PropertyList.h"
-#include "Tests/Telephony/RecordBytes.h"
+#include "Tests/Telephony/BasebandFixture.h"
 
-#include <gtest/gtest.h>
-#include <map>
+#include <array>
 #include <set>
 
 namespace spectrel {
@@ -19,50 +14,12 @@ constexpr std::array<std::uint32_t, 28> Catalogue {0x4005, 0x4031, 0x4116, 0x412
     0x5072, 0x5076, 0x512C, 0x5134, 0x5137, 0x51F4, 0x51F5, 0x51F6, 0x51F8, 0x51FB, 0x51FD, 0x51FF, 0x7130, 0x7131,
     0x7132, 0x7135, 0x7150, 0xFF0000, 0xFF0001, 0xFF0002};
 
-class GSMUMTSBasebandTest : public testing::Test {
+class GSMUMTSBasebandTest : public BasebandFixture {
 protected:
-    void SetUp() override
+    GSMUMTSBasebandTest()
+        : BasebandFixture(Technology::GSM)
     {
-        start(Scene::Drive, 1);
     }
-    void start(Scene scene, std::uint32_t seed)
-    {
-        _baseband = makeBaseband(Technology::GSM, scene, seed);
-        _now = Epoch1980;
-        records.clear();
-    }
-    void drive(std::chrono::milliseconds time)
-    {
-        for (auto step = 0ms; step < time; step += Baseband::Step) {
-            _now += Baseband::Step;
-            _baseband->advance(_now, [this](ByteView record) { keep(record); });
-        }
-    }
-    void greet()
-    {
-        _baseband->greet(_now, [this](ByteView record) { keep(record); });
-    }
-    std::size_t count(std::uint32_t code) const
-    {
-        return records.contains(code) ? records.at(code).size() : 0;
-    }
-    static Value propertyList(const Bytes& record)
-    {
-        return parsePropertyList(ByteView(record).subspan(13)).value_or(Value());
-    }
-
-    std::map<std::uint32_t, std::vector<Bytes>> records;
-
-private:
-    void keep(ByteView record)
-    {
-        std::uint32_t code = 0;
-        ASSERT_TRUE(routedCode(record, code));
-        records[code].emplace_back(record.begin(), record.end());
-    }
-
-    std::unique_ptr<Baseband> _baseband;
-    Moment _now = Epoch1980;
 };
 
 TEST_F(GSMUMTSBasebandTest, ItIsTheOneOfItsTechnology)

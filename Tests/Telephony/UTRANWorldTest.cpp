@@ -47,32 +47,84 @@ TEST(UTRANWorldTest, PhoneMovesByTheRankingOnly)
     int moves = 0;
     for (int step = 0; step < Drive; ++step) {
         const UTRANCell& last = world.servingCell();
+        const RRCMode mode = world.mode();
         world.advance(100ms);
         if (&world.servingCell() == &last)
             continue;
         ++moves;
         EXPECT_GT(world.servingCell().rscp, last.rscp + UTRANThresholds::Hysteresis);
         EXPECT_GT(world.servingCell().rscp, UTRANThresholds::LeastRSCP);
-        EXPECT_LE(last.rscp - UTRANThresholds::LeastRSCP, UTRANThresholds::SearchBelow);
+        if (mode != RRCMode::CellDCH && world.servingCell().channel != last.channel) {
+            EXPECT_LE(last.rscp - UTRANThresholds::LeastRSCP, UTRANThresholds::SearchBelow);
+        }
     }
     EXPECT_GE(moves, 10);
 }
 
-TEST(UTRANWorldTest, NeighboursAreMeasuredWhenTheServingCellHasFallen)
+/// The told cells beside the serving one.
+std::vector<UTRANNeighbour> others(const UTRANWorld& world)
+{
+    auto told = world.neighbours();
+    std::erase_if(told, [](const UTRANNeighbour& cell) { return cell.set == UTRANCellSet::Active; });
+    return told;
+}
+
+bool hasOtherChannel(const UTRANWorld& world)
+{
+    return std::ranges::any_of(
+        others(world), [&world](const UTRANNeighbour& cell) { return cell.channel != world.servingCell().channel; });
+}
+
+TEST(UTRANWorldTest, IdlePhoneMeasuresItsOwnChannelUnderTheMastToo)
 {
     UTRANWorld world(Scene::Drive, 1);
-    int measured = 0;
+    int near = 0;
+    int withNeighbours = 0;
     for (int step = 0; step < Drive; ++step) {
         world.advance(100ms);
-        const auto neighbours = world.neighbours();
-        const auto others = std::ranges::count_if(
-            neighbours, [](const UTRANNeighbour& cell) { return cell.set != UTRANCellSet::Active; });
-        if (world.receiveLevel() > UTRANThresholds::SearchBelow) {
-            EXPECT_EQ(others, 0);
-        }
-        measured += others > 0 ? 1 : 0;
+        if (world.mode() == RRCMode::CellDCH || world.receiveLevel() <= UTRANThresholds::SearchBelow)
+            continue;
+        ++near;
+        withNeighbours += others(world).empty() ? 0 : 1;
+        EXPECT_FALSE(hasOtherChannel(world)) << "those wait until the serving cell has fallen";
     }
-    EXPECT_GT(measured, Drive / 4);
+    EXPECT_GT(near, 100);
+    EXPECT_GT(withNeighbours, near / 2);
+}
+
+TEST(UTRANWorldTest, OtherChannelsAreMeasuredOnceTheServingCellHasFallenOrOnADedicatedChannel)
+{
+    UTRANWorld world(Scene::Drive, 1);
+    int fallen = 0;
+    int dedicated = 0;
+    for (int step = 0; step < Drive; ++step) {
+        world.advance(100ms);
+        if (!hasOtherChannel(world))
+            continue;
+        const bool hasFallen = world.receiveLevel() <= UTRANThresholds::SearchBelow;
+        fallen += hasFallen && world.mode() != RRCMode::CellDCH ? 1 : 0;
+        dedicated += !hasFallen ? 1 : 0;
+        EXPECT_TRUE(hasFallen || world.mode() == RRCMode::CellDCH);
+    }
+    EXPECT_GT(fallen, 100);
+    EXPECT_GT(dedicated, 100);
+}
+
+TEST(UTRANWorldTest, CellsAreDetectedOnTheOwnChannelOfADedicatedOneOnly)
+{
+    UTRANWorld world(Scene::Drive, 1);
+    int detected = 0;
+    for (int step = 0; step < Drive; ++step) {
+        world.advance(100ms);
+        for (const UTRANNeighbour& cell : world.neighbours()) {
+            if (cell.set != UTRANCellSet::Detected)
+                continue;
+            ++detected;
+            EXPECT_EQ(world.mode(), RRCMode::CellDCH);
+            EXPECT_EQ(cell.channel, world.servingCell().channel);
+        }
+    }
+    EXPECT_GT(detected, 100);
 }
 
 TEST(UTRANWorldTest, ServingCellIsTheActiveSetOfADedicatedChannel)

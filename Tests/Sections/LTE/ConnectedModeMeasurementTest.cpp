@@ -161,6 +161,14 @@ TEST_F(MeasuredNeighborCellsTest, RecordOf28BytesKeepsTheList)
     EXPECT_EQ(log(), MeasuredTrace);
 }
 
+TEST_F(MeasuredNeighborCellsTest, EveryBitOfTheCountCountsAndNoOther)
+{
+    for (unsigned bit = 0; bit < 24; ++bit) { // bytes 26 to 28
+        deliver(Code, RecordBuilder(Code, 29).u8(26 + bit / 8, 1u << bit % 8));
+        EXPECT_EQ(shownCount(), bit >= 8 && bit < 16 ? 1u << (bit - 8) : 0u) << bit;
+    }
+}
+
 TEST_F(MeasuredNeighborCellsTest, CountBeyondTheRecordReadsZeros)
 {
     deliver(Code, RecordBuilder(Code, 31).u8(27, 255).u16(29, 7));
@@ -208,6 +216,16 @@ TEST_F(DetectedCellsTest, NoneDetectedEmptiesTheListWhateverIsMeasured)
     deliver(Code, twoMeasuredOneDetected());
     deliver(Code, twoMeasuredOneDetected().u8(28, 0));
     EXPECT_EQ(display(), "[]");
+}
+
+TEST_F(DetectedCellsTest, EveryBitOfTheCountCountsAndNoOther)
+{
+    for (unsigned bit = 0; bit < 24; ++bit) { // bytes 27 to 29
+        deliver(Code, RecordBuilder(Code, 30).u8(27 + bit / 8, 1u << bit % 8));
+        EXPECT_EQ(shownCount(), bit >= 8 && bit < 16 ? 1u << (bit - 8) : 0u) << bit;
+    }
+    deliver(Code, RecordBuilder(Code, 29).u8(28, 255));
+    EXPECT_EQ(shownCount(), 255u);
 }
 
 TEST_F(DetectedCellsTest, RecordOf28BytesKeepsTheList)

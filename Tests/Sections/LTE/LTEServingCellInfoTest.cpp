@@ -2,7 +2,10 @@
 
 #include "Platform/List.h"
 #include "Platform/TelephonyConstants.h"
+#include "Tests/Sections/BitSweep.h"
 #include "Tests/Sections/SectionFixture.h"
+
+#include <map>
 
 namespace spectrel {
 namespace {
@@ -72,14 +75,49 @@ TEST_F(LTEServingCellInfoTest, KeysAreWrittenInOrder)
         "\"Tracking Area Code\": \"65534\", \"Freq Band Indicator\": \"3\"}");
 }
 
-TEST_F(LTEServingCellInfoTest, BandwidthIsNamedByItsResourceBlocks)
+std::string bandwidth(unsigned resourceBlocks)
 {
-    const std::pair<int, const char*> bandwidths[] = {{6, "1.4 MHz"}, {15, "3 MHz"}, {25, "5 MHz"}, {50, "10 MHz"},
-        {75, "15 MHz"}, {100, "20 MHz"}, {0, "Unknown"}, {7, "Unknown"}, {255, "Unknown"}};
-    for (const auto& [resourceBlocks, name] : bandwidths) {
-        deliver(0xB0C2, servingCell().u8(20, static_cast<std::uint32_t>(resourceBlocks)).u8(21, 6));
-        EXPECT_EQ(shown("Download Bandwidth"), "\"" + std::string(name) + "\"") << resourceBlocks;
-        EXPECT_EQ(shown("Upload Bandwidth"), "\"1.4 MHz\"");
+    static const std::map<unsigned, const char*> names {
+        {6, "1.4 MHz"}, {15, "3 MHz"}, {25, "5 MHz"}, {50, "10 MHz"}, {75, "15 MHz"}, {100, "20 MHz"}};
+    const auto name = names.find(resourceBlocks);
+    return name == names.end() ? "Unknown" : name->second;
+}
+
+TEST_F(LTEServingCellInfoTest, EveryBitShowsInItsOwnField)
+{
+    const BitSweep sweep(
+        {
+            {"Physical Cell ID", 14, 0, 16, plain},
+            {"Download Frequency", 16, 0, 16, plain},
+            {"Upload Frequency", 18, 0, 16, plain},
+            {"Download Bandwidth", 20, 0, 8, bandwidth},
+            {"Upload Bandwidth", 21, 0, 8, bandwidth},
+            {"Cell Identity", 22, 0, 32, plain},
+            {"Tracking Area Code", 26, 0, 16, plain},
+            {"Freq Band Indicator", 28, 0, 32, plain},
+        },
+        [this](const Bytes& record) {
+            deliver(0xB0C2, record);
+            return display();
+        });
+    sweep.run(RecordBuilder(0xB0C2, 42).bytes(), 13, 42);
+}
+
+TEST_F(LTEServingCellInfoTest, EveryBitOfTheAntennasShowsAndNoOther)
+{
+    const BitSweep sweep({{"Num Tx Antennas", 20, 0, 8, plain}}, [this](const Bytes& record) {
+        deliver(0xB0C1, record);
+        return display();
+    });
+    sweep.run(RecordBuilder(0xB0C1, 26).bytes(), 13, 26);
+}
+
+TEST_F(LTEServingCellInfoTest, EveryBandwidthByteIsNamedOrUnknown)
+{
+    for (unsigned byte = 0; byte < 256; ++byte) {
+        deliver(0xB0C2, servingCell().u8(20, byte).u8(21, 255 - byte));
+        EXPECT_EQ(shown("Download Bandwidth"), "\"" + bandwidth(byte) + "\"") << byte;
+        EXPECT_EQ(shown("Upload Bandwidth"), "\"" + bandwidth(255 - byte) + "\"") << byte;
     }
 }
 

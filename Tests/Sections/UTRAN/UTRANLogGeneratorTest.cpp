@@ -17,6 +17,12 @@ protected:
     LogRecorder log;
     FakeResources resources;
     Dictionary state;
+
+    std::string displayOf(UTRANLogGenerator& generator)
+    {
+        generator.updateState(state, RecordBuilder(1, 13));
+        return displayText(generator.getDisplayFromState(state));
+    }
 };
 
 TEST_F(UTRANLogGeneratorTest, WithoutATemplateTheStartCommandHasTwoEmptyLists)
@@ -43,8 +49,37 @@ TEST_F(UTRANLogGeneratorTest, FirstPathWithUTRANInAnyCaseIsTheTemplate)
     resources.lists["My_utran2"] = Dictionary::make({{"Chosen", "yes"}});
     const auto generator = UTRANLogGenerator::generator();
     EXPECT_NE(log.takeLogWith("<3>Created UTRANLogGenerator object\n"), "");
-    generator->updateState(state, RecordBuilder(1, 13));
-    EXPECT_EQ(displayText(generator->getDisplayFromState(state)), "{\"Chosen\": \"yes\"}");
+    EXPECT_EQ(displayOf(*generator), "{\"Chosen\": \"yes\"}");
+}
+
+TEST_F(UTRANLogGeneratorTest, FirstOfSeveralInTheListedOrderIsTheTemplate)
+{
+    resources.lists["B.utran.1"] = Dictionary::make({{"Chosen", "first"}});
+    resources.lists["UTRAN"] = Dictionary::make({{"Chosen", "second"}});
+    EXPECT_EQ(displayOf(*UTRANLogGenerator::generator()), "{\"Chosen\": \"first\"}");
+}
+
+TEST_F(UTRANLogGeneratorTest, UTRANAnywhereInThePathCounts)
+{
+    resources.lists["LTE"] = Dictionary::make({{"Chosen", "no"}});
+    resources.lists["Of utran/LTE"] = Dictionary::make();
+    EXPECT_EQ(displayOf(*UTRANLogGenerator::generator()), "{\"Chosen\": \"no\"}")
+        << "the name alone tells the resource";
+}
+
+TEST_F(UTRANLogGeneratorTest, LogTellsItOnceItIsThere)
+{
+    resources.lists["UTRAN"] = Dictionary::make();
+    {
+        const auto generator = UTRANLogGenerator::generator();
+        const std::string lines = log.takeLog();
+        const auto initialised = lines.find("<3>Class Index: 1\n");
+        ASSERT_NE(initialised, std::string::npos) << lines;
+        EXPECT_EQ(lines.substr(initialised), "<3>Class Index: 1\n<3>Created UTRANLogGenerator object\n");
+    }
+    const std::string ending = log.takeLog();
+    EXPECT_EQ(ending.find("<4>ZPH_GSMLogGenerator is destructed 0x"), 0u) << ending;
+    EXPECT_EQ(ending.find('\n'), ending.size() - 1) << "it has no line of its own";
 }
 
 } // namespace
