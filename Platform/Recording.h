@@ -61,7 +61,8 @@ public:
 
 /// Null when the file cannot be made, with `reason` telling why. "-" is standard output.
 ///
-/// A program that is killed, at whatever time, leaves a file that can be read: a new one has its head from the start.
+/// A program that is killed, at whatever time, leaves a file that can be read: a new one has its head from the start,
+/// and at most the last message is cut, where the kill struck in the midst of a write.
 std::unique_ptr<RecordingWriter> createRecording(const std::string& path, Technology technology, std::string& reason);
 /// The same for a name that no file has yet: null with an empty `reason` when one has it.
 std::unique_ptr<RecordingWriter> createNewRecording(

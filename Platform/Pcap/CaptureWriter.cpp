@@ -31,7 +31,7 @@ using Dumper = std::unique_ptr<pcap_dumper_t, CaptureCloser>;
 
 constexpr std::size_t PacketHeaderLength = 16;
 /// Of the file's buffer. Only whole packets leave it, so that a program that is killed leaves a file that ends with
-/// one.
+/// one, unless it is killed in the midst of a write, which the system breaks off between two pages.
 constexpr std::size_t BufferSize = 512 * 1024;
 static_assert(BufferSize > LargestMessage + PacketHeaderLength);
 

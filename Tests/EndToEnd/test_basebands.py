@@ -61,10 +61,6 @@ class Baseband(Place):
         with open(self.path("log"), encoding="utf-8") as log:
             return log.read().splitlines()
 
-    def watch_json(self):
-        watching = self.start_watch("--format", "json")
-        return lambda: json.loads(self.next_line(watching))
-
     def replay(self, name, messages, technology):
         return self.start_service("--replay", self.write(name, capture(messages, technology=technology)),
                                   "--speed", "0")
@@ -127,23 +123,22 @@ class CDMA(Baseband):
         self.assertEqual(self.log(file).count("<3>Log code error in subpkt#0: bad size (65535)."), 5)
 
     def test_session_goes_on_with_display_and_counters_after_a_restart(self):
-        service = self.replay("a.pcap", [system_information(4139), forward_data(1, 0)], "cdma")
-        next_display = self.watch_json()
-        self.assertEqual(next_display()["1x"]["System"]["System ID"], "4139")
+        service = self.replay("a.pcap", [forward_data(1, 0), system_information(4139)], "cdma")
+        watching = self.start_watch("--format", "json")
+        self.watch_until(watching, lambda display: display["1x"]["System"]["System ID"] == "4139")
         service.send_signal(signal.SIGKILL)
         service.wait()
         self.replay("b.pcap", [forward_data(3, 800), air_link(5)], "cdma")
-        after = next_display()
+        after = self.watch_until(watching, lambda display: display["EV-DO"]["Channel"] == "5")
         self.assertEqual(after["EV-DO"]["Forward Rate"], "50.00 kbps", "counted from before the restart")
-        self.assertEqual(after["EV-DO"]["Channel"], "5")
         self.assertEqual(after["1x"]["System"]["System ID"], "4139")
 
     def test_replayed_drive_is_watched_as_it_decodes(self):
         file = self.simulated("cdma", "2m")
         self.start_service("--replay", file, "--speed", "0")
         expected = self.display(file)
-        next_display = self.watch_json()
-        self.wait_until(lambda: next_display() == expected, "the last display of the recording")
+        watching = self.start_watch("--format", "json")
+        self.watch_until(watching, lambda display: display == expected)
 
 
 class IFX(Baseband):
@@ -196,21 +191,21 @@ class IFX(Baseband):
 
     def test_session_keeps_its_display_over_a_restart_until_the_next_report(self):
         service = self.replay("a.pcap", [report(A="x", B="y")], "ifx")
-        next_display = self.watch_json()
-        self.assertEqual(next_display(), {"A": "x", "B": "y"})
+        watching = self.start_watch("--format", "json")
+        self.assertEqual(json.loads(self.next_line(watching)), {"A": "x", "B": "y"})
         service.send_signal(signal.SIGKILL)
         service.wait()
         self.replay("b.pcap", [report(B="z", C="1")], "ifx")
-        self.assertEqual(next_display(), {"B": "z", "C": "1"})
+        self.assertEqual(json.loads(self.next_line(watching)), {"B": "z", "C": "1"})
 
     def test_other_technology_starts_with_its_own_display(self):
         service = self.replay("a.pcap", [report(A="x", B="y")], "ifx")
-        next_display = self.watch_json()
-        self.assertEqual(next_display(), {"A": "x", "B": "y"})
+        watching = self.start_watch("--format", "json")
+        self.assertEqual(json.loads(self.next_line(watching)), {"A": "x", "B": "y"})
         service.send_signal(signal.SIGKILL)
         service.wait()
         self.replay("b.pcap", [air_link(5)], "cdma")
-        after = next_display()
+        after = json.loads(self.next_line(watching))
         self.assertEqual(list(after), ["Summary", "1x", "EV-DO"])
         self.assertEqual(after["EV-DO"]["Channel"], "5")
 
@@ -218,8 +213,8 @@ class IFX(Baseband):
         file = self.simulated("ifx", "1m")
         self.start_service("--replay", file, "--speed", "0")
         expected = self.display(file)
-        next_display = self.watch_json()
-        self.wait_until(lambda: next_display() == expected, "the last display of the recording")
+        watching = self.start_watch("--format", "json")
+        self.watch_until(watching, lambda display: display == expected)
 
 
 if __name__ == "__main__":

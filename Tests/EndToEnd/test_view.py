@@ -75,7 +75,6 @@ class View(TerminalPlace):
         self.leave()
 
     def test_status_tells_the_recordings_own_time(self):
-        self.environment["TZ"] = "UTC"
         self.view(self.hour())
         self.see("Updated 2023-11-14 at 22:13:20")
         self.keys("$")

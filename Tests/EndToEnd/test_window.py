@@ -8,7 +8,7 @@ import subprocess
 import time
 import unittest
 
-from harness import LTE_SECTIONS, Place, capture, serving_cell, sim_files
+from harness import LTE_SECTIONS, WAIT, Place, capture, serving_cell, sim_files
 
 MARKER = "VexelInternal/Library/PreferenceBundles/Carrier Settings.bundle"
 WIDTH, HEIGHT = 480, 800
@@ -34,7 +34,7 @@ class Window(Place):
         super().setUp()
         runtime = self.path("runtime")
         os.mkdir(runtime, 0o700)
-        self.environment.update({"DISPLAY": self.display, "XDG_RUNTIME_DIR": runtime, "TZ": "UTC"})
+        self.environment.update({"DISPLAY": self.display, "XDG_RUNTIME_DIR": runtime})
         self.log = self.path("log")
 
     def allow_saving(self):
@@ -117,7 +117,7 @@ class Window(Place):
 
     def end(self, process, how=signal.SIGTERM):
         process.send_signal(how)
-        self.assertEqual(process.wait(60), 0)
+        self.assertEqual(process.wait(WAIT), 0)
 
     def home_screen_preference(self):
         with open(self.path("config", "spectrel", "org.spectrel.HomeScreen.conf")) as file:
@@ -224,7 +224,7 @@ class Session(Window):
                 os.remove(self.path("config", "spectrel", "org.spectrel.HomeScreen.conf"))
         process = self.open("--gui")
         self.key("ctrl+q")
-        self.assertEqual(process.wait(60), 0)
+        self.assertEqual(process.wait(WAIT), 0)
         self.assertIn("THShowGSMRSSI=false", self.home_screen_preference())
 
     def test_second_start_raises_the_window_of_the_first(self):
@@ -241,7 +241,7 @@ class Session(Window):
         garbage = b"\xff" + (16).to_bytes(2, "little") + bytes(10) + b"bad!"
         self.replay(serving_cell(5), garbage)
         process = self.start("spectrel", "--gui", stdout=subprocess.DEVNULL, stderr=subprocess.PIPE)
-        self.assertEqual(process.wait(60), -signal.SIGABRT)
+        self.assertEqual(process.wait(WAIT), -signal.SIGABRT)
         self.assertIn("UnknownDataException", process.stderr.read())
         self.assertEqual(len(self.snapshots()), 1)
 

@@ -17,7 +17,7 @@ namespace spectrel {
 /// Real ports in a folder of the test's own. Limits are for failures only; nothing waits for them otherwise.
 class PortFixture : public testing::Test {
 protected:
-    static constexpr std::chrono::seconds Limit {20};
+    static constexpr std::chrono::seconds Limit {60};
     static constexpr std::chrono::seconds Second {1};
     static constexpr std::chrono::nanoseconds AtOnce {0};
     static constexpr const char* Name = "org.spectrel.Test";

@@ -31,6 +31,14 @@ protected:
         return {std::istreambuf_iterator<char>(file), {}};
     }
 
+    /// The same bus whenever the test is repeated: a process remembers the first session bus that it was told.
+    static const std::string& sessionBus()
+    {
+        static const ScratchFolder place;
+        static const PrivateBus bus(place.path().string());
+        return bus.address();
+    }
+
     ScratchFolder folder;
     QtPreferences preferences {folder.path().string()};
 };
@@ -74,10 +82,9 @@ TEST_F(QtPreferencesTest, WithoutASessionBusNobodyIsTold)
 TEST_F(QtPreferencesTest, ChangeIsAnnouncedOnTheSessionBus)
 {
     QtRunLoop loop;
-    const PrivateBus bus(folder.path().string());
-    ASSERT_FALSE(bus.address().empty());
-    ::setenv("DBUS_SESSION_BUS_ADDRESS", bus.address().c_str(), 1);
-    const std::string command = "dbus-monitor --address " + bus.address()
+    ASSERT_FALSE(sessionBus().empty());
+    ::setenv("DBUS_SESSION_BUS_ADDRESS", sessionBus().c_str(), 1);
+    const std::string command = "timeout 120 dbus-monitor --address " + sessionBus()
         + " \"type='signal',interface='org.spectrel.Preferences'\" & echo $!; wait";
     std::FILE* const monitor = ::popen(("exec 2>&1; " + command).c_str(), "r");
     char line[512] = "";

@@ -18,7 +18,7 @@ TEST(TerminationSignalsTest, SignalsBecomeCallsOnTheMainQueue)
     ::raise(SIGTERM);
     ::raise(SIGINT);
     EXPECT_TRUE(signals.empty());
-    ASSERT_TRUE(loop.runUntil([&] { return signals.size() == 2; }, std::chrono::seconds(20)));
+    ASSERT_TRUE(loop.runUntil([&] { return signals.size() == 2; }, std::chrono::seconds(60)));
     EXPECT_THAT(signals, testing::ElementsAre(SIGTERM, SIGINT));
 }
 
@@ -28,7 +28,7 @@ TEST(TerminationSignalsTest, HandlerMayEndTheWatchAndTheFormerActionReturns)
     std::unique_ptr<TerminationSignals> watched;
     watched = std::make_unique<TerminationSignals>([&](int) { watched.reset(); });
     ::raise(SIGTERM);
-    ASSERT_TRUE(loop.runUntil([&] { return !watched; }, std::chrono::seconds(20)));
+    ASSERT_TRUE(loop.runUntil([&] { return !watched; }, std::chrono::seconds(60)));
     struct sigaction action = {};
     ::sigaction(SIGTERM, nullptr, &action);
     EXPECT_EQ(action.sa_handler, SIG_DFL);

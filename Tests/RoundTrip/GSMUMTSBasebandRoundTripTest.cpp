@@ -89,7 +89,7 @@ TEST_F(GSMUMTSBasebandRoundTripTest, ActiveSetIsEmptyWhileOnGSM)
 {
     const auto baseband = makeBaseband(Technology::GSM, Scene::Drive, 1);
     std::size_t seconds = 0;
-    for (int second = 0; second < 1200; ++second) {
+    for (int second = 0; second < 600; ++second) {
         receive(*baseband, 1s);
         const std::string state = shown("GSM RR Info", "RR State");
         if (state == "RR_IDLE") {

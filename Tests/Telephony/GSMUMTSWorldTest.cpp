@@ -70,7 +70,7 @@ TEST(GSMUMTSWorldTest, SameSeedGivesTheSameDrive)
 
 TEST(GSMUMTSWorldTest, EveryLapLeadsToGSMAndBack)
 {
-    for (std::uint32_t seed = 1; seed <= 10; ++seed) {
+    for (std::uint32_t seed = 1; seed <= 5; ++seed) {
         GSMUMTSWorld world(Scene::Drive, seed);
         int left = 0;
         int returned = 0;
@@ -86,7 +86,7 @@ TEST(GSMUMTSWorldTest, EveryLapLeadsToGSMAndBack)
 
 TEST(GSMUMTSWorldTest, PhoneLeavesUMTSOnlyWhereItIsWeakAndReturnsWhereItIsGood)
 {
-    for (std::uint32_t seed = 1; seed <= 5; ++seed) {
+    for (std::uint32_t seed = 1; seed <= 3; ++seed) {
         GSMUMTSWorld world(Scene::Drive, seed);
         drive(world, TwoLaps, [&] {
             if (world.before().system == RadioSystem::UMTS && world.system() == RadioSystem::GSM) {
@@ -180,7 +180,7 @@ TEST(GSMUMTSWorldTest, RRCStatesFollowEachOtherLegally)
 {
     using enum RRCState;
     Transitions<RRCState> seen;
-    for (std::uint32_t seed = 1; seed <= 20; ++seed) {
+    for (std::uint32_t seed = 1; seed <= 10; ++seed) {
         GSMUMTSWorld world(Scene::Drive, seed);
         drive(world, FiveMinutes, [&] {
             if (world.before().rrc == Disconnected && world.now().rrc == CellDCH) {
@@ -200,7 +200,7 @@ TEST(GSMUMTSWorldTest, RRStatesFollowEachOtherLegally)
 {
     using enum RRState;
     Transitions<RRState> seen;
-    for (std::uint32_t seed = 1; seed <= 40; ++seed) {
+    for (std::uint32_t seed = 1; seed <= 20; ++seed) {
         GSMUMTSWorld world(Scene::Drive, seed);
         drive(world, FiveMinutes, [&] { seen.see(world.before().rr.state, world.now().rr.state); });
     }

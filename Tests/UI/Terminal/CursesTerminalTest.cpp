@@ -34,6 +34,9 @@ Outcome runOnTerminal(const char* kind, const std::function<void()>& action)
         ::setrlimit(RLIMIT_CORE, &noCore);
         ::setenv("TERM", kind, 1);
         ::setenv("LC_ALL", "C.UTF-8", 1);
+        for (const char* name :
+            {"LINES", "COLUMNS", "TERMINFO", "TERMINFO_DIRS"}) // they would tell of another terminal
+            ::unsetenv(name);
         action();
         std::exit(0);
     }
