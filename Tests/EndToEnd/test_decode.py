@@ -196,6 +196,19 @@ class Failures(Decode):
         self.assertIn("standard output", done.stderr)
 
 
+    def test_folder_or_file_that_cannot_be_had_is_status_1_and_named_once(self):
+        file = self.write("a.pcap", capture([serving_cell(5)]))
+        plain = self.write("plain", b"")
+        nowhere = self.path("no", "where")
+        for arguments, line in (
+                (["--resources", nowhere], f"{nowhere}: No such file or directory"),
+                (["--resources", plain], f"{plain}: not a folder of display templates"),
+                (["--log", nowhere], f"{nowhere}: No such file or directory"),
+                (["--log", self.folder], f"{self.folder}: Is a directory")):
+            done = self.decode("--format", "none", *arguments, file)
+            self.assertEqual((done.returncode, done.stderr), (1, f"spectrel: {line}\n"))
+
+
 class Snapshots(Decode):
     def snapshot(self, messages, **options):
         file = self.write("a.pcap", capture(messages, **options))

@@ -112,6 +112,16 @@ class Restart(Place):
         self.start_service("--simulate", "lte")
 
 
+    def test_folder_of_the_ports_that_cannot_be_had_is_told_and_status_1(self):
+        self.environment["SPECTREL_PORT_DIR"] = self.write("plain", b"")
+        for program, arguments in (("spectrel", ["watch"]), ("spectrel", ["record", self.path("r.pcap")]),
+                                   ("spectrel-telephonyd", ["--simulate", "lte"])):
+            done = self.run_spectrel(*arguments, program=program)
+            self.assertEqual((done.returncode, done.stderr), (
+                1, f"{program}: the message ports' folder cannot be had: {self.path('plain')}: "
+                   "not a folder of this user\n"))
+
+
 class OtherServices(Place):
     def start_example(self):
         script = os.path.join(os.path.dirname(__file__), "..", "..", "docs", "telephony-service.py")
