@@ -78,7 +78,9 @@ void addDecode(CLI::App& program, Arguments& arguments)
         "decode", "Decode recordings (captures, snapshots, DLF files) offline and print the display");
     command.callback([&arguments] { arguments.job = Job::Decode; });
     addCommon(command, arguments);
-    command.add_option("FILE", decode.files, "The recordings, decoded one after the other")->required()->type_name("");
+    command.add_option("FILE", decode.files, "The recordings, decoded one after the other; - is standard input")
+        ->required()
+        ->type_name("");
     addFormat(command, decode.format);
     command.add_flag("--each", decode.each, "With --format json: one line for each message");
     addTechnology(command, decode.technology);
@@ -94,7 +96,9 @@ void addView(CLI::App& program, Arguments& arguments)
     command.callback([&arguments] { arguments.job = Job::View; });
     addCommon(command, arguments);
     addScreens(command, arguments);
-    command.add_option("FILE", arguments.view.file, "A capture, a snapshot or a DLF file")->required()->type_name("");
+    addFormedOption(command, "FILE", arguments.view.file, FileForm, "A capture, a snapshot or a DLF file")
+        ->required()
+        ->type_name("");
     addTechnology(command, arguments.view.technology);
 }
 
@@ -104,10 +108,9 @@ void addRecord(CLI::App& program, Arguments& arguments)
     command.callback([&arguments] { arguments.job = Job::Record; });
     addCommon(command, arguments);
     RecordingFilesOptions& files = arguments.record.files;
-    command
-        .add_option("FILE", files.target,
-            "The capture file; an existing one is overwritten. A folder (or a new one: FOLDER/) takes numbered files, "
-            "on from those that are there. - is standard output")
+    addFormedOption(command, "FILE", files.target, FileForm,
+        "The capture file; an existing one is overwritten. A folder (or a new one: FOLDER/) takes numbered files, on "
+        "from those that are there. - is standard output")
         ->required()
         ->type_name("");
     addFormedOption(command, "--rollover", files.largestFile, SizeForm,

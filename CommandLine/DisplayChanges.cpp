@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <charconv>
+#include <span>
 #include <utility>
 
 namespace spectrel {
@@ -61,10 +62,7 @@ void DisplayChanges::updateChildren(Shadow& shadow, const Value& value, const Re
             visit({name, static_cast<std::size_t>(end - name)}, element);
         }
     }
-    for (std::size_t gone = position; gone < shadow.children.size(); ++gone) {
-        _path = pathByAppending(parentPath, shadow.children[gone].name);
-        reportGone(shadow.children[gone], report);
-    }
+    reportGoneChildren(shadow, position, parentPath, report);
     shadow.children.resize(position);
     _path = parentPath;
 }
@@ -82,6 +80,23 @@ DisplayChanges::Shadow& DisplayChanges::shadowOf(
     }
     std::rotate(place, found, found + 1);
     return *place;
+}
+
+/// Of the children from `position` on. Sorted entries may be displayed under one name: where one of them stays, what
+/// is at their path has not gone.
+void DisplayChanges::reportGoneChildren(
+    const Shadow& parent, std::size_t position, const std::string& parentPath, const Report& report)
+{
+    const auto stay = std::span(parent.children).first(position);
+    for (const Shadow& child : std::span(parent.children).subspan(position)) {
+        const bool isStillThere = child.isLeaf && std::ranges::any_of(stay, [&child](const Shadow& other) {
+            return other.isLeaf && other.name == child.name;
+        });
+        if (isStillThere)
+            continue;
+        _path = pathByAppending(parentPath, child.name);
+        reportGone(child, report);
+    }
 }
 
 void DisplayChanges::reportGone(const Shadow& shadow, const Report& report)

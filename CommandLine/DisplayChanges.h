@@ -32,6 +32,8 @@ private:
     void updateNode(Shadow& shadow, bool isNew, const Value& value, const Report& report);
     void updateChildren(Shadow& shadow, const Value& value, const Report& report);
     Shadow& shadowOf(Shadow& parent, std::size_t position, std::string_view name, bool& isNew);
+    void reportGoneChildren(
+        const Shadow& parent, std::size_t position, const std::string& parentPath, const Report& report);
     void reportGone(const Shadow& shadow, const Report& report);
 
     Shadow _root;

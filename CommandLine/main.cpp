@@ -45,6 +45,8 @@ int main(int argc, char** argv)
         return *status;
 
     std::signal(SIGXFSZ, SIG_IGN); // a file grown too large is a failed write like any other
+    if (isLive(arguments.job))
+        std::signal(SIGPIPE, SIG_IGN); // a reader that has gone, too: the session is still to be closed
     const auto templates = Surroundings::templates(arguments.resources);
     if (!templates || (isLive(arguments.job) && !Surroundings::preparePorts()))
         return ExitStatus::Failed;

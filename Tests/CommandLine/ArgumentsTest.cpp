@@ -130,6 +130,8 @@ TEST(ReadArgumentsTest, EmptyNameOfAFileOrFolderIsWrongUsage)
 {
     EXPECT_EQ(complaintAbout({"decode", "--snapshot", "", "a"}),
         "spectrel: --snapshot: '' names no folder (see spectrel --help)\n");
+    EXPECT_EQ(complaintAbout({"record", ""}), "spectrel: FILE: '' names no file (see spectrel --help)\n");
+    EXPECT_EQ(complaintAbout({"view", ""}), "spectrel: FILE: '' names no file (see spectrel --help)\n");
     EXPECT_EQ(complaintAbout({"--log", ""}), "spectrel: --log: '' names no file (see spectrel --help)\n");
     EXPECT_EQ(complaintAbout({"--resources", ""}), "spectrel: --resources: '' names no folder (see spectrel --help)\n");
 }

@@ -119,6 +119,15 @@ class Formats(Decode):
         self.assertEqual(display["Serving Cell Info"]["Physical Cell ID"], "5")
         self.assertEqual(display["SIM Info"]["EF-ICCID"], "2")
 
+    def test_dash_is_standard_input(self):
+        recording = capture([serving_cell(5), serving_cell(6)])
+        for given, status, complaint in ((recording, 0, ""), (recording[:-3], 1, "spectrel: standard input: message 1 ")):
+            done = subprocess.run([os.path.join(BIN, "spectrel"), "decode", "--format", "json", "-"], input=given,
+                                  env=self.environment, capture_output=True)
+            self.assertEqual(done.returncode, status)
+            self.assertEqual(json.loads(done.stdout)["Serving Cell Info"]["Physical Cell ID"], "56"[1 - status])
+            self.assertIn(complaint, done.stderr.decode())
+
     def test_console_lines_go_to_standard_error(self):
         done = self.decode(self.write("a.pcap", capture([serving_cell()])))
         self.assertIn("Deallocing LTEClassIndex\nDeallocing ClassIndex\n", done.stderr)

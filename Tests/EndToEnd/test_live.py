@@ -9,7 +9,7 @@ import subprocess
 import sys
 import unittest
 
-from harness import LTE_SECTIONS, Place, capture, record, serving_cell, sim_files
+from harness import LTE_SECTIONS, Place, WAIT, capture, record, serving_cell, sim_files
 
 
 class Watch(Place):
@@ -63,6 +63,15 @@ class Watch(Place):
         done = self.run_spectrel("watch", "--format", "json", "--count", "2")
         self.assertEqual([list(display) for display in self.displays(done)],
                          2 * [LTE_SECTIONS])
+
+    def test_reader_that_goes_away_ends_it_and_leaves_no_port_behind(self):
+        self.start_service("--simulate", "lte", "--scene", "stress")
+        watching = self.start_watch("--format", "json")
+        self.next_line(watching)
+        watching.stdout.close()
+        self.assertEqual(watching.wait(WAIT), 1)
+        self.assertIn("spectrel: standard output: cannot be written\n", watching.stderr.read())
+        self.assertEqual([name for name in os.listdir(self.path("ports")) if "Watch" in name], [])
 
     def test_several_programs_watch_at_once(self):
         self.start_service("--simulate", "lte")
