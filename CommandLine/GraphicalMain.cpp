@@ -4,6 +4,7 @@
 #include "CommandLine/GraphicalApplication.h"
 #include "CommandLine/Logging.h"
 #include "CommandLine/Surroundings.h"
+#include "Monitor/SpectrelModel.h"
 #include "Platform/Console.h"
 #include "Platform/Resources.h"
 
@@ -29,7 +30,7 @@ int main(int argc, char** argv)
 
     std::signal(SIGXFSZ, SIG_IGN); // a file grown too large is a failed write like any other
     const auto templates = Surroundings::templates(arguments.resources);
-    if (!templates || (!arguments.viewedFile && !Surroundings::preparePorts()))
+    if (!templates || (!arguments.viewedFile && !Surroundings::preparePorts(SpectrelModel::ApplicationPrefix)))
         return ExitStatus::Failed;
     const DirectoryResources resources(*templates);
     Resources::install(&resources);

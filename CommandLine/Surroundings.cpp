@@ -1,7 +1,9 @@
 #include "CommandLine/Surroundings.h"
 
 #include "CommandLine/Report.h"
+#include "Monitor/SpectrelModel.h"
 #include "Platform/Environment.h"
+#include "Platform/Sockets/SocketMessagePorts.h"
 
 #include <filesystem>
 #include <system_error>
@@ -18,10 +20,11 @@ std::optional<std::string> templates(const std::optional<std::string>& named)
     return std::nullopt;
 }
 
-bool preparePorts()
+bool preparePorts(std::string_view portPrefix)
 {
     std::string reason;
-    if (makePrivateDirectory(Places::portDirectory(), reason))
+    const std::string name = std::string(portPrefix) + std::string(SpectrelModel::PortSuffix);
+    if (SocketMessagePorts::prepareDirectory(Places::portDirectory(), name, reason))
         return true;
     report("the message ports' folder cannot be had: " + reason);
     return false;

@@ -2,6 +2,7 @@
 
 #include <optional>
 #include <string>
+#include <string_view>
 
 namespace spectrel {
 
@@ -12,9 +13,9 @@ namespace Surroundings {
 /// such folder.
 std::optional<std::string> templates(const std::optional<std::string>& named);
 
-/// Makes the message ports' folder, if need be. False, told on standard error, when it cannot be had: no session could
-/// ever be opened.
-bool preparePorts();
+/// Makes the message ports' folder, if need be. False, told on standard error, when it cannot be had, or when the local
+/// port of a session with this prefix does not fit: no session could ever be opened.
+bool preparePorts(std::string_view portPrefix);
 
 } // namespace Surroundings
 

@@ -127,7 +127,7 @@ int serve(ServiceOptions& options)
     QtClock clock;
     Clock::install(&clock);
     std::string reason;
-    if (!makePrivateDirectory(Places::portDirectory(), reason))
+    if (!SocketMessagePorts::prepareDirectory(Places::portDirectory(), TelephonyProtocol::ServicePort, reason))
         return fail("the message ports' folder cannot be had: " + reason);
     SocketMessagePorts ports(Places::portDirectory());
     if (!adoptSocket(manager, ports, reason))

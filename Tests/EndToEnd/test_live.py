@@ -130,6 +130,14 @@ class Restart(Place):
                 1, f"{program}: the message ports' folder cannot be had: {self.path('plain')}: "
                    "not a folder of this user\n"))
 
+    def test_folder_too_long_for_the_names_of_ports_is_told_and_status_1(self):
+        folder = self.environment["SPECTREL_PORT_DIR"] = self.path("x" * 100)
+        for program, arguments in (("spectrel", ["watch"]), ("spectrel-telephonyd", ["--simulate", "lte"])):
+            done = self.run_spectrel(*arguments, program=program)
+            self.assertEqual((done.returncode, done.stderr), (
+                1, f"{program}: the message ports' folder cannot be had: {folder}: "
+                   "with a port's name the path is longer than 107 bytes\n"))
+
 
 class OtherServices(Place):
     def start_example(self):
