@@ -22,39 +22,28 @@ constexpr const char* Environment =
     "  NO_COLOR                no colours in the terminal screens\n"
     "Exit status: 0 done, 1 something could not be done, 2 wrong usage.";
 
-const CLI::Validator IsFormat(
-    [](std::string& name) {
-        return outputFormatNamed(name) ? std::string() : "'" + name + "' is not one of tree, json, changes, csv, none";
-    },
-    "tree|json|changes|csv|none");
+constexpr OptionForm<OutputFormat> FormatForm {
+    "tree|json|changes|csv|none", outputFormatNamed, "is not one of tree, json, changes, csv, none"};
 
-template <typename Set> void addFormat(CLI::App* command, Set set)
+void addFormat(CLI::App& command, OutputFormat& format)
 {
-    command
-        ->add_option_function<std::string>(
-            "--format", [set](const std::string& name) { set(*outputFormatNamed(name)); },
-            "How the display is printed (default: tree)")
-        ->check(IsFormat);
+    addFormedOption(command, "--format", format, FormatForm, "How the display is printed (default: tree)");
 }
 
-void addLimits(CLI::App* command, std::optional<std::uint64_t>& count, const char* what,
+void addLimits(CLI::App& command, std::optional<std::uint64_t>& count, const char* what,
     std::optional<std::chrono::milliseconds>& duration)
 {
-    command->add_option("--count", count, what)->check(CLI::PositiveNumber);
-    command
-        ->add_option_function<std::string>(
-            "--duration", [&duration](const std::string& text) { duration = parseDuration(text); },
-            "End after this time")
-        ->check(IsDuration);
+    addFormedOption(command, "--count", count, CountForm, what);
+    addFormedOption(command, "--duration", duration, DurationForm, "End after this time");
 }
 
 void addCommon(CLI::App& command, Arguments& arguments)
 {
-    command.add_option("--resources", arguments.resources, "Take the display templates from this folder")
-        ->check(CLI::ExistingDirectory)
-        ->type_name("DIR");
-    command.add_option("--log", arguments.logFile, "Write every system-log line to this file: <PRIORITY>TEXT")
-        ->type_name("FILE");
+    command.set_version_flag("--version", "spectrel " SPECTREL_VERSION);
+    addFormedOption(
+        command, "--resources", arguments.resources, FolderForm, "Take the display templates from this folder");
+    addFormedOption(
+        command, "--log", arguments.logFile, FileForm, "Write every system-log line to this file: <PRIORITY>TEXT");
 }
 
 void addScreens(CLI::App& command, Arguments& arguments)
@@ -67,76 +56,83 @@ void addScreens(CLI::App& command, Arguments& arguments)
         ->excludes(graphical);
 }
 
-template <typename Set> void addTechnology(CLI::App* command, Set set)
+void addTechnology(CLI::App& command, std::optional<Technology>& technology)
 {
-    command
-        ->add_option_function<std::string>(
-            "--technology", [set](const std::string& name) { set(technologyNamed(name)); },
-            "The technology, where the file does not tell")
-        ->check(IsTechnology);
+    addFormedOption(
+        command, "--technology", technology, TechnologyForm, "The technology, where the file does not tell");
 }
 
 void addWatch(CLI::App& program, Arguments& arguments)
 {
-    CLI::App* command = program.add_subcommand("watch", "Print the live session, once at each refresh");
-    command->callback([&arguments] { arguments.job = Job::Watch; });
-    addCommon(*command, arguments);
-    addFormat(command, [&arguments](OutputFormat format) { arguments.watch.format = format; });
+    CLI::App& command = *program.add_subcommand("watch", "Print the live session, once at each refresh");
+    command.callback([&arguments] { arguments.job = Job::Watch; });
+    addCommon(command, arguments);
+    addFormat(command, arguments.watch.format);
     addLimits(command, arguments.watch.count, "End after this many refreshes", arguments.watch.duration);
 }
 
 void addDecode(CLI::App& program, Arguments& arguments)
 {
     DecodeOptions& decode = arguments.decode;
-    CLI::App* command = program.add_subcommand(
+    CLI::App& command = *program.add_subcommand(
         "decode", "Decode recordings (captures, snapshots, DLF files) offline and print the display");
-    command->callback([&arguments] { arguments.job = Job::Decode; });
-    addCommon(*command, arguments);
-    command->add_option("FILE", decode.files, "The recordings, decoded one after the other")->required();
-    addFormat(command, [&decode](OutputFormat format) { decode.format = format; });
-    command->add_flag("--each", decode.each, "With --format json: one line for each message");
-    addTechnology(command, [&decode](std::optional<Technology> technology) { decode.technology = technology; });
-    command->add_option("--snapshot", decode.snapshotDirectory, "Write a snapshot file into this folder at the end")
-        ->type_name("DIR");
-    command->add_flag("--keep-going", decode.keepGoing, "Go on after a message that would end the program");
+    command.callback([&arguments] { arguments.job = Job::Decode; });
+    addCommon(command, arguments);
+    command.add_option("FILE", decode.files, "The recordings, decoded one after the other; - is standard input")
+        ->required()
+        ->type_name("");
+    addFormat(command, decode.format);
+    command.add_flag("--each", decode.each, "With --format json: one line for each message");
+    addTechnology(command, decode.technology);
+    addFormedOption(command, "--snapshot", decode.snapshotDirectory, FolderForm,
+        "Write a snapshot file into this folder at the end");
+    command.add_flag("--keep-going", decode.keepGoing, "Go on after a message that would end the program");
 }
 
 void addView(CLI::App& program, Arguments& arguments)
 {
-    ViewOptions& view = arguments.view;
-    CLI::App* command = program.add_subcommand(
+    CLI::App& command = *program.add_subcommand(
         "view", "Browse a recording or a snapshot in the screens; a recording plays, pauses, steps and seeks");
-    command->callback([&arguments] { arguments.job = Job::View; });
-    addCommon(*command, arguments);
-    addScreens(*command, arguments);
-    command->add_option("FILE", view.file, "A capture, a snapshot or a DLF file")->required();
-    addTechnology(command, [&view](std::optional<Technology> technology) { view.technology = technology; });
+    command.callback([&arguments] { arguments.job = Job::View; });
+    addCommon(command, arguments);
+    addScreens(command, arguments);
+    addFormedOption(command, "FILE", arguments.view.file, FileForm, "A capture, a snapshot or a DLF file")
+        ->required()
+        ->type_name("");
+    addTechnology(command, arguments.view.technology);
 }
 
 void addRecord(CLI::App& program, Arguments& arguments)
 {
-    CLI::App* command = program.add_subcommand("record", "Record the live session into a capture file (pcap)");
-    command->callback([&arguments] { arguments.job = Job::Record; });
-    addCommon(*command, arguments);
+    CLI::App& command = *program.add_subcommand("record", "Record the live session into a capture file (pcap)");
+    command.callback([&arguments] { arguments.job = Job::Record; });
+    addCommon(command, arguments);
     RecordingFilesOptions& files = arguments.record.files;
-    command
-        ->add_option("FILE", files.target,
-            "The capture file; an existing one is overwritten. A folder (or a new one: FOLDER/) takes numbered files, "
-            "on from those that are there")
-        ->required();
-    command
-        ->add_option_function<std::string>(
-            "--rollover", [&files](const std::string& text) { files.largestFile = parseSize(text); },
-            "Begin a further file before one has more bytes than this, such as 100M")
-        ->check(IsSize);
-    command
-        ->add_option_function<std::string>(
-            "--rollover-time", [&files](const std::string& text) { files.longestFile = parseDuration(text); },
-            "Begin a further file after this time, such as 1h")
-        ->check(IsDuration);
-    command->add_option("--keep", files.keep, "Of the numbered files keep the last so many, remove the older ones")
-        ->check(CLI::PositiveNumber);
+    addFormedOption(command, "FILE", files.target, FileForm,
+        "The capture file; an existing one is overwritten. A folder (or a new one: FOLDER/) takes numbered files, on "
+        "from those that are there. - is standard output")
+        ->required()
+        ->type_name("");
+    addFormedOption(command, "--rollover", files.largestFile, SizeForm,
+        "Begin a further file before one has more bytes than this, such as 100M");
+    addFormedOption(command, "--rollover-time", files.longestFile, DurationForm,
+        "Begin a further file after this time, such as 1h");
+    addFormedOption(
+        command, "--keep", files.keep, CountForm, "Of the numbered files keep the last so many, remove the older ones");
     addLimits(command, arguments.record.count, "End after this many messages", arguments.record.duration);
+}
+
+/// What no single option can tell.
+void checkTogether(const Arguments& arguments)
+{
+    if (arguments.decode.each && arguments.decode.format != OutputFormat::Json)
+        throw CLI::ValidationError("--each", "goes with --format json only");
+    const RecordingFilesOptions& files = arguments.record.files;
+    if (files.target == "-" && (files.largestFile || files.longestFile || files.keep))
+        throw CLI::ValidationError(files.largestFile ? "--rollover"
+                : files.longestFile                  ? "--rollover-time"
+                                                     : "--keep",
+            "standard output is one stream, not several files");
 }
 
 } // namespace
@@ -145,7 +141,6 @@ std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
 {
     CLI::App program(Description, "spectrel");
     program.footer(Environment);
-    program.set_version_flag("--version", "spectrel " SPECTREL_VERSION);
     program.require_subcommand(0, 1);
     addCommon(program, arguments);
     addScreens(program, arguments);
@@ -155,11 +150,7 @@ std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
     addRecord(program, arguments);
     try {
         program.parse(argc, argv);
-        if (arguments.decode.each && arguments.decode.format != OutputFormat::Json)
-            throw CLI::ValidationError("--each", "goes with --format json only");
-        const RecordingFilesOptions& files = arguments.record.files;
-        if (files.target == "-" && (files.largestFile || files.longestFile || files.keep))
-            throw CLI::ValidationError("--rollover", "standard output is one stream");
+        checkTogether(arguments);
     } catch (const CLI::Success& answered) {
         return program.exit(answered); // --help and --version, on standard output
     } catch (const CLI::ParseError& error) {

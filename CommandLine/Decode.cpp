@@ -43,10 +43,12 @@ private:
     }
 
     /// False when a message has ended the decoding.
-    bool decodeFile(const std::string& file)
+    bool decodeFile(const std::string& path)
     {
+        const bool isStandardInput = path == "-";
+        const std::string file = isStandardInput ? "standard input" : path;
         std::string reason;
-        const auto reader = openRecording(file, reason);
+        const auto reader = openRecording(isStandardInput ? "/dev/stdin" : path, reason);
         if (!reader) {
             fail(file + ": " + reason);
             return true;

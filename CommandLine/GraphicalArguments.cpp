@@ -1,17 +1,28 @@
 #include "CommandLine/GraphicalArguments.h"
 
 #include "CommandLine/ExitStatus.h"
+#include "CommandLine/OptionTypes.h"
 
 #include <CLI/CLI.hpp>
 #include <iostream>
-#include <map>
+#include <string_view>
 
 namespace spectrel {
 
 namespace {
 
-const std::map<std::string, std::optional<Appearance>> Appearances {
-    {"desktop", std::nullopt}, {"light", Appearance::Light}, {"dark", Appearance::Dark}};
+/// The inner value is none where the desktop decides.
+std::optional<std::optional<Appearance>> appearanceNamed(std::string_view name)
+{
+    if (name == "desktop")
+        return std::optional<Appearance>();
+    if (name == "light")
+        return Appearance::Light;
+    return name == "dark" ? std::optional<std::optional<Appearance>>(Appearance::Dark) : std::nullopt;
+}
+
+constexpr OptionForm<std::optional<Appearance>> AppearanceForm {
+    "light|dark|desktop", appearanceNamed, "is not one of light, dark, desktop"};
 
 } // namespace
 
@@ -20,24 +31,16 @@ std::optional<int> readArguments(int argc, char** argv, GraphicalArguments& argu
     CLI::App program("Live radio diagnostics: the graphical screens, as 'spectrel --gui' opens them.", "spectrel-gui");
     program.footer("'spectrel --help' tells the environment and the exit statuses.");
     program.set_version_flag("--version", "spectrel " SPECTREL_VERSION);
-    program.add_option("--resources", arguments.resources, "Take the display templates from this folder")
-        ->check(CLI::ExistingDirectory)
-        ->type_name("DIR");
-    program.add_option("--log", arguments.logFile, "Write every system-log line to this file: <PRIORITY>TEXT")
-        ->type_name("FILE");
-    program.add_option("--view", arguments.viewedFile, "Browse this recording or snapshot, as 'spectrel view' does")
-        ->type_name("FILE");
-    program
-        .add_option_function<std::string>(
-            "--technology", [&arguments](const std::string& name) { arguments.technology = technologyNamed(name); },
-            "The file's technology, where it does not tell")
-        ->check(CLI::IsMember({"ifx", "gsm", "cdma", "lte", "utran"}));
-    program
-        .add_option_function<std::string>(
-            "--appearance", [&arguments](const std::string& name) { arguments.appearance = Appearances.at(name); },
-            "Light or dark, whatever the desktop is")
-        ->check(CLI::IsMember(Appearances))
-        ->type_name("light|dark|desktop");
+    addFormedOption(
+        program, "--resources", arguments.resources, FolderForm, "Take the display templates from this folder");
+    addFormedOption(
+        program, "--log", arguments.logFile, FileForm, "Write every system-log line to this file: <PRIORITY>TEXT");
+    addFormedOption(program, "--view", arguments.viewedFile, FileForm,
+        "Browse this recording or snapshot, as 'spectrel view' does");
+    addFormedOption(
+        program, "--technology", arguments.technology, TechnologyForm, "The file's technology, where it does not tell");
+    addFormedOption(
+        program, "--appearance", arguments.appearance, AppearanceForm, "Light or dark, whatever the desktop is");
     try {
         program.parse(argc, argv);
     } catch (const CLI::Success& answered) {

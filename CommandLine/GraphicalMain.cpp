@@ -3,8 +3,9 @@
 #include "CommandLine/ExitStatus.h"
 #include "CommandLine/GraphicalApplication.h"
 #include "CommandLine/Logging.h"
+#include "CommandLine/Surroundings.h"
+#include "Monitor/SpectrelModel.h"
 #include "Platform/Console.h"
-#include "Platform/Environment.h"
 #include "Platform/Resources.h"
 
 #include <QGuiApplication>
@@ -28,7 +29,10 @@ int main(int argc, char** argv)
         return *status;
 
     std::signal(SIGXFSZ, SIG_IGN); // a file grown too large is a failed write like any other
-    const DirectoryResources resources(arguments.resources.value_or(Places::resourcesDirectory()));
+    const auto templates = Surroundings::templates(arguments.resources);
+    if (!templates || (!arguments.viewedFile && !Surroundings::preparePorts(SpectrelModel::ApplicationPrefix)))
+        return ExitStatus::Failed;
+    const DirectoryResources resources(*templates);
     Resources::install(&resources);
     StandardOutputConsole console;
     Console::install(&console);

@@ -35,9 +35,9 @@ public:
         _model.destroyPorts();
         flush();
         if (_files.count() == 0 && _status == 0)
-            fail(_options.files.target + ": nothing was recorded, for no session was opened");
+            fail(RecordingFiles::spoken(_options.files.target) + ": nothing was recorded, for no session was opened");
         else if (_status == 0)
-            report(_files.path() + ": " + std::to_string(_messages) + " messages"
+            report(RecordingFiles::spoken(_files.path()) + ": " + std::to_string(_messages) + " messages"
                 + (_files.count() > 1 ? " in " + std::to_string(_files.count()) + " files, this one being the last"
                                       : ""));
         return _status;

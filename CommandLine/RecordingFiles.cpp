@@ -58,9 +58,14 @@ RecordingFiles::RecordingFiles(RecordingFilesOptions options)
 {
 }
 
+std::string RecordingFiles::spoken(const std::string& path)
+{
+    return path == "-" ? "standard output" : path;
+}
+
 bool RecordingFiles::failed(const std::string& path, const std::string& reason)
 {
-    _error = path + ": " + reason;
+    _error = spoken(path) + ": " + reason;
     return false;
 }
 

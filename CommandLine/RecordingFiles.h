@@ -35,6 +35,8 @@ public:
     bool write(Technology technology, Moment time, ByteView message);
     bool flush();
 
+    /// A file's name as messages tell it; "-" is standard output.
+    static std::string spoken(const std::string& path);
     /// The current file; empty before the first.
     const std::string& path() const
     {

@@ -50,9 +50,9 @@ int runGraphical(const Arguments& arguments, std::vector<std::string> options)
     const std::string program = graphicalProgram();
     options.insert(options.begin(), program);
     if (arguments.resources)
-        options.insert(options.end(), {"--resources", *arguments.resources});
+        options.push_back("--resources=" + *arguments.resources);
     if (arguments.logFile)
-        options.insert(options.end(), {"--log", *arguments.logFile});
+        options.push_back("--log=" + *arguments.logFile);
     std::vector<char*> given;
     for (std::string& option : options)
         given.push_back(option.data());

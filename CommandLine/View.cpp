@@ -17,7 +17,7 @@ namespace {
 
 int viewGraphically(const Arguments& arguments)
 {
-    std::vector<std::string> options {"--view", arguments.view.file};
+    std::vector<std::string> options {"--view=" + arguments.view.file};
     if (arguments.view.technology)
         options.insert(options.end(), {"--technology", std::string(technologyName(*arguments.view.technology))});
     return runGraphical(arguments, std::move(options));

@@ -2,9 +2,10 @@
 
 #include "CommandLine/Application.h"
 #include "CommandLine/Arguments.h"
+#include "CommandLine/LiveServices.h"
 #include "CommandLine/Logging.h"
+#include "CommandLine/Surroundings.h"
 #include "Platform/Console.h"
-#include "Platform/Environment.h"
 #include "Platform/Resources.h"
 
 #include <csignal>
@@ -17,6 +18,18 @@ using namespace spectrel;
 bool isLive(Job job)
 {
     return job != Job::Decode && job != Job::View;
+}
+
+std::string portPrefix(Job job)
+{
+    switch (job) {
+    case Job::Watch:
+        return LiveServices::portPrefixFor("Watch");
+    case Job::Record:
+        return LiveServices::portPrefixFor("Record");
+    default:
+        return std::string(SpectrelModel::ApplicationPrefix);
+    }
 }
 
 int run(const Arguments& arguments)
@@ -45,7 +58,12 @@ int main(int argc, char** argv)
         return *status;
 
     std::signal(SIGXFSZ, SIG_IGN); // a file grown too large is a failed write like any other
-    const DirectoryResources resources(arguments.resources.value_or(Places::resourcesDirectory()));
+    if (isLive(arguments.job))
+        std::signal(SIGPIPE, SIG_IGN); // a reader that has gone, too: the session is still to be closed
+    const auto templates = Surroundings::templates(arguments.resources);
+    if (!templates || (isLive(arguments.job) && !Surroundings::preparePorts(portPrefix(arguments.job))))
+        return ExitStatus::Failed;
+    const DirectoryResources resources(*templates);
     Resources::install(&resources);
     StandardErrorConsole console;
     Console::install(&console);

@@ -11,7 +11,6 @@ namespace spectrel {
 
 namespace {
 
-constexpr std::string_view PortSuffix = ".BasebandStateReport.LogChannel";
 constexpr std::int32_t LogMessageId = 0;
 
 ByteView bytesOf(const std::string& text)

@@ -54,8 +54,9 @@ public:
     static constexpr std::size_t LargestIntake = 8 * 1024 * 1024;
     /// The application's name on the message ports; other programs take one of their own in its place.
     static constexpr std::string_view ApplicationPrefix = "org.spectrel.Spectrel";
+    static constexpr std::string_view PortSuffix = ".BasebandStateReport.LogChannel"; // of every local port
 
-    /// Opens nothing. The local port is named `portPrefix` + ".BasebandStateReport.LogChannel".
+    /// Opens nothing. The local port is named `portPrefix` + `PortSuffix`.
     SpectrelModel(Services services, SpectrelModelObserver& observer, std::string portPrefix);
     ~SpectrelModel() override;
     SpectrelModel(const SpectrelModel&) = delete;

@@ -27,7 +27,8 @@ public:
     /// "12 codes", "everything".
     std::string description() const
     {
-        return _wantsEverything ? "everything" : std::to_string(_codes.size()) + " codes";
+        return _wantsEverything ? "everything"
+                                : std::to_string(_codes.size()) + (_codes.size() == 1 ? " code" : " codes");
     }
 
 private:

@@ -4,6 +4,7 @@
 
 #include <CLI/CLI.hpp>
 #include <iostream>
+#include <limits>
 #include <tuple>
 
 namespace spectrel {
@@ -17,74 +18,87 @@ constexpr const char* Description =
     "a live stream or a modem.\n"
     "Ports are met in $SPECTREL_PORT_DIR (default: $XDG_RUNTIME_DIR/spectrel).";
 
-const CLI::Validator IsScene(
-    [](std::string& name) {
-        Scene scene;
-        return sceneNamed(name, scene) ? std::string() : "'" + name + "' is not one of still, walk, drive, stress";
-    },
-    "still|walk|drive|stress");
-
-std::optional<ReplayPoint> parseReplayPoint(const std::string& text)
+std::optional<Scene> parseScene(std::string_view name)
 {
-    if (const auto offset = parseDuration(text))
+    Scene scene;
+    return sceneNamed(name, scene) ? std::optional(scene) : std::nullopt;
+}
+
+std::optional<std::uint32_t> parseSeed(std::string_view text)
+{
+    return parseWholeNumber(text, 0, std::numeric_limits<std::uint32_t>::max());
+}
+
+std::optional<double> parseRate(std::string_view text)
+{
+    return parseNumber(text, 0.01, 1000);
+}
+
+std::optional<double> parseSpeed(std::string_view text)
+{
+    const auto speed = parseNumber(text, 0, 1e6);
+    return speed > 0.0 && speed < 0.001 ? std::nullopt : speed;
+}
+
+std::optional<ReplayPoint> parseReplayPoint(std::string_view text)
+{
+    if (const auto offset = parseOffset(text))
         return ReplayPoint::after(*offset);
     return ReplayPoint::wallClock(text);
 }
 
+std::optional<int> parseDescriptor(std::string_view text)
+{
+    const auto number = parseWholeNumber(text, 0, std::numeric_limits<int>::max());
+    return number ? std::optional(static_cast<int>(*number)) : std::nullopt;
+}
+
+std::optional<std::string> parseAddress(std::string_view text)
+{
+    return text.empty() ? std::nullopt : std::optional<std::string>(text);
+}
+
+constexpr OptionForm<Scene> SceneForm {
+    "still|walk|drive|stress", parseScene, "is not one of still, walk, drive, stress"};
+constexpr OptionForm<std::uint32_t> SeedForm {"N", parseSeed, "is no whole number from 0 to 4294967295"};
+constexpr OptionForm<double> RateForm {"FACTOR", parseRate, "is no number from 0.01 to 1000"};
+constexpr OptionForm<double> SpeedForm {"FACTOR", parseSpeed, "is neither 0 nor a number from 0.001 to 1000000"};
+constexpr OptionForm<ReplayPoint> ReplayPointForm {"TIME", parseReplayPoint,
+    "is neither a time into the recording such as 90s nor a time such as '2024-03-05 14:07:31'"};
+constexpr OptionForm<int> DescriptorForm {"N", parseDescriptor, "is no number of a descriptor"};
+constexpr OptionForm<std::string> AddressForm {
+    "ADDRESS", parseAddress, "is neither -, a FIFO, unix:PATH nor tcp:HOST:PORT"};
+
 void describeSimulation(CLI::App& program, CLI::Option& simulate, SimulateOptions& options)
 {
-    program
-        .add_option_function<std::string>(
-            "--scene", [&options](const std::string& name) { sceneNamed(name, options.scene); },
-            "With --simulate: how the phone moves; stress sends every record ten times a second (default: drive)")
-        ->check(IsScene)
+    addFormedOption(program, "--scene", options.scene, SceneForm,
+        "With --simulate: how the phone moves; stress sends every record ten times a second (default: drive)")
         ->needs(&simulate);
-    program.add_option("--seed", options.seed, "With --simulate: the same seed gives the same drive (default: 1)")
+    addFormedOption(
+        program, "--seed", options.seed, SeedForm, "With --simulate: the same seed gives the same drive (default: 1)")
         ->needs(&simulate);
-    auto* rate = program.add_option("--rate", options.rate, "With --simulate: simulated seconds in one (default: 1)")
-                     ->check(CLI::Range(0.01, 1000.0))
+    auto* rate = addFormedOption(
+        program, "--rate", options.rate, RateForm, "With --simulate: simulated seconds in one (default: 1)")
                      ->needs(&simulate);
-    auto* write = program
-                      .add_option("--write", options.file,
-                          "With --simulate: write a recording into this file, without waiting, and end")
-                      ->type_name("FILE")
+    auto* write = addFormedOption(program, "--write", options.file, FileForm,
+        "With --simulate: write a recording into this file, without waiting, and end")
                       ->needs(&simulate)
                       ->excludes(rate);
-    program
-        .add_option_function<std::string>(
-            "--duration", [&options](const std::string& text) { options.duration = *parseDuration(text); },
-            "With --write: the length of the recording, such as 2h (default: 1m)")
-        ->check(IsDuration)
+    addFormedOption(program, "--duration", options.duration, DurationForm,
+        "With --write: the length of the recording, such as 2h (default: 1m)")
         ->needs(write);
 }
 
-const CLI::Validator IsReplayPoint(
-    [](std::string& text) {
-        return parseReplayPoint(text) ? std::string()
-                                      : "'" + text
-                + "' is neither a time into the recording such as 90s nor a time such as '2024-03-05 14:07:31'";
-    },
-    "TIME");
-
 void describeReplay(CLI::App& program, CLI::Option& replay, ReplayOptions& options)
 {
-    program
-        .add_option("--speed", options.speed,
-            "With --replay: times as fast as recorded; 0 is as fast as a client takes it (default: 1)")
-        ->check(CLI::NonNegativeNumber)
+    addFormedOption(program, "--speed", options.speed, SpeedForm,
+        "With --replay: times as fast as recorded; 0 is as fast as a client takes it (default: 1)")
         ->needs(&replay);
-    program
-        .add_option_function<std::string>(
-            "--from", [&options](const std::string& text) { options.from = parseReplayPoint(text); },
-            "With --replay: begin here: a time into the recording (90s, 5m), or a time of day (14:07:31) or a date and "
-            "time, local or with a zone (2024-03-05T13:07:31Z)")
-        ->check(IsReplayPoint)
+    addFormedOption(program, "--from", options.from, ReplayPointForm,
+        "With --replay: begin here: a time into the recording (90s, 5m), or a time of day (14:07:31) or a date and "
+        "time, local or with a zone (2024-03-05T13:07:31Z)")
         ->needs(&replay);
-    program
-        .add_option_function<std::string>(
-            "--to", [&options](const std::string& text) { options.to = parseReplayPoint(text); },
-            "With --replay: end here, told likewise")
-        ->check(IsReplayPoint)
+    addFormedOption(program, "--to", options.to, ReplayPointForm, "With --replay: end here, told likewise")
         ->needs(&replay);
     program.add_flag("--loop", options.loop, "With --replay: begin anew at the end")->needs(&replay);
 }
@@ -92,50 +106,37 @@ void describeReplay(CLI::App& program, CLI::Option& replay, ReplayOptions& optio
 void describe(CLI::App& program, ServiceOptions& options)
 {
     program.set_version_flag("--version", "spectrel-telephonyd " SPECTREL_VERSION);
-    auto* source = program.add_option_group("Source", "One of");
-    auto* simulate =
-        source
-            ->add_option_function<std::string>(
-                "--simulate",
-                [&options](const std::string& name) { options.simulate.technology = technologyNamed(name); },
-                "A simulated baseband of this technology")
-            ->check(IsTechnology);
+    CLI::App& source = *program.add_option_group("Source", "One of");
+    auto* simulate = addFormedOption(
+        source, "--simulate", options.simulate.technology, TechnologyForm, "A simulated baseband of this technology");
     auto* replay =
         source
-            ->add_option("--replay", options.replay.files,
+            .add_option("--replay", options.replay.files,
                 "Recordings (captures, snapshots, DLF files), one after the other, to each channel from their start")
             ->type_name("FILE");
-    source
-        ->add_option("--relay", options.relay,
-            "A live stream of capture (pcap) or DLF bytes: - (standard input), a FIFO, unix:PATH or "
-            "tcp:HOST:PORT to listen there (tcp:PORT: this machine alone)")
-        ->type_name("ADDRESS");
-    source
-        ->add_option_function<std::string>(
-            "--modem", [&options](const std::string& wish) { options.modem = wish; },
-            "The modem that ModemManager has: its number, object path, model or control port (default: one that is "
-            "registered)")
-        ->expected(0, 1)
-        ->type_name("[NAME]");
-    source->require_option(1);
+    addFormedOption(source, "--relay", options.relay, AddressForm,
+        "A live stream of capture (pcap) or DLF bytes: - (standard input), a FIFO, unix:PATH or "
+        "tcp:HOST:PORT to listen there (tcp:PORT: this machine alone)");
+    auto* modem =
+        source
+            .add_option_function<std::string>(
+                "--modem", [&options](const std::string& wish) { options.modem = wish; },
+                "The modem that ModemManager has: its number, object path, model or control port (default: one that is "
+                "registered)")
+            ->expected(0, 1)
+            ->type_name("[NAME]");
+    source.require_option(1);
     describeSimulation(program, *simulate, options.simulate);
     describeReplay(program, *replay, options.replay);
-    program
-        .add_option_function<std::string>(
-            "--technology", [&options](const std::string& name) { options.technology = technologyNamed(name); },
-            "With --replay and --relay: the technology, where a file or the stream does not tell")
-        ->check(IsTechnology)
-        ->excludes(simulate);
-    program
-        .add_option_function<std::string>(
-            "--status", [&options](const std::string& text) { options.statusInterval = parseDuration(text); },
-            "Tell on standard error every so often, such as 10s, what is streamed to whom, when anything is; the "
-            "signal "
-            "USR1 asks for it at any time")
-        ->check(IsDuration);
-    program
-        .add_option("--ready-fd", options.readyDescriptor, "Write a line to this descriptor once the port is served")
-        ->type_name("N");
+    addFormedOption(program, "--technology", options.technology, TechnologyForm,
+        "With --replay and --relay: the technology, where a file or the stream does not tell")
+        ->excludes(simulate)
+        ->excludes(modem);
+    addFormedOption(program, "--status", options.statusInterval, DurationForm,
+        "Tell on standard error every so often, such as 10s, what is streamed to whom, when anything is; the signal "
+        "USR1 asks for it at any time");
+    addFormedOption(program, "--ready-fd", options.readyDescriptor, DescriptorForm,
+        "Write a line to this descriptor once the port is served");
 }
 
 } // namespace

@@ -126,8 +126,10 @@ int serve(ServiceOptions& options)
     QtRunLoop runLoop;
     QtClock clock;
     Clock::install(&clock);
-    SocketMessagePorts ports(Places::portDirectory());
     std::string reason;
+    if (!SocketMessagePorts::prepareDirectory(Places::portDirectory(), TelephonyProtocol::ServicePort, reason))
+        return fail("the message ports' folder cannot be had: " + reason);
+    SocketMessagePorts ports(Places::portDirectory());
     if (!adoptSocket(manager, ports, reason))
         return fail(reason);
     const auto source = makeSource(options, runLoop, clock, reason);
@@ -135,8 +137,8 @@ int serve(ServiceOptions& options)
         return fail(reason);
     TelephonyService service(runLoop, ports, *source);
     if (!service.start())
-        return fail("cannot take the telephony service's port in " + Places::portDirectory()
-            + ": another service runs there, or the folder is not this user's own");
+        return fail(
+            "cannot take the telephony service's port in " + Places::portDirectory() + ": another service runs there");
     StatusReport report(clock, service, *source);
     const TerminationSignals terminationSignals(
         [&](int signal) { signal == SIGUSR1 ? tellStatus(report) : runLoop.quit(); }, {SIGUSR1});

@@ -46,6 +46,16 @@ SocketMessagePorts::SocketMessagePorts(std::string directory)
 {
 }
 
+bool SocketMessagePorts::prepareDirectory(const std::string& directory, std::string_view name, std::string& reason)
+{
+    if (!makePrivateDirectory(directory, reason))
+        return false;
+    if (portAddress(directory, name))
+        return true;
+    reason = directory + ": with a port's name the path is longer than 107 bytes";
+    return false;
+}
+
 MessagePorts::LocalResult SocketMessagePorts::createLocal(
     std::string_view name, LocalMessagePort::MessageHandler handler)
 {

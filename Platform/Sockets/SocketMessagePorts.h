@@ -16,6 +16,8 @@ class SocketMessagePorts final : public MessagePorts {
 public:
     /// Nothing is made or checked yet.
     explicit SocketMessagePorts(std::string directory);
+    /// Makes the folder at need. False, with `reason`, when it cannot be had or a port of that name would not fit.
+    static bool prepareDirectory(const std::string& directory, std::string_view name, std::string& reason);
 
     /// Makes the folder at need. Null and logged when it belongs to somebody else or the name cannot be used.
     LocalResult createLocal(std::string_view name, LocalMessagePort::MessageHandler handler) override;

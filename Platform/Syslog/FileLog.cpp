@@ -54,7 +54,7 @@ std::unique_ptr<FileLog> FileLog::create(const std::string& path, Writing writin
 {
     if (std::FILE* const file = std::fopen(path.c_str(), "we"))
         return std::unique_ptr<FileLog>(new FileLog(file, writing));
-    reason = path + ": " + std::strerror(errno);
+    reason = std::strerror(errno);
     return nullptr;
 }
 

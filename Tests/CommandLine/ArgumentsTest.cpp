@@ -3,6 +3,10 @@
 #include "CommandLine/OptionTypes.h"
 
 #include <gtest/gtest.h>
+#include <limits>
+#include <string>
+#include <utility>
+#include <vector>
 
 namespace spectrel {
 namespace {
@@ -21,6 +25,34 @@ TEST(ParseDurationTest, AnythingElseIsNone)
 {
     for (const char* text : {"", "s", "-1", "1 s", "1d", "1.2.3s", "0", "1e3", "99999999999999999999h"})
         EXPECT_FALSE(parseDuration(text)) << text;
+}
+
+TEST(ParseOffsetTest, NoTimeAtAllIsAnOffsetButNoDuration)
+{
+    EXPECT_EQ(parseOffset("0"), std::chrono::milliseconds(0));
+    EXPECT_EQ(parseOffset("0s"), std::chrono::milliseconds(0));
+    EXPECT_EQ(parseOffset("1.5m"), std::chrono::seconds(90));
+    EXPECT_EQ(parseDuration("0.2ms"), std::nullopt);
+    EXPECT_EQ(parseOffset("-1s"), std::nullopt);
+}
+
+TEST(ParseWholeNumberTest, DigitsAloneWithinTheBounds)
+{
+    constexpr auto Largest = std::numeric_limits<std::uint64_t>::max();
+    EXPECT_EQ(parseWholeNumber("1", 1, Largest), 1u);
+    EXPECT_EQ(parseWholeNumber("18446744073709551615", 1, Largest), Largest);
+    EXPECT_EQ(parseWholeNumber("0", 0, 9), 0u);
+    for (const char* text : {"0", "-1", "+1", "1.5", "1 ", " 1", "x", "0x10", "", "18446744073709551616"})
+        EXPECT_EQ(parseWholeNumber(text, 1, Largest), std::nullopt) << text;
+    EXPECT_EQ(parseWholeNumber("10", 0, 9), std::nullopt);
+}
+
+TEST(ParseNumberTest, FiniteNumbersWithinTheBounds)
+{
+    EXPECT_EQ(parseNumber("0.5", 0, 10), 0.5);
+    EXPECT_EQ(parseNumber("1e1", 0, 10), 10.0);
+    for (const char* text : {"nan", "inf", "-inf", "-0.1", "10.1", "1e999", "1x", "", "two"})
+        EXPECT_EQ(parseNumber(text, 0, 10), std::nullopt) << text;
 }
 
 std::optional<int> read(std::vector<const char*> words, Arguments& arguments)
@@ -71,6 +103,59 @@ TEST(ReadArgumentsTest, ViewTakesAFileItsTechnologyAndTheScreens)
     EXPECT_EQ(arguments.screens, ScreenChoice::Terminal);
     EXPECT_EQ(arguments.view.file, "a.dlf");
     EXPECT_EQ(arguments.view.technology, Technology::LTE);
+}
+
+/// What is told on standard error about the words, which are wrong usage.
+std::string complaintAbout(const std::vector<const char*>& words)
+{
+    Arguments arguments;
+    testing::internal::CaptureStderr();
+    EXPECT_EQ(read(words, arguments), ExitStatus::WrongUsage);
+    return testing::internal::GetCapturedStderr();
+}
+
+TEST(ReadArgumentsTest, NumberOutOfItsBoundsIsToldWithThem)
+{
+    for (const char* text : {"0", "-1", "x", "1.5", "18446744073709551616"}) {
+        EXPECT_EQ(complaintAbout({"watch", "--count", text}),
+            "spectrel: --count: '" + std::string(text) + "' is no whole number from 1 up (see spectrel --help)\n");
+    }
+    EXPECT_EQ(complaintAbout({"record", "--keep", "0", "a"}),
+        "spectrel: --keep: '0' is no whole number from 1 up (see spectrel --help)\n");
+    EXPECT_EQ(complaintAbout({"record", "--rollover", "999", "a"}),
+        "spectrel: --rollover: '999' is no size such as 500k, 100M or 2G; the least is 1k (see spectrel --help)\n");
+}
+
+TEST(ReadArgumentsTest, EmptyNameOfAFileOrFolderIsWrongUsage)
+{
+    EXPECT_EQ(complaintAbout({"decode", "--snapshot", "", "a"}),
+        "spectrel: --snapshot: '' names no folder (see spectrel --help)\n");
+    EXPECT_EQ(complaintAbout({"record", ""}), "spectrel: FILE: '' names no file (see spectrel --help)\n");
+    EXPECT_EQ(complaintAbout({"view", ""}), "spectrel: FILE: '' names no file (see spectrel --help)\n");
+    EXPECT_EQ(complaintAbout({"--log", ""}), "spectrel: --log: '' names no file (see spectrel --help)\n");
+    EXPECT_EQ(complaintAbout({"--resources", ""}), "spectrel: --resources: '' names no folder (see spectrel --help)\n");
+}
+
+TEST(ReadArgumentsTest, StandardOutputTakesNoOptionOfSeveralFiles)
+{
+    for (const auto& [option, value] : std::vector<std::pair<const char*, const char*>> {
+             {"--rollover", "1M"}, {"--rollover-time", "1h"}, {"--keep", "2"}}) {
+        EXPECT_EQ(complaintAbout({"record", "-", option, value}),
+            "spectrel: " + std::string(option)
+                + ": standard output is one stream, not several files (see spectrel --help)\n");
+    }
+}
+
+TEST(ReadArgumentsTest, EveryCommandTellsHelpAndVersion)
+{
+    for (const char* command : {"watch", "decode", "view", "record"}) {
+        for (const char* option : {"--help", "--version"}) {
+            Arguments arguments;
+            testing::internal::CaptureStdout();
+            EXPECT_EQ(read({command, option}, arguments), ExitStatus::Done) << command << ' ' << option;
+            EXPECT_NE(testing::internal::GetCapturedStdout(), "") << command << ' ' << option;
+        }
+    }
 }
 
 TEST(ReadArgumentsTest, WrongUsageIsStatus2)

@@ -52,6 +52,13 @@ TEST_F(DisplayChangesTest, RemovedAndAppendedKeyIsToldOnce)
     EXPECT_EQ(update(display), "/A=1\n");
 }
 
+TEST_F(DisplayChangesTest, PathThatAnotherLeafStillHasIsNotGone)
+{
+    update(Dictionary::make({{"_sorted", ""}, {"1;X", "a"}, {"2;X", "b"}, {"3;Y", "c"}}));
+    EXPECT_EQ(update(Dictionary::make({{"_sorted", ""}, {"1;X", "b"}, {"3;Y", "c"}})), "/X=b\n");
+    EXPECT_EQ(update(Dictionary::make({{"_sorted", ""}, {"3;Y", "c"}})), "/X gone\n");
+}
+
 TEST_F(DisplayChangesTest, OrderAloneIsNoChange)
 {
     update(Dictionary::make({{"A", "1"}, {"B", "2"}, {"C", "3"}}));

@@ -119,6 +119,15 @@ class Formats(Decode):
         self.assertEqual(display["Serving Cell Info"]["Physical Cell ID"], "5")
         self.assertEqual(display["SIM Info"]["EF-ICCID"], "2")
 
+    def test_dash_is_standard_input(self):
+        recording = capture([serving_cell(5), serving_cell(6)])
+        for given, status, complaint in ((recording, 0, ""), (recording[:-3], 1, "spectrel: standard input: message 1 ")):
+            done = subprocess.run([os.path.join(BIN, "spectrel"), "decode", "--format", "json", "-"], input=given,
+                                  env=self.environment, capture_output=True)
+            self.assertEqual(done.returncode, status)
+            self.assertEqual(json.loads(done.stdout)["Serving Cell Info"]["Physical Cell ID"], "56"[1 - status])
+            self.assertIn(complaint, done.stderr.decode())
+
     def test_console_lines_go_to_standard_error(self):
         done = self.decode(self.write("a.pcap", capture([serving_cell()])))
         self.assertIn("Deallocing LTEClassIndex\nDeallocing ClassIndex\n", done.stderr)
@@ -194,6 +203,19 @@ class Failures(Decode):
                                   stderr=subprocess.PIPE, text=True)
         self.assertEqual(done.returncode, 1)
         self.assertIn("standard output", done.stderr)
+
+
+    def test_folder_or_file_that_cannot_be_had_is_status_1_and_named_once(self):
+        file = self.write("a.pcap", capture([serving_cell(5)]))
+        plain = self.write("plain", b"")
+        nowhere = self.path("no", "where")
+        for arguments, line in (
+                (["--resources", nowhere], f"{nowhere}: No such file or directory"),
+                (["--resources", plain], f"{plain}: not a folder of display templates"),
+                (["--log", nowhere], f"{nowhere}: No such file or directory"),
+                (["--log", self.folder], f"{self.folder}: Is a directory")):
+            done = self.decode("--format", "none", *arguments, file)
+            self.assertEqual((done.returncode, done.stderr), (1, f"spectrel: {line}\n"))
 
 
 class Snapshots(Decode):

@@ -57,12 +57,40 @@ class Watch(Place):
         self.assertEqual([list(display) for display in self.displays(done)],
                          2 * [LTE_SECTIONS])
 
+    def test_reader_that_goes_away_ends_it_and_leaves_no_port_behind(self):
+        self.start_service("--simulate", "lte", "--scene", "stress")
+        watching = self.start_watch("--format", "json")
+        self.next_line(watching)
+        watching.stdout.close()
+        self.assertEqual(watching.wait(WAIT), 1)
+        self.assertIn("spectrel: standard output: cannot be written\n", watching.stderr.read())
+        self.assertEqual([name for name in os.listdir(self.path("ports")) if "Watch" in name], [])
+
     def test_several_programs_watch_at_once(self):
         self.start_service("--simulate", "lte")
         first = self.start_watch("--format", "json")
         second = self.start_watch("--format", "json")
         for process in (first, second, first, second):
             self.assertIn("Serving Cell Info", json.loads(self.next_line(process)))
+
+
+class Ports(Place):
+    def test_folder_of_the_ports_that_cannot_be_had_is_told_and_status_1(self):
+        self.environment["SPECTREL_PORT_DIR"] = self.write("plain", b"")
+        for program, arguments in (("spectrel", ["watch"]), ("spectrel", ["record", self.path("r.pcap")]),
+                                   ("spectrel-telephonyd", ["--simulate", "lte"])):
+            done = self.run_spectrel(*arguments, program=program)
+            self.assertEqual((done.returncode, done.stderr), (
+                1, f"{program}: the message ports' folder cannot be had: {self.path('plain')}: "
+                   "not a folder of this user\n"))
+
+    def test_folder_too_long_for_the_names_of_ports_is_told_and_status_1(self):
+        folder = self.environment["SPECTREL_PORT_DIR"] = self.path("x" * 100)
+        for program, arguments in (("spectrel", ["watch"]), ("spectrel-telephonyd", ["--simulate", "lte"])):
+            done = self.run_spectrel(*arguments, program=program)
+            self.assertEqual((done.returncode, done.stderr), (
+                1, f"{program}: the message ports' folder cannot be had: {folder}: "
+                   "with a port's name the path is longer than 107 bytes\n"))
 
 
 class OtherServices(Place):

@@ -23,6 +23,13 @@ class Replay(Place):
         self.assertEqual(done.returncode, 0, done.stderr)
         self.assertEqual(self.bodies("r.pcap"), [serving_cell(number) for number in (3, 4, 5)])
 
+    def test_part_may_start_at_the_very_beginning(self):
+        file = self.write("a.pcap", capture([serving_cell(number) for number in range(1, 10)]))
+        self.start_service("--replay", file, "--speed", "0", "--from", "0", "--to", "0s")
+        done = self.run_spectrel("record", self.path("r.pcap"), "--count", "1")
+        self.assertEqual(done.returncode, 0, done.stderr)
+        self.assertEqual(self.bodies("r.pcap"), [serving_cell(1)])
+
     def test_part_is_told_by_the_clock(self):
         file = self.write("a.pcap", capture([serving_cell(number) for number in range(1, 10)]))  # 22:13:20 UTC
         self.start_service("--replay", file, "--speed", "0", "--from", "2023-11-14 22:13:26Z")
@@ -182,6 +189,23 @@ class Relay(Place):
             self.assertEqual(done.returncode, 1, address)
             self.assertEqual(done.stderr.count("\n"), 1, done.stderr)
             self.assertIn(address, done.stderr)
+
+    def test_value_out_of_its_bounds_is_told_with_them_and_wrong_usage(self):
+        simulate = ["--simulate", "lte"]
+        replay = ["--replay", self.write("a.pcap", capture([serving_cell(1)]))]
+        for arguments, complaint in (
+                ([*simulate, "--rate", "nan"], "--rate: 'nan' is no number from 0.01 to 1000"),
+                ([*simulate, "--rate", "1e9"], "--rate: '1e9' is no number from 0.01 to 1000"),
+                ([*simulate, "--seed", "-1"], "--seed: '-1' is no whole number from 0 to 4294967295"),
+                ([*simulate, "--ready-fd", "-2"], "--ready-fd: '-2' is no number of a descriptor"),
+                ([*simulate, "--write", ""], "--write: '' names no file"),
+                ([*replay, "--speed", "-1"], "--speed: '-1' is neither 0 nor a number from 0.001 to 1000000"),
+                ([*replay, "--speed", "nan"], "--speed: 'nan' is neither 0 nor a number from 0.001 to 1000000"),
+                (["--relay", ""], "--relay: '' is neither -, a FIFO, unix:PATH nor tcp:HOST:PORT"),
+                (["--modem", "--technology", "lte"], "--technology excludes --modem")):
+            done = self.run_spectrel(*arguments, program="spectrel-telephonyd")
+            self.assertEqual((done.returncode, done.stderr),
+                             (2, f"spectrel-telephonyd: {complaint} (see spectrel-telephonyd --help)\n"))
 
     def test_standard_input_that_is_no_stream_is_refused(self):
         done = subprocess.run([os.path.join(BIN, "spectrel-telephonyd"), "--relay", "-"], env=self.environment,

@@ -14,3 +14,7 @@ spectrel_test(test_message_ports
 spectrel_test(test_telephony_server
     SOURCES SocketTelephonyServerTest.cpp
     USES spectrel_ports spectrel_expat spectrel_fakes)
+
+spectrel_test(test_stream_inputs
+    SOURCES StreamInputTest.cpp
+    USES spectrel_qt spectrel_ports spectrel_fakes)
