@@ -5,13 +5,11 @@
 #include "CommandLine/Report.h"
 #include "CommandLine/SingleInstance.h"
 #include "CommandLine/ViewedFile.h"
-#include "Monitor/Snapshot.h"
-#include "Platform/Preferences.h"
+#include "CommandLine/ViewingApplication.h"
 #include "Platform/Qt/QtClock.h"
 #include "Platform/Qt/QtRunLoop.h"
 #include "Platform/Qt/TerminationSignals.h"
 #include "UI/Quick/QuickFrontEnd.h"
-#include "UI/SpectrelApp.h"
 
 #include <cstdlib>
 #include <utility>
@@ -49,62 +47,36 @@ int runApplication(const GraphicalArguments& arguments)
     return ExitStatus::Done;
 }
 
-/// The screens in a window over a file, for one run. No session is started, nothing is saved.
-class GraphicalViewing {
-public:
-    explicit GraphicalViewing(const GraphicalArguments& arguments)
-        : _path(*arguments.viewedFile)
-        , _frontEnd(arguments.appearance)
-    {
-        _frontEnd.onQuit = [this] { _runLoop.quit(); };
+/// The screens in a window over a file.
+int viewFile(const GraphicalArguments& arguments)
+{
+    const std::string& path = *arguments.viewedFile;
+    QtRunLoop runLoop;
+    const QtClock deviceClock;
+    QuickFrontEnd frontEnd(arguments.appearance);
+    frontEnd.onQuit = [&runLoop] { runLoop.quit(); };
+    std::string reason;
+    const auto file = ViewedFile::open(path, arguments.technology, deviceClock, reason);
+    if (!file) {
+        report(path + ": " + reason);
+        return ExitStatus::Failed;
     }
-
-    int run(std::optional<Technology> technology)
-    {
-        std::string reason;
-        const auto file = ViewedFile::open(_path, technology, _deviceClock, reason);
-        if (!file) {
-            tell(reason);
-            return ExitStatus::Failed;
-        }
-        if (!_frontEnd.start(reason)) {
-            report("cannot open the graphical screens: " + reason);
-            return ExitStatus::Failed;
-        }
-        if (!file->damage().empty())
-            tell(file->damage());
-        const TerminationSignals endings([this](int) { _runLoop.quit(); });
-        SpectrelApp application({_runLoop, file->clock(), _preferences, _frontEnd.toolkit(),
-            [&](SpectrelModelObserver& observer) {
-                return file->makeModel(_runLoop, observer, [this](const std::string& line) { tell(line); });
-            },
-            writeSnapshot, {}, false});
-        application.applicationDidFinishLaunching();
-        _runLoop.run();
-        application.applicationWillTerminate();
-        _frontEnd.stop();
-        return file->damage().empty() ? ExitStatus::Done : ExitStatus::Failed;
+    if (!frontEnd.start(reason)) {
+        report("cannot open the graphical screens: " + reason);
+        return ExitStatus::Failed;
     }
-
-private:
-    void tell(const std::string& line) const
-    {
-        report(_path + ": " + line);
-    }
-
-    std::string _path;
-    QtRunLoop _runLoop;
-    QtClock _deviceClock;
-    NoPreferences _preferences;
-    QuickFrontEnd _frontEnd;
-};
+    const TerminationSignals endings([&runLoop](int) { runLoop.quit(); });
+    const int status = runViewingApplication(*file, path, runLoop, frontEnd.toolkit());
+    frontEnd.stop();
+    return status;
+}
 
 } // namespace
 
 int runGraphicalApplication(const GraphicalArguments& arguments)
 {
     if (arguments.viewedFile)
-        return GraphicalViewing(arguments).run(arguments.technology);
+        return viewFile(arguments);
     return runApplication(arguments);
 }
 

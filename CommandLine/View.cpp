@@ -4,11 +4,9 @@
 #include "CommandLine/Report.h"
 #include "CommandLine/Screens.h"
 #include "CommandLine/ViewedFile.h"
-#include "Monitor/Snapshot.h"
-#include "Platform/Preferences.h"
+#include "CommandLine/ViewingApplication.h"
 #include "Platform/Qt/QtClock.h"
 #include "Platform/Qt/QtRunLoop.h"
-#include "UI/SpectrelApp.h"
 #include "UI/Terminal/TerminalFrontEnd.h"
 
 namespace spectrel {
@@ -23,41 +21,21 @@ int viewGraphically(const Arguments& arguments)
     return runGraphical(arguments, std::move(options));
 }
 
-/// The screens in the terminal over a file, for one run.
-class TerminalViewing {
-public:
-    TerminalViewing()
-        : _frontEnd(_runLoop)
-    {
-        _frontEnd.onQuit = [this] { _runLoop.quit(); };
+/// The screens in the terminal over a file. Lines on standard error come out when the screens are closed.
+int viewInTerminal(const std::string& path, ViewedFile& file)
+{
+    QtRunLoop runLoop;
+    TerminalFrontEnd frontEnd(runLoop);
+    frontEnd.onQuit = [&runLoop] { runLoop.quit(); };
+    std::string reason;
+    if (!frontEnd.start(reason)) {
+        report("cannot open the terminal screens: " + reason);
+        return ExitStatus::Failed;
     }
-
-    int run(const std::string& path, ViewedFile& file)
-    {
-        std::string reason;
-        if (!_frontEnd.start(reason)) {
-            report("cannot open the terminal screens: " + reason);
-            return ExitStatus::Failed;
-        }
-        // Lines on standard error come out when the screens are closed.
-        const auto tell = [&path](const std::string& line) { report(path + ": " + line); };
-        if (!file.damage().empty())
-            tell(file.damage());
-        SpectrelApp application({_runLoop, file.clock(), _preferences, _frontEnd.toolkit(),
-            [&](SpectrelModelObserver& observer) { return file.makeModel(_runLoop, observer, tell); }, writeSnapshot,
-            {}, false});
-        application.applicationDidFinishLaunching();
-        _runLoop.run();
-        application.applicationWillTerminate();
-        _frontEnd.stop();
-        return file.damage().empty() ? ExitStatus::Done : ExitStatus::Failed;
-    }
-
-private:
-    QtRunLoop _runLoop;
-    NoPreferences _preferences;
-    TerminalFrontEnd _frontEnd;
-};
+    const int status = runViewingApplication(file, path, runLoop, frontEnd.toolkit());
+    frontEnd.stop();
+    return status;
+}
 
 } // namespace
 
@@ -76,7 +54,7 @@ int view(const Arguments& arguments)
         return ExitStatus::Failed;
     }
     if (screens == Screens::Terminal)
-        return TerminalViewing().run(arguments.view.file, *file);
+        return viewInTerminal(arguments.view.file, *file);
     report(arguments.view.file + ": there is neither a terminal nor a display to show it; spectrel decode prints it");
     return ExitStatus::Failed;
 }
