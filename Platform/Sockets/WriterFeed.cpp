@@ -35,6 +35,7 @@ void WriterFeed::close()
 {
     if (_notifier) {
         _notifier->setEnabled(false);
+        _notifier->setParent(&_retired);
         _notifier.release()->deleteLater(); // it may be the one that called
     }
     _descriptor.close();

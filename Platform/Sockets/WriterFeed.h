@@ -3,6 +3,8 @@
 #include "Platform/Sockets/FileDescriptor.h"
 #include "Platform/StreamInput.h"
 
+#include <QObject>
+
 #include <functional>
 #include <memory>
 
@@ -42,6 +44,7 @@ private:
     bool _hasWriter = false;
     bool _isPaused = false;
     Bytes _piece;
+    QObject _retired; // owns the former notifiers until they are deleted: at the latest with the feed
 };
 
 } // namespace spectrel
