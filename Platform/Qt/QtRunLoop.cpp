@@ -102,6 +102,12 @@ void QtRunLoop::async(Job job)
 
 void QtRunLoop::after(std::chrono::nanoseconds delay, Job job)
 {
+    // More than the timer can count, some 24 days, is waited for in parts.
+    constexpr std::chrono::milliseconds Longest(std::numeric_limits<int>::max());
+    if (delay > Longest) {
+        after(Longest, [this, rest = delay - Longest, job = std::move(job)] { after(rest, job); });
+        return;
+    }
     QTimer::singleShot(milliseconds(delay), Qt::PreciseTimer, &_queue->delayed, std::move(job));
 }
 

@@ -25,8 +25,6 @@ char escapeLetter(char character)
         return 'f';
     case '\v':
         return 'v';
-    case '\\':
-        return '\\';
     default:
         return 0;
     }

@@ -11,8 +11,8 @@ namespace spectrel {
 
 /// The system log as a file: one line "<PRIORITY>TEXT" each, control characters escaped as in C.
 ///
-/// \n \t \r \a \b \f \v and \\ have their letters; every other control character is three octal digits (\033), which
-/// no following digit can change. Bytes from 0x80 on stand as they are.
+/// \n \t \r \a \b \f \v have their letters; every other control character is three octal digits (\033), which no
+/// following digit can change. All else stands as it is, a backslash of the text and bytes from 0x80 on, too.
 class FileLog final : public SystemLog {
 public:
     /// Whether each line is in the file at once, or whenever the buffer is full and at the end.

@@ -36,7 +36,7 @@ TEST_F(FileLogTest, ControlCharactersAreEscapedAsInC)
 {
     const auto log = FileLog::create(path, FileLog::Writing::EachLine, reason);
     log->write(4, "\n\t\r\a\b\f\v\\"s + "\0"s + "1\x1b" + "7\x7f");
-    EXPECT_EQ(content(), "<4>\\n\\t\\r\\a\\b\\f\\v\\\\\\0001\\0337\\177\n");
+    EXPECT_EQ(content(), "<4>\\n\\t\\r\\a\\b\\f\\v\\\\0001\\0337\\177\n");
 }
 
 TEST_F(FileLogTest, BytesBeyondASCIIStandAsTheyAre)
