@@ -46,7 +46,8 @@ class TerminalPlace(Place):
 
     def tmux(self, *arguments):
         return subprocess.run(["tmux", "-S", self.socket, "-f", "/dev/null", *arguments], encoding="utf-8",
-                              capture_output=True, env={**self.environment, "TERM": "xterm-256color"})
+                              capture_output=True,
+                              env={**self.environment, "TERM": "xterm-256color", "SHELL": "/bin/sh"})
 
     def shell(self):
         return self.tmux("display-message", "-p", "#{pane_pid}").stdout.strip()
