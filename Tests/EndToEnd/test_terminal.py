@@ -54,7 +54,7 @@ class TerminalPlace(Place):
 
     def open(self, *arguments, width=80, height=24, before="true"):
         """Starts a shell in a terminal and the program from it, so that what it leaves behind can be seen."""
-        self.tmux("new-session", "-d", "-x", str(width), "-y", str(height), "sh", ";",
+        self.tmux("new-session", "-d", "-x", str(width), "-y", str(height), "exec sh", ";",
                   "set-option", "-s", "set-clipboard", "on")
         program = shlex.join([os.path.join(BIN, "spectrel"), *arguments])
         self.keys(f"PS1='prompt% '; {before}; clear; {program}; echo status $?", "Enter")
