@@ -204,15 +204,12 @@ void RecordingModel::arrive()
     if (!_track.next() && _notice.empty())
         _notice = _track.damage();
     _clock.set(_track.momentAt(_time));
+    if (std::exchange(_isTreeOld, false)) {
+        _nodesByPath.clear();
+        _nodes = SpectrelModelNode::makeTreeFromObject(_session->display(), _nodesByPath);
+        _observer.updateViewControllerFromModel(); // at once: no screen shows a place with the tree of another
+    }
     _observer.playbackDidChange();
-    if (!std::exchange(_isTreeOld, false))
-        return;
-    _nodesByPath.clear();
-    _nodes = SpectrelModelNode::makeTreeFromObject(_session->display(), _nodesByPath);
-    _runLoop.async([this, alive = std::weak_ptr(_alive)] {
-        if (!alive.expired())
-            _observer.updateViewControllerFromModel();
-    });
 }
 
 } // namespace spectrel

@@ -208,6 +208,20 @@ TEST_F(RecordingModelTest, ALongWayIsGoneInTurnsOfTheRunLoopAndShownOnArrival)
     EXPECT_EQ(screens.reloads, reloads + 1);
 }
 
+TEST_F(RecordingModelTest, APlaceIsNeverShownWithTheTreeOfAnother)
+{
+    viewDrive();
+    std::string shown = identity();
+    screens.atReload = [&] { shown = identity(); };
+    screens.atPlaybackChange = [&] { EXPECT_EQ(shown, std::to_string(playback().messagesApplied())); };
+    playback().stepMessage(Direction::Forward);
+    playback().stepMessage(Direction::Backward);
+    playback().seek(3s);
+    playback().play();
+    loop.advance(10s);
+    EXPECT_EQ(place(), "10000 ms, 4: 4");
+}
+
 TEST_F(RecordingModelTest, ANewWishTakesThePlaceOfTheOneUnderWay)
 {
     ASSERT_TRUE(view(longDrive(3 * RecordingModel::Slice)));

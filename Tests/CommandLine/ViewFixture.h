@@ -12,6 +12,7 @@
 
 #include <chrono>
 #include <cstdint>
+#include <functional>
 #include <gtest/gtest.h>
 #include <memory>
 #include <optional>
@@ -20,18 +21,24 @@
 
 namespace spectrel {
 
-/// Counts what the screens would have been told.
+/// Counts what the screens would have been told, and calls back where a test wants to look.
 struct ScreenCounter final : SpectrelModelObserver {
     void updateViewControllerFromModel() override
     {
         ++reloads;
+        if (atReload)
+            atReload();
     }
     void playbackDidChange() override
     {
         ++playbackChanges;
+        if (atPlaybackChange)
+            atPlaybackChange();
     }
     int reloads = 0;
     int playbackChanges = 0;
+    std::function<void()> atReload;
+    std::function<void()> atPlaybackChange;
 };
 
 /// Files that are viewed in virtual time.
