@@ -55,9 +55,10 @@ public:
     }
     /// Starts streaming to one channel; the sink outlives the stream.
     virtual std::unique_ptr<LogStream> start(MessageSink& sink) = 0;
-    /// `handler` is called from the main queue when `technology` has become another one; the channels then end, so that
-    /// their clients ask for it again. Sources of a fixed technology never call it.
-    virtual void setTechnologyHandler(std::function<void()> handler)
+    /// `handler` is called from the main queue when another baseband is to speak, or none for now: `technology` may be
+    /// another one, and what was heard so far is no longer so. The channels then end, so that their clients begin anew.
+    /// Sources of one baseband never call it.
+    virtual void setBasebandHandler(std::function<void()> handler)
     {
         static_cast<void>(handler);
     }

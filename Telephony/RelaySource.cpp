@@ -159,15 +159,15 @@ void RelaySource::begin()
     const auto before = std::exchange(_technology, _stream->technology());
     if (before != _technology || _streams.empty())
         tell(_input->name() + ": a stream of technology " + std::string(technologyName(*_technology)));
-    if (!before || before == _technology || !_technologyHandler)
+    if (!before || before == _technology || !_basebandHandler)
         return;
     _isChanging = true;
     _runLoop.async([this, alive = std::weak_ptr(_alive)] {
         if (alive.expired())
             return;
         _isChanging = false;
-        if (_technologyHandler)
-            _technologyHandler(); // ends the channels, and with them their streams
+        if (_basebandHandler)
+            _basebandHandler(); // ends the channels, and with them their streams
         pump();
     });
 }

@@ -42,9 +42,9 @@ public:
         return _technology.has_value();
     }
     std::unique_ptr<LogStream> start(MessageSink& sink) override;
-    void setTechnologyHandler(std::function<void()> handler) override
+    void setBasebandHandler(std::function<void()> handler) override
     {
-        _technologyHandler = std::move(handler);
+        _basebandHandler = std::move(handler);
     }
     std::string status() const override;
 
@@ -68,7 +68,7 @@ private:
     std::unique_ptr<StreamInput> _input;
     std::optional<Technology> _givenTechnology;
     std::function<void()> _onFailure;
-    std::function<void()> _technologyHandler;
+    std::function<void()> _basebandHandler;
     std::shared_ptr<bool> _alive = std::make_shared<bool>(true);
 
     std::optional<Technology> _technology; // of the latest stream

@@ -36,7 +36,7 @@ TelephonyService::~TelephonyService()
     _channels.clear();
     if (!_port)
         return;
-    _source.setTechnologyHandler({});
+    _source.setBasebandHandler({});
     _port->invalidate();
 }
 
@@ -48,15 +48,15 @@ bool TelephonyService::start()
         return false;
     _port = port;
     _port->serve();
-    _source.setTechnologyHandler([this] { endChannels(); });
+    _source.setBasebandHandler([this] { endChannels(); });
     return true;
 }
 
-/// The source's technology is another one now: the clients are to ask for it, and choose their codes, anew.
+/// Another baseband is to speak now: the clients are to ask for its technology, and choose their codes, anew.
 void TelephonyService::endChannels()
 {
     if (!_channels.empty())
-        tell("ending " + std::to_string(_channels.size()) + " channel(s): their technology has changed");
+        tell("ending " + std::to_string(_channels.size()) + " channel(s): their baseband has changed");
     _channels.clear();
     tellChange();
 }

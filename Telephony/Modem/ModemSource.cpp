@@ -70,9 +70,9 @@ ModemSource::ModemSource(RunLoop& runLoop, const Clock& clock, std::unique_ptr<M
 
 ModemSource::~ModemSource() = default;
 
-void ModemSource::setTechnologyHandler(std::function<void()> handler)
+void ModemSource::setBasebandHandler(std::function<void()> handler)
 {
-    _technologyHandler = std::move(handler);
+    _basebandHandler = std::move(handler);
 }
 
 std::unique_ptr<LogStream> ModemSource::start(MessageSink& sink)
@@ -128,11 +128,8 @@ void ModemSource::leaveModem()
 {
     tell(modemName(*_modem) + " is no longer used");
     endListening();
-    // What it heard and carried is no longer so; the SIM and the technology may be the next modem's too.
-    _modem->bearers.clear();
-    send(Contexts);
-    send(Cells);
     _modem.reset();
+    endChannels(); // so that the programs tell that nothing is heard any more
 }
 
 void ModemSource::takeModem(const ModemFacts& modem)
@@ -170,17 +167,22 @@ void ModemSource::forgetCells()
     askForCells();
 }
 
-/// Channels live with one technology: a change ends them, and their clients ask anew.
+/// Channels live with one modem and one technology: a change ends them, and their clients begin anew.
+void ModemSource::endChannels()
+{
+    _runLoop.async([this, alive = std::weak_ptr(_alive)] {
+        if (!alive.expired() && _basebandHandler)
+            _basebandHandler();
+    });
+}
+
 void ModemSource::followTechnology()
 {
     if (!_modem->technology || *_modem->technology == _technology)
         return;
     _technology = *_modem->technology;
     tell("the technology is now " + std::string(technologyName(_technology)));
-    _runLoop.async([this, alive = std::weak_ptr(_alive)] {
-        if (!alive.expired() && _technologyHandler)
-            _technologyHandler();
-    });
+    endChannels();
 }
 
 void ModemSource::beginListening()

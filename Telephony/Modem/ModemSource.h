@@ -33,7 +33,7 @@ public:
         return _technology;
     }
     std::unique_ptr<LogStream> start(MessageSink& sink) override;
-    void setTechnologyHandler(std::function<void()> handler) override;
+    void setBasebandHandler(std::function<void()> handler) override;
 
 private:
     enum Kind : std::size_t { Sim, Cells, Contexts, Kinds };
@@ -45,6 +45,7 @@ private:
     void takeModem(const ModemFacts& modem);
     void update(const ModemFacts& modem);
     void forgetCells();
+    void endChannels();
     void followTechnology();
 
     void beginListening();
@@ -67,7 +68,7 @@ private:
     const Clock& _clock;
     std::unique_ptr<ModemService> _service;
     std::string _wish;
-    std::function<void()> _technologyHandler;
+    std::function<void()> _basebandHandler;
     std::shared_ptr<bool> _alive = std::make_shared<bool>(true);
 
     Technology _technology = Technology::GSM;

@@ -92,6 +92,11 @@ class Channel:
             self.place.assertLess(time.monotonic(), end, f"the last of code {code} was {payload}")
         return payload
 
+    def wait_end(self):
+        """Waits until the service ends the channel."""
+        while self.next():
+            pass
+
     def close(self):
         for held in (self.port, self.inbound, self.requests, self.lock):
             held.close()
@@ -360,17 +365,27 @@ class Shortcomings(ModemPlace):
 
 
 class Presence(ModemPlace):
-    def test_unplugged_modem_empties_the_lists_and_a_plugged_one_fills_them(self):
+    def test_unplugged_modem_ends_the_channels_and_a_plugged_one_is_heard_in_new_ones(self):
         self.start_modem()
         channel = Channel(self)
         self.assertEqual(len(channel.payload(CELLS)), 2)
         self.command("remove")
-        channel.wait_for(CELLS, lambda cells: cells == [])
+        channel.wait_end()
         self.wait_told("modem 0 (MOCK-1) is no longer used")
         self.wait_told("no modem; waiting for one")
+        channel = Channel(self, "anew")
+        self.assertEqual(channel.technology, "kRKLogChannelTechnology_Zephyr_LTE", "the last one")
         self.command("add", number=1)
-        channel.wait_for(CELLS, lambda cells: len(cells) == 2)
+        self.assertEqual(len(channel.payload(CELLS)), 2)
         self.wait_told("using modem 1 (MOCK-1)")
+
+    def test_programs_go_on_with_the_next_modem(self):
+        self.start_modem(technology="lte")
+        watching = self.start_watch("--format", "json")
+        self.watch_until(watching, lambda display: display["SIM Info"]["EF-ICCID"] == "8900101000000000017")
+        self.command("remove")
+        self.command("add", number=1, sim=False, model="MOCK-2")
+        self.watch_until(watching, lambda display: display["SIM Info"]["EF-ICCID"] == "-")
 
     def test_modem_may_come_after_the_service(self):
         self.start_bus()
@@ -392,10 +407,11 @@ class Presence(ModemPlace):
         channel = Channel(self)
         self.assertEqual(len(channel.payload(CELLS)), 2)
         self.mock.kill()
-        channel.wait_for(CELLS, lambda cells: cells == [])
+        channel.wait_end()
+        channel = Channel(self, "anew")
         self.start_mock()
         self.command("add", technology="gsm", number=3)
-        channel.wait_for(CELLS, lambda cells: len(cells) == 2)
+        self.assertEqual(len(channel.payload(CELLS)), 2)
 
     def test_registered_modem_is_chosen(self):
         self.start_bus()
@@ -422,13 +438,14 @@ class Presence(ModemPlace):
         channel = Channel(self)
         self.bus.kill()
         self.bus.wait()
-        channel.wait_for(CELLS, lambda cells: cells == [])
+        channel.wait_end()
+        channel = Channel(self, "anew")
         self.wait_told("the system bus is gone")
         self.start_bus()
         self.mock.kill()
         self.start_mock()
         self.command("add", number=5)
-        channel.wait_for(CELLS, lambda cells: len(cells) == 2)
+        self.assertEqual(len(channel.payload(CELLS)), 2)
 
 
 class Refusals(ModemPlace):

@@ -173,7 +173,7 @@ TEST_F(RelaySourceTest, OtherTechnologyEndsTheChannelsBeforeItsMessagesCome)
 {
     open();
     std::unique_ptr<LogStream> stream = start(collector);
-    source->setTechnologyHandler([&stream] { stream.reset(); });
+    source->setBasebandHandler([&stream] { stream.reset(); });
     input->write(capture(1, 1, Technology::LTE));
     input->end();
     input->come();

@@ -62,9 +62,9 @@ public:
     {
         return "a list";
     }
-    void setTechnologyHandler(std::function<void()> handler) override
+    void setBasebandHandler(std::function<void()> handler) override
     {
-        technologyHandler = std::move(handler);
+        basebandHandler = std::move(handler);
     }
     std::unique_ptr<LogStream> start(MessageSink& sink) override
     {
@@ -73,7 +73,7 @@ public:
     std::vector<Bytes> messages;
     int streams = 0;
     bool ready = true;
-    std::function<void()> technologyHandler;
+    std::function<void()> basebandHandler;
 };
 
 class TelephonyServiceTest : public testing::Test {
@@ -265,7 +265,7 @@ TEST_F(TelephonyServiceTest, ChangeOfTechnologyEndsAllChannelsAndTheServiceStays
 {
     start(openChannel(), nullptr, nullptr);
     openChannel("other");
-    source.technologyHandler();
+    source.basebandHandler();
     EXPECT_EQ(service.channels(), 0u);
     EXPECT_EQ(source.streams, 0);
     EXPECT_EQ(ports.localPorts(), 1u) << "the service's own";

@@ -434,14 +434,16 @@ TEST_F(ModemSourceTest, WithoutModemAChannelIsSilentUntilOneComes)
         "spectrel-telephonyd: using modem 0 (EM7455)\n");
 }
 
-TEST_F(ModemSourceTest, UnpluggedModemLeavesNoCellsAndNoContexts)
+TEST_F(ModemSourceTest, UnpluggedModemEndsTheChannels)
 {
     openWithModem();
-    const auto stream = source->start(listener);
-    unplug();
-    EXPECT_EQ(displayText(listener.last(0xFF0001)), "[]");
-    EXPECT_EQ(displayText(listener.last(0xFF0002)), "[]");
+    auto stream = source->start(listener);
+    source->setBasebandHandler([&stream] { stream.reset(); });
     listener.received.clear();
+    unplug();
+    EXPECT_TRUE(stream) << "never in the middle of a delivery";
+    loop.runQueued();
+    EXPECT_FALSE(stream) << "the programs are to tell that nothing is heard any more";
     loop.advance(60s);
     EXPECT_TRUE(listener.received.empty());
     EXPECT_EQ(ledger.cellsAsked, 1);
@@ -450,13 +452,31 @@ TEST_F(ModemSourceTest, UnpluggedModemLeavesNoCellsAndNoContexts)
     EXPECT_NE(lines.find("no modem; waiting for one"), std::string::npos) << lines;
 }
 
-TEST_F(ModemSourceTest, ModemPluggedInAgainGoesOnInTheSameChannel)
+TEST_F(ModemSourceTest, AnotherModemEndsTheChannelsThoughOfTheSameTechnology)
 {
     openWithModem();
-    const auto stream = source->start(listener);
-    unplug();
+    auto stream = source->start(listener);
+    source->setBasebandHandler([&stream] { stream.reset(); });
     modem.id = "/modems/1";
     plug();
+    loop.runQueued();
+    EXPECT_FALSE(stream) << "another baseband is another session";
+    EXPECT_EQ(ledger.rates.back(), std::pair(std::string("/modems/1"), 0u)) << "as it was found";
+}
+
+TEST_F(ModemSourceTest, ModemPluggedInAgainIsHeardInTheChannelOpenedSince)
+{
+    openWithModem();
+    auto stream = source->start(listener);
+    source->setBasebandHandler([&stream] { stream.reset(); });
+    unplug();
+    loop.runQueued();
+    stream = source->start(listener);
+    listener.received.clear();
+    modem.id = "/modems/1";
+    plug();
+    loop.runQueued();
+    EXPECT_TRUE(stream);
     EXPECT_EQ(listener.cell(0, kRKCellMonitorPID), Value::integer(416));
     loop.advance(5s);
     EXPECT_EQ(ledger.cellsAsked, 3);
@@ -492,7 +512,7 @@ TEST_F(ModemSourceTest, ChangeOfTechnologyIsToldFromTheQueue)
 {
     openWithModem();
     int changes = 0;
-    source->setTechnologyHandler([&changes] { ++changes; });
+    source->setBasebandHandler([&changes] { ++changes; });
     loop.runQueued();
     changes = 0;
     modem.technology = Technology::GSM;
