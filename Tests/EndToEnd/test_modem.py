@@ -376,7 +376,7 @@ class Presence(ModemPlace):
         channel = Channel(self, "anew")
         self.assertEqual(channel.technology, "kRKLogChannelTechnology_Zephyr_LTE", "the last one")
         self.command("add", number=1)
-        self.assertEqual(len(channel.payload(CELLS)), 2)
+        channel.wait_for(CELLS, lambda cells: len(cells) == 2)
         self.wait_told("using modem 1 (MOCK-1)")
 
     def test_programs_go_on_with_the_next_modem(self):
@@ -411,7 +411,7 @@ class Presence(ModemPlace):
         channel = Channel(self, "anew")
         self.start_mock()
         self.command("add", technology="gsm", number=3)
-        self.assertEqual(len(channel.payload(CELLS)), 2)
+        channel.wait_for(CELLS, lambda cells: len(cells) == 2)
 
     def test_registered_modem_is_chosen(self):
         self.start_bus()
@@ -445,7 +445,7 @@ class Presence(ModemPlace):
         self.mock.kill()
         self.start_mock()
         self.command("add", number=5)
-        self.assertEqual(len(channel.payload(CELLS)), 2)
+        channel.wait_for(CELLS, lambda cells: len(cells) == 2)
 
 
 class Refusals(ModemPlace):

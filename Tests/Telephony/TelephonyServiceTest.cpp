@@ -261,7 +261,7 @@ TEST_F(TelephonyServiceTest, ComingAndGoingOfChannelsIsAChange)
     EXPECT_EQ(changes, 2);
 }
 
-TEST_F(TelephonyServiceTest, ChangeOfTechnologyEndsAllChannelsAndTheServiceStays)
+TEST_F(TelephonyServiceTest, ChangeOfBasebandEndsAllChannelsAndTheServiceStays)
 {
     start(openChannel(), nullptr, nullptr);
     openChannel("other");
