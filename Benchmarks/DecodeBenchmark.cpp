@@ -2,11 +2,11 @@
 
 #include "Benchmarks/Yardstick.h"
 #include "Monitor/SpectrelModelNode.h"
-#include "Platform/PropertyList.h"
-#include "Platform/Recording.h"
 #include "Platform/Resources.h"
+#include "Records/Recording.h"
 #include "Sections/LTE/LTELogGenerator.h"
 #include "Tests/Fakes/ScratchFolder.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <array>
 #include <benchmark/benchmark.h>

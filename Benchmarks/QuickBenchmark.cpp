@@ -5,13 +5,13 @@
 // the memory. Each time stands beside the length of a frame at 60 Hz. Exits with 1 when a reload or a frame takes too
 // long, or a frame is drawn for nothing.
 
-#include "Platform/Dictionary.h"
 #include "Platform/Preferences.h"
 #include "Platform/Qt/QtClock.h"
 #include "Platform/Qt/QtRunLoop.h"
 #include "Tests/UI/FakeModel.h"
 #include "UI/Quick/QuickFrontEnd.h"
 #include "UI/SpectrelApp.h"
+#include "Values/Dictionary.h"
 
 #include <QGuiApplication>
 #include <QQuickItem>

@@ -3,8 +3,8 @@
 
 #include "Benchmarks/Yardstick.h"
 #include "LogGenerator/LogGenerator.h"
-#include "Platform/Recording.h"
 #include "Platform/Resources.h"
+#include "Records/Recording.h"
 #include "Telephony/Encoders/RecordWriter.h"
 #include "Telephony/Simulator/SimulatedRecording.h"
 #include "Tests/Fakes/CountedAllocations.h"

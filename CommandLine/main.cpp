@@ -1,10 +1,10 @@
 // spectrel: the application with its terminal screens, and the commands watch, decode, view and record.
 
-#include "CommandLine/Application.h"
-#include "CommandLine/Arguments.h"
-#include "CommandLine/LiveServices.h"
-#include "CommandLine/Logging.h"
-#include "CommandLine/Surroundings.h"
+#include "CommandLine/Commands/Application.h"
+#include "CommandLine/Commands/Arguments.h"
+#include "CommandLine/Program/LiveServices.h"
+#include "CommandLine/Program/Logging.h"
+#include "CommandLine/Program/ProgramFolders.h"
 #include "Platform/Console.h"
 #include "Platform/Resources.h"
 

@@ -1,5 +1,5 @@
 // A property list in either form. What can be read and written reads back as the same.
-#include "Platform/PropertyList.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <cstdlib>
 

@@ -1,5 +1,5 @@
 // A recording file of any kind. Every message is read, byte by byte, and none is longer than the file allows.
-#include "Platform/Recording.h"
+#include "Records/Recording.h"
 
 #include <cstdlib>
 #include <sys/mman.h>

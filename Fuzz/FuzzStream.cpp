@@ -1,6 +1,6 @@
 // A live stream of any bytes. The first byte tells in pieces of what length it comes; cut up or whole, it yields the
 // same.
-#include "Platform/RecordingStream.h"
+#include "Records/RecordingStream.h"
 
 #include <algorithm>
 #include <cstdlib>

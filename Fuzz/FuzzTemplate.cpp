@@ -2,9 +2,9 @@
 
 #include "LogGenerator/Template/ZPHLogGenerator2.h"
 #include "Monitor/SpectrelModelNode.h"
-#include "Platform/PropertyList.h"
 #include "Platform/Resources.h"
 #include "Sections/LTE/LTELogGenerator.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <array>
 #include <cstddef>

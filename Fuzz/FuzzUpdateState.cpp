@@ -4,9 +4,9 @@
 #include "LogGenerator/Template/ArrayOutOfBoundsException.h"
 #include "LogGenerator/Template/PropertyListReaders.h"
 #include "Monitor/SpectrelModelNode.h"
-#include "Platform/Dictionary.h"
-#include "Platform/Recording.h"
 #include "Platform/Resources.h"
+#include "Records/Recording.h"
+#include "Values/Dictionary.h"
 
 #include <cstddef>
 #include <cstdint>

@@ -2,6 +2,7 @@
 
 #include "Platform/Clock.h"
 #include "Platform/SystemLog.h"
+#include "Values/Moment.h"
 
 #include <string>
 

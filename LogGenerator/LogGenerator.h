@@ -1,8 +1,8 @@
 #pragma once
 
-#include "Platform/Bytes.h"
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
+#include "Values/Bytes.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
 
 #include <cstddef>
 #include <memory>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Platform/Dictionary.h"
+#include "Values/Dictionary.h"
 
 #include <algorithm>
 #include <string_view>

@@ -2,7 +2,7 @@
 
 #include "Monitor/Playback.h"
 #include "Monitor/SpectrelModelNode.h"
-#include "Platform/List.h"
+#include "Values/List.h"
 
 #include <string>
 #include <string_view>

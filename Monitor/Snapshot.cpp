@@ -1,7 +1,7 @@
 #include "Monitor/Snapshot.h"
 
-#include "Platform/Dictionary.h"
-#include "Platform/PropertyList.h"
+#include "Values/Dictionary.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <filesystem>
 #include <system_error>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Platform/Clock.h"
-#include "Platform/List.h"
+#include "Values/List.h"
 
 #include <optional>
 #include <string>

@@ -1,7 +1,7 @@
 #include "Monitor/SpectrelModel.h"
 
-#include "Platform/PropertyList.h"
 #include "Platform/SystemLog.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <cstdarg>
 #include <cstdio>

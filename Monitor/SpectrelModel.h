@@ -3,12 +3,12 @@
 #include "LogGenerator/GeneratorSlot.h"
 #include "Monitor/MonitorModel.h"
 #include "Monitor/SpectrelModelNode.h"
-#include "Platform/Bytes.h"
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
 #include "Platform/MessagePort.h"
 #include "Platform/RunLoop.h"
 #include "Platform/TelephonyServer.h"
+#include "Values/Bytes.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
 
 #include <chrono>
 #include <memory>

@@ -2,7 +2,7 @@
 
 #include "LogGenerator/Template/ArrayLock.h"
 #include "Monitor/DisplayOrder.h"
-#include "Platform/List.h"
+#include "Values/List.h"
 
 namespace spectrel {
 

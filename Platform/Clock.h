@@ -1,14 +1,12 @@
 #pragma once
 
-#include <chrono>
+#include "Values/Moment.h"
+
 #include <cstdint>
 #include <string>
 #include <string_view>
 
 namespace spectrel {
-
-/// A moment, UTC, to the microsecond.
-using Moment = std::chrono::sys_time<std::chrono::microseconds>;
 
 struct ZoneState {
     std::int32_t secondsEastOfUTC = 0; // daylight-saving time included
@@ -29,11 +27,5 @@ public:
     static void install(Clock* clock);
     static Clock& installed();
 };
-
-/// The platform's default date form, in UTC whatever the device's zone: "2019-12-09 21:26:56 +0000".
-std::string defaultDateForm(Moment moment);
-
-/// The moment that such a text tells; none when it is not in that form.
-bool parseDefaultDateForm(std::string_view text, Moment& moment);
 
 } // namespace spectrel

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Platform/Bytes.h"
+#include "Values/Bytes.h"
 
 #include <chrono>
 #include <cstddef>
@@ -12,9 +12,6 @@
 #include <string_view>
 
 namespace spectrel {
-
-/// A message body has 1 byte to 256 KiB.
-constexpr std::size_t LargestMessage = 256 * 1024;
 
 /// The result of a send, numbered as the system's log lines show it ("got error=%d").
 enum class SendStatus : std::int32_t {

@@ -1,6 +1,6 @@
 #include "Platform/Resources.h"
 
-#include "Platform/PropertyList.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <algorithm>
 #include <filesystem>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Platform/Value.h"
+#include "Values/Value.h"
 
 #include <optional>
 #include <string>

@@ -1,7 +1,7 @@
 #include "LogGenerator/CDMA/C2KLogGenerator.h"
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 #include "LogGenerator/LogGenerator.h"
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
 #include "Sections/GSMUMTS/ZPH_GSMLogGenerator.h"
 #include "Sections/LTE/LTELogGenerator.h"
 #include "Sections/UTRAN/UTRANLogGenerator.h"

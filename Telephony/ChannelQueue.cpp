@@ -1,6 +1,6 @@
 #include "Telephony/ChannelQueue.h"
 
-#include "Telephony/Tell.h"
+#include "Telephony/ServiceLine.h"
 
 namespace spectrel {
 

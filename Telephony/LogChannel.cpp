@@ -1,11 +1,11 @@
 #include "Telephony/LogChannel.h"
 
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
-#include "Platform/PropertyList.h"
 #include "Platform/TelephonyProtocol.h"
 #include "Telephony/Encoders/RecordWriter.h"
-#include "Telephony/Tell.h"
+#include "Telephony/ServiceLine.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <utility>
 

@@ -3,8 +3,8 @@
 #include "Platform/Clock.h"
 #include "Platform/MessagePort.h"
 #include "Platform/RunLoop.h"
-#include "Platform/Value.h"
 #include "Telephony/LogSource.h"
+#include "Values/Value.h"
 
 #include <cstdint>
 #include <functional>

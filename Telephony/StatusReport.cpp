@@ -1,6 +1,6 @@
 #include "Telephony/StatusReport.h"
 
-#include "Telephony/Tell.h"
+#include "Telephony/ServiceLine.h"
 
 #include <cstdio>
 

@@ -1,9 +1,9 @@
 #include "Telephony/TelephonyService.h"
 
-#include "Platform/Dictionary.h"
-#include "Platform/PropertyList.h"
 #include "Platform/TelephonyProtocol.h"
-#include "Telephony/Tell.h"
+#include "Telephony/ServiceLine.h"
+#include "Values/Dictionary.h"
+#include "Values/PropertyList/PropertyList.h"
 
 namespace spectrel {
 

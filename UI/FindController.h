@@ -1,8 +1,8 @@
 #pragma once
 
 #include "Monitor/SpectrelModelNode.h"
-#include "Platform/ScreenToolkit.h"
 #include "UI/NavigationController.h"
+#include "UI/ScreenToolkit.h"
 
 #include <cstddef>
 #include <optional>

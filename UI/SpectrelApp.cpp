@@ -1,6 +1,6 @@
 #include "UI/SpectrelApp.h"
 
-#include "Platform/Environment.h"
+#include "Platform/Places.h"
 #include "UI/SpectrelPaneController.h"
 
 #include <filesystem>

@@ -5,11 +5,11 @@
 #include "Platform/Clock.h"
 #include "Platform/Preferences.h"
 #include "Platform/RunLoop.h"
-#include "Platform/ScreenToolkit.h"
 #include "UI/CopyController.h"
 #include "UI/FindController.h"
 #include "UI/NavigationController.h"
 #include "UI/PlaybackController.h"
+#include "UI/ScreenToolkit.h"
 #include "UI/SpectrelSaveViewController.h"
 
 #include <functional>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Monitor/SpectrelModelNode.h"
-#include "Platform/ScreenToolkit.h"
+#include "UI/ScreenToolkit.h"
 #include "UI/TableView.h"
 
 #include <cstddef>

@@ -1,9 +1,9 @@
 #include "UI/SpectrelSaveViewController.h"
 
 #include "Monitor/Snapshot.h"
-#include "Platform/Dictionary.h"
 #include "Platform/SystemLog.h"
 #include "UI/SpectrelApp.h"
+#include "Values/Dictionary.h"
 
 #include <utility>
 

@@ -1,10 +1,10 @@
 #pragma once
 
 #include "Platform/Clock.h"
-#include "Platform/List.h"
 #include "Platform/RunLoop.h"
-#include "Platform/ScreenToolkit.h"
+#include "UI/ScreenToolkit.h"
 #include "UI/TableView.h"
+#include "Values/List.h"
 
 #include <cstddef>
 #include <functional>

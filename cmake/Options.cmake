@@ -15,7 +15,6 @@ if(BUILD_TESTING)
     # One setting for all, so that they can share precompiled headers; the toolkit's targets ask for it.
     target_compile_options(spectrel_options INTERFACE -fPIC $<$<CXX_COMPILER_ID:Clang>:SHELL:-Xclang -fno-pch-timestamp>)
 endif()
-target_include_directories(spectrel_options INTERFACE ${CMAKE_SOURCE_DIR})
 target_compile_definitions(spectrel_options INTERFACE SPECTREL_VERSION="${PROJECT_VERSION}")
 if(SPECTREL_SANITIZERS)
     target_compile_options(spectrel_options INTERFACE

@@ -2,11 +2,11 @@
 
 #include "LogGenerator/CDMA/Decoders.h"
 #include "LogGenerator/CDMA/Lookup.h"
-#include "LogGenerator/Template/Framing.h"
-#include "LogGenerator/Template/RecordView.h"
-#include "Platform/List.h"
 #include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
+#include "Records/Frame.h"
+#include "Records/RecordView.h"
+#include "Values/List.h"
 
 #include <algorithm>
 #include <array>

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "LogGenerator/Template/RecordView.h"
-#include "Platform/Dictionary.h"
-#include "Platform/Value.h"
+#include "Records/RecordView.h"
+#include "Values/Dictionary.h"
+#include "Values/Value.h"
 
 /// The decoders of the CDMA2000 log records. Each takes a whole record, checks its length, and shows texts under fixed
 /// variable names; one that it refuses is logged and changes nothing. Offsets count from the record's first byte.

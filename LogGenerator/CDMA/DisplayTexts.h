@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Platform/TextBuffer.h"
+#include "Values/TextBuffer.h"
 
 #include <cstdint>
 #include <string_view>

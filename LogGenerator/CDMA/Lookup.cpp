@@ -1,7 +1,7 @@
 #include "LogGenerator/CDMA/Lookup.h"
 
-#include "Platform/List.h"
-#include "Platform/TextBuffer.h"
+#include "Values/List.h"
+#include "Values/TextBuffer.h"
 
 namespace spectrel {
 

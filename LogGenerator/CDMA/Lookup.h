@@ -1,9 +1,9 @@
 #pragma once
 
 #include "LogGenerator/Template/Fields.h"
-#include "LogGenerator/Template/RecordView.h"
-#include "Platform/Dictionary.h"
-#include "Platform/Value.h"
+#include "Records/RecordView.h"
+#include "Values/Dictionary.h"
+#include "Values/Value.h"
 
 #include <span>
 #include <string_view>

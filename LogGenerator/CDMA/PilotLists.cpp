@@ -4,7 +4,7 @@
 #include "LogGenerator/CDMA/DisplayTexts.h"
 #include "LogGenerator/CDMA/Lookup.h"
 #include "Platform/SystemLog.h"
-#include "Platform/TextBuffer.h"
+#include "Values/TextBuffer.h"
 
 namespace spectrel {
 

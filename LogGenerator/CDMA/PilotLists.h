@@ -1,7 +1,7 @@
 #pragma once
 
-#include "LogGenerator/Template/RecordView.h"
-#include "Platform/Dictionary.h"
+#include "Records/RecordView.h"
+#include "Values/Dictionary.h"
 
 #include <cstddef>
 #include <cstdint>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "LogGenerator/Template/RecordView.h"
+#include "Records/RecordView.h"
 
 #include <cstddef>
 #include <cstdint>

@@ -2,7 +2,7 @@
 #include "LogGenerator/CDMA/Lookup.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Platform/SystemLog.h"
-#include "Platform/TextBuffer.h"
+#include "Values/TextBuffer.h"
 
 #include <array>
 #include <optional>

@@ -1,7 +1,7 @@
 #include "LogGenerator/CDMA/TrafficFER.h"
 
 #include "LogGenerator/CDMA/Lookup.h"
-#include "Platform/TextBuffer.h"
+#include "Values/TextBuffer.h"
 
 #include <optional>
 #include <string_view>

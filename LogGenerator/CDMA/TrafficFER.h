@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Platform/Dictionary.h"
-#include "Platform/Value.h"
+#include "Values/Dictionary.h"
+#include "Values/Value.h"
 
 namespace spectrel {
 

@@ -1,7 +1,7 @@
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 
-#include "Platform/PropertyList.h"
 #include "Platform/SystemLog.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <array>
 #include <string>

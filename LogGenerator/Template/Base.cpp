@@ -1,8 +1,8 @@
 #include "LogGenerator/Template/Base.h"
 
 #include "LogGenerator/Template/ArrayLock.h"
-#include "Platform/Dictionary.h"
 #include "Platform/SystemLog.h"
+#include "Values/Dictionary.h"
 
 #include <algorithm>
 #include <array>

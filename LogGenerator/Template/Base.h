@@ -1,10 +1,10 @@
 #pragma once
 
-#include "LogGenerator/Template/ClassDictionary.h"
-#include "LogGenerator/Template/Framing.h"
-#include "LogGenerator/Template/RecordView.h"
-#include "Platform/List.h"
-#include "Platform/Value.h"
+#include "LogGenerator/Template/CodeDictionary.h"
+#include "Records/Frame.h"
+#include "Records/RecordView.h"
+#include "Values/List.h"
+#include "Values/Value.h"
 
 #include <cstdint>
 #include <string_view>

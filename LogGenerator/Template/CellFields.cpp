@@ -2,8 +2,8 @@
 
 #include "LogGenerator/Template/Base.h"
 #include "LogGenerator/Template/PropertyListReaders.h"
-#include "Platform/Dictionary.h"
 #include "Platform/SystemLog.h"
+#include "Values/Dictionary.h"
 
 namespace spectrel {
 

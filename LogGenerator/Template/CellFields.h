@@ -1,8 +1,8 @@
 #pragma once
 
 #include "LogGenerator/Template/Fields.h"
-#include "Platform/List.h"
-#include "Platform/Value.h"
+#include "Values/List.h"
+#include "Values/Value.h"
 
 #include <initializer_list>
 #include <span>

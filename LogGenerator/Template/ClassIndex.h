@@ -1,6 +1,6 @@
 #pragma once
 
-#include "LogGenerator/Template/ClassDictionary.h"
+#include "LogGenerator/Template/CodeDictionary.h"
 
 #include <cstdint>
 #include <string>

@@ -1,6 +1,6 @@
 #include "LogGenerator/Template/Fields.h"
 
-#include "Platform/Dictionary.h"
+#include "Values/Dictionary.h"
 
 #include <algorithm>
 

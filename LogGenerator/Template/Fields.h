@@ -1,9 +1,9 @@
 #pragma once
 
-#include "LogGenerator/Template/RecordView.h"
-#include "Platform/Dictionary.h"
-#include "Platform/TextBuffer.h"
-#include "Platform/Value.h"
+#include "Records/RecordView.h"
+#include "Values/Dictionary.h"
+#include "Values/TextBuffer.h"
+#include "Values/Value.h"
 
 #include <cstddef>
 #include <cstdint>

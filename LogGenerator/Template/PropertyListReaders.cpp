@@ -1,9 +1,9 @@
 #include "LogGenerator/Template/PropertyListReaders.h"
 
-#include "Platform/Dictionary.h"
-#include "Platform/PropertyList.h"
 #include "Platform/SystemLog.h"
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
+#include "Values/Dictionary.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <algorithm>
 #include <optional>

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "LogGenerator/Template/RecordView.h"
-#include "Platform/List.h"
-#include "Platform/Value.h"
+#include "Records/RecordView.h"
+#include "Values/List.h"
+#include "Values/Value.h"
 
 #include <cstdint>
 #include <exception>

@@ -2,7 +2,7 @@
 
 #include "LogGenerator/Template/ArrayOutOfBoundsException.h"
 #include "LogGenerator/Template/Fields.h"
-#include "Platform/List.h"
+#include "Values/List.h"
 
 #include <cstddef>
 #include <span>

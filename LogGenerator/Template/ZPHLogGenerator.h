@@ -1,7 +1,7 @@
 #pragma once
 
 #include "LogGenerator/LogGenerator.h"
-#include "Platform/Bytes.h"
+#include "Values/Bytes.h"
 
 #include <memory>
 

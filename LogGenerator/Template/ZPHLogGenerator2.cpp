@@ -1,9 +1,9 @@
 #include "LogGenerator/Template/ZPHLogGenerator2.h"
 
 #include "LogGenerator/Template/Base.h"
-#include "LogGenerator/Template/Framing.h"
 #include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
+#include "Records/Frame.h"
 
 #include <algorithm>
 #include <charconv>

@@ -1,6 +1,6 @@
 #include "Platform/Sockets/SocketMessagePorts.h"
 
-#include "Platform/Environment.h"
+#include "Platform/Places.h"
 #include "Platform/Sockets/SocketLocalPort.h"
 #include "Platform/Sockets/SocketRemotePort.h"
 #include "Platform/Sockets/Wire.h"

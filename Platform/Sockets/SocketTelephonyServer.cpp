@@ -1,8 +1,8 @@
 #include "Platform/Sockets/SocketTelephonyServer.h"
 
-#include "Platform/Dictionary.h"
-#include "Platform/PropertyList.h"
 #include "Platform/TelephonyProtocol.h"
+#include "Values/Dictionary.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <chrono>
 #include <utility>

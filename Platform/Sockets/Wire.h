@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Platform/Bytes.h"
 #include "Platform/MessagePort.h"
+#include "Values/Bytes.h"
 
 #include <array>
 #include <cstddef>

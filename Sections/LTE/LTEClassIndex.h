@@ -1,8 +1,6 @@
 #pragma once
 
 #include "LogGenerator/Template/ClassIndex.h"
-#include "Sections/GSMUMTS/PDPContextList.h"
-#include "Sections/GSMUMTS/SimInfo.h"
 #include "Sections/LTE/ConnectedModeMeasurementMisc.h"
 #include "Sections/LTE/DetectedCells.h"
 #include "Sections/LTE/LTEServingCellInfo.h"
@@ -12,6 +10,8 @@
 #include "Sections/LTE/ReselectionCandidatesList.h"
 #include "Sections/LTE/ReselectionCandidatesMisc.h"
 #include "Sections/LTE/ServingCellMeasurement.h"
+#include "Sections/Shared/PDPContextList.h"
+#include "Sections/Shared/SimInfo.h"
 
 namespace spectrel {
 

@@ -4,7 +4,7 @@
 #include "LogGenerator/Template/Fields.h"
 #include "LogGenerator/Template/PropertyListReaders.h"
 #include "Platform/SystemLog.h"
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
 
 #include <array>
 

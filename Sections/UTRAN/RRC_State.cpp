@@ -1,8 +1,8 @@
 #include "Sections/UTRAN/RRC_State.h"
 
-#include "Platform/Description.h"
 #include "Platform/DiagnosticLog.h"
 #include "Platform/SystemLog.h"
+#include "Values/Description.h"
 
 #include <array>
 #include <string>

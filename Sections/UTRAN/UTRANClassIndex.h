@@ -1,8 +1,8 @@
 #pragma once
 
 #include "LogGenerator/Template/ClassIndex.h"
-#include "Sections/GSMUMTS/PDPContextList.h"
-#include "Sections/GSMUMTS/SimInfo.h"
+#include "Sections/Shared/PDPContextList.h"
+#include "Sections/Shared/SimInfo.h"
 #include "Sections/UTRAN/CCTRCHSIRMeasurement.h"
 #include "Sections/UTRAN/GSMNeighbhorMeasurements.h"
 #include "Sections/UTRAN/RRC_State.h"

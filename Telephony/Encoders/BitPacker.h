@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Platform/Bytes.h"
+#include "Values/Bytes.h"
 
 #include <cstdint>
 

@@ -1,7 +1,7 @@
 #include "Telephony/Encoders/CDMARecords.h"
 
 #include "Telephony/Encoders/RecordWriter.h"
-#include "Telephony/Simulator/CDMAWorld.h"
+#include "Telephony/Simulator/CDMA/CDMAWorld.h"
 
 #include <algorithm>
 #include <cmath>

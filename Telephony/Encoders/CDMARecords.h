@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Platform/Bytes.h"
 #include "Platform/Clock.h"
+#include "Values/Bytes.h"
 
 namespace spectrel {
 

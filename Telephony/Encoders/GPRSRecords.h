@@ -1,8 +1,8 @@
 #pragma once
 
-#include "Platform/Bytes.h"
 #include "Platform/Clock.h"
-#include "Telephony/Simulator/GSMUMTSReports.h"
+#include "Telephony/Reports/GSMUMTSReports.h"
+#include "Values/Bytes.h"
 
 /// Records of the serving GSM cell's GPRS parameters; each tells some of them.
 namespace spectrel {

@@ -2,7 +2,7 @@
 
 #include "Telephony/Encoders/CountedList.h"
 #include "Telephony/Encoders/RecordWriter.h"
-#include "Telephony/Simulator/GSMCell.h"
+#include "Telephony/Reports/GSMCell.h"
 
 namespace spectrel {
 

@@ -1,10 +1,10 @@
 #include "Telephony/Encoders/GSMUMTSPropertyLists.h"
 
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
 #include "Telephony/Encoders/PropertyListRecords.h"
-#include "Telephony/Simulator/GSMUMTSWorld.h"
+#include "Telephony/Simulator/GSMUMTS/GSMUMTSWorld.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
 
 #include <cmath>
 

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Platform/Bytes.h"
 #include "Platform/Clock.h"
+#include "Values/Bytes.h"
 
 /// Records of a GSM/UMTS phone's extra stream, whose payloads are property lists.
 namespace spectrel {

@@ -1,9 +1,9 @@
 #include "Telephony/Encoders/IFXReport.h"
 
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
-#include "Platform/PropertyList.h"
-#include "Telephony/Simulator/IFXWorld.h"
+#include "Telephony/Simulator/IFX/IFXWorld.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <cmath>
 #include <string>

@@ -2,8 +2,8 @@
 
 #include "Telephony/Encoders/BitPacker.h"
 #include "Telephony/Encoders/RecordWriter.h"
-#include "Telephony/Simulator/LTECell.h"
-#include "Telephony/Simulator/LTEReports.h"
+#include "Telephony/Reports/LTECell.h"
+#include "Telephony/Reports/LTEReports.h"
 
 #include <algorithm>
 

@@ -1,11 +1,11 @@
 #include "Telephony/Encoders/PropertyListRecords.h"
 
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
-#include "Platform/PropertyList.h"
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
 #include "Telephony/Encoders/RecordWriter.h"
-#include "Telephony/Simulator/LTEWorld.h"
+#include "Telephony/Simulator/LTE/LTEWorld.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <cstdio>
 #include <string>

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "Platform/Bytes.h"
 #include "Platform/Clock.h"
-#include "Platform/Value.h"
+#include "Values/Bytes.h"
+#include "Values/Value.h"
 
 #include <cstdint>
 #include <string_view>

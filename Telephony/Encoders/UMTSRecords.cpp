@@ -2,7 +2,7 @@
 
 #include "Telephony/Encoders/CountedList.h"
 #include "Telephony/Encoders/RecordWriter.h"
-#include "Telephony/Simulator/UMTSCell.h"
+#include "Telephony/Reports/UMTSCell.h"
 
 #include <cmath>
 #include <span>

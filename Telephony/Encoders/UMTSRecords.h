@@ -1,8 +1,8 @@
 #pragma once
 
-#include "Platform/Bytes.h"
 #include "Platform/Clock.h"
-#include "Telephony/Simulator/GSMUMTSReports.h"
+#include "Telephony/Reports/GSMUMTSReports.h"
+#include "Values/Bytes.h"
 
 /// Records of a GSM/UMTS phone's UMTS receiver. Lists longer than their 8-bit count are cut.
 namespace spectrel {

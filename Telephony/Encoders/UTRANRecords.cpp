@@ -1,12 +1,12 @@
 #include "Telephony/Encoders/UTRANRecords.h"
 
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
 #include "Telephony/Encoders/BitPacker.h"
 #include "Telephony/Encoders/PropertyListRecords.h"
 #include "Telephony/Encoders/RecordWriter.h"
-#include "Telephony/Simulator/UTRANWorld.h"
+#include "Telephony/Simulator/UTRAN/UTRANWorld.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
 
 #include <algorithm>
 

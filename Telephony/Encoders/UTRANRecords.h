@@ -1,8 +1,8 @@
 #pragma once
 
-#include "Platform/Bytes.h"
 #include "Platform/Clock.h"
-#include "Telephony/Simulator/UTRANReports.h"
+#include "Telephony/Reports/UTRANReports.h"
+#include "Values/Bytes.h"
 
 #include <span>
 

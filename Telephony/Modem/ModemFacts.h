@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Platform/Recording.h"
+#include "Records/Recording.h"
 
 #include <cstdint>
 #include <optional>

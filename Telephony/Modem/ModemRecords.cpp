@@ -1,10 +1,10 @@
 #include "Telephony/Modem/ModemRecords.h"
 
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
 #include "Telephony/Encoders/PropertyListRecords.h"
 #include "Telephony/Modem/FrequencyBands.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
 
 #include <algorithm>
 #include <cmath>

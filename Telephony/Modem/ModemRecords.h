@@ -1,8 +1,8 @@
 #pragma once
 
-#include "Platform/Bytes.h"
 #include "Platform/Clock.h"
 #include "Telephony/Modem/ModemFacts.h"
+#include "Values/Bytes.h"
 
 #include <optional>
 #include <vector>

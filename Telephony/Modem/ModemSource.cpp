@@ -2,7 +2,7 @@
 
 #include "Telephony/Modem/ModemChoice.h"
 #include "Telephony/Modem/ModemRecords.h"
-#include "Telephony/Tell.h"
+#include "Telephony/ServiceLine.h"
 
 #include <algorithm>
 #include <utility>

@@ -1,9 +1,9 @@
 #pragma once
 
-#include "Platform/Bytes.h"
 #include "Platform/Clock.h"
-#include "Platform/Recording.h"
+#include "Records/Recording.h"
 #include "Telephony/Simulator/Radio.h"
+#include "Values/Bytes.h"
 
 #include <chrono>
 #include <functional>

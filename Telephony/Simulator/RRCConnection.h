@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Telephony/Simulator/UTRANReports.h"
+#include "Telephony/Reports/UTRANReports.h"
 
 #include <chrono>
 

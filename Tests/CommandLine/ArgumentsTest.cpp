@@ -1,6 +1,6 @@
-#include "CommandLine/Arguments.h"
+#include "CommandLine/Commands/Arguments.h"
 
-#include "CommandLine/OptionTypes.h"
+#include "CommandLine/Options/OptionTypes.h"
 
 #include <gtest/gtest.h>
 #include <limits>

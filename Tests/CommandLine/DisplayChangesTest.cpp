@@ -1,7 +1,7 @@
-#include "CommandLine/DisplayChanges.h"
+#include "CommandLine/Output/DisplayChanges.h"
 
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
 
 #include <gtest/gtest.h>
 

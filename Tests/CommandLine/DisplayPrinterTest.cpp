@@ -1,7 +1,7 @@
-#include "CommandLine/DisplayPrinter.h"
+#include "CommandLine/Output/DisplayPrinter.h"
 
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
 
 #include <gtest/gtest.h>
 

@@ -1,6 +1,6 @@
-#include "CommandLine/RecordingFiles.h"
+#include "CommandLine/Commands/RecordingFiles.h"
 
-#include "CommandLine/OptionTypes.h"
+#include "CommandLine/Options/OptionTypes.h"
 #include "Tests/Fakes/RecordBuilder.h"
 #include "Tests/Fakes/ScratchFolder.h"
 

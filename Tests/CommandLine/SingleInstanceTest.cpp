@@ -1,4 +1,4 @@
-#include "CommandLine/SingleInstance.h"
+#include "CommandLine/Program/SingleInstance.h"
 #include "Tests/Fakes/FakeMessagePorts.h"
 
 #include <gtest/gtest.h>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Platform/Description.h"
+#include "Values/Description.h"
 
 namespace spectrel {
 

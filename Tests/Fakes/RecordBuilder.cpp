@@ -1,6 +1,6 @@
 #include "Tests/Fakes/RecordBuilder.h"
 
-#include "Platform/PropertyList.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <algorithm>
 #include <stdexcept>

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Platform/Bytes.h"
-#include "Platform/Value.h"
+#include "Values/Bytes.h"
+#include "Values/Value.h"
 
 #include <cstdint>
 #include <initializer_list>

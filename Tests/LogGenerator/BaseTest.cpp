@@ -3,10 +3,10 @@
 #include "LogGenerator/Template/ArrayLock.h"
 #include "LogGenerator/Template/ArrayOutOfBoundsException.h"
 #include "LogGenerator/Template/ClassIndex.h"
-#include "LogGenerator/Template/RecordView.h"
-#include "Platform/Dictionary.h"
+#include "Records/RecordView.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/LogRecorder.h"
+#include "Values/Dictionary.h"
 
 #include <gtest/gtest.h>
 #include <thread>

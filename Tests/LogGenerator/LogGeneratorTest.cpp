@@ -1,7 +1,7 @@
 #include "LogGenerator/LogGenerator.h"
 
 #include "LogGenerator/GeneratorSlot.h"
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/FakeResources.h"
 #include "Tests/Fakes/FakeRunLoop.h"

@@ -1,9 +1,9 @@
 #include "LogGenerator/Template/PropertyListReaders.h"
 
-#include "Platform/Dictionary.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/LogRecorder.h"
 #include "Tests/Fakes/RecordBuilder.h"
+#include "Values/Dictionary.h"
 
 #include <gtest/gtest.h>
 

@@ -1,9 +1,9 @@
 #include "Monitor/Snapshot.h"
 
-#include "Platform/Dictionary.h"
-#include "Platform/PropertyList.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/ScratchFolder.h"
+#include "Values/Dictionary.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <csignal>
 #include <filesystem>

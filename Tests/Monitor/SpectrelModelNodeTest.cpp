@@ -1,8 +1,8 @@
 #include "Monitor/SpectrelModelNode.h"
 
 #include "LogGenerator/Template/ArrayLock.h"
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
 
 #include <algorithm>
 #include <gtest/gtest.h>

@@ -1,13 +1,13 @@
 #include "Monitor/SpectrelModel.h"
 
-#include "Platform/PropertyList.h"
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/FakeMessagePorts.h"
 #include "Tests/Fakes/FakeResources.h"
 #include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Fakes/LogRecorder.h"
 #include "Tests/Fakes/RecordBuilder.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <gtest/gtest.h>
 

@@ -1,4 +1,5 @@
 #include "Platform/Clock.h"
+#include "Values/Moment.h"
 
 #include <gtest/gtest.h>
 

@@ -5,15 +5,15 @@ spectrel_library(spectrel_port_fixtures
 
 spectrel_test(test_qt_platform
     SOURCES DiagnosticFileTest.cpp FileLogTest.cpp QtClockTest.cpp QtPreferencesTest.cpp QtRunLoopTest.cpp TerminationSignalsTest.cpp
-    USES spectrel_qt spectrel_syslog spectrel_port_fixtures Qt6::DBus)
+    USES spectrel_qt spectrel_syslog spectrel_fakes spectrel_port_fixtures Qt6::DBus)
 
 spectrel_test(test_message_ports
-    SOURCES AllocationTest.cpp ${CMAKE_SOURCE_DIR}/Tests/Fakes/CountedAllocations.cpp LocalPortTest.cpp PortNameTest.cpp RemotePortTest.cpp WireTest.cpp
+    SOURCES AllocationTest.cpp ${CMAKE_SOURCE_DIR}/Tests/Fakes/CountedAllocations.cpp LocalPortTest.cpp PortFixture.h PortNameTest.cpp RemotePortTest.cpp WireTest.cpp
     USES spectrel_qt spectrel_ports spectrel_fakes spectrel_port_fixtures)
 
 spectrel_test(test_telephony_server
     SOURCES SocketTelephonyServerTest.cpp
-    USES spectrel_ports spectrel_expat spectrel_fakes)
+    USES spectrel_ports spectrel_values spectrel_fakes)
 
 spectrel_test(test_stream_inputs
     SOURCES StreamInputTest.cpp

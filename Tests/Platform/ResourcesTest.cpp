@@ -1,7 +1,7 @@
 #include "Platform/Resources.h"
 
-#include "Platform/Dictionary.h"
 #include "Tests/Fakes/ScratchFolder.h"
+#include "Values/Dictionary.h"
 
 #include <gtest/gtest.h>
 

@@ -2,7 +2,7 @@
 
 #include "Platform/Resources.h"
 #include "Sections/GSMUMTS/ZPH_GSMLogGenerator.h"
-#include "Telephony/Simulator/GSMUMTSWorld.h"
+#include "Telephony/Simulator/GSMUMTS/GSMUMTSWorld.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/LogRecorder.h"
 

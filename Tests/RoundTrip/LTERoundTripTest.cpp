@@ -1,7 +1,7 @@
 // What the simulated LTE phone knows is what the display shows, within half a step of each field.
 
 #include "Telephony/Encoders/LTERecords.h"
-#include "Telephony/Simulator/LTEWorld.h"
+#include "Telephony/Simulator/LTE/LTEWorld.h"
 #include "Tests/RoundTrip/RoundTripFixture.h"
 
 #include <cmath>

@@ -1,11 +1,11 @@
 #pragma once
 
 #include "LogGenerator/LogGenerator.h"
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
-#include "Platform/Recording.h"
 #include "Platform/Resources.h"
+#include "Records/Recording.h"
 #include "Tests/Fakes/FakeRunLoop.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
 
 #include <cstdlib>
 #include <gtest/gtest.h>

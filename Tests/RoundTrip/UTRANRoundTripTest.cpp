@@ -1,7 +1,7 @@
 // What the simulated UTRAN phone knows is what the display shows.
 
 #include "Telephony/Encoders/UTRANRecords.h"
-#include "Telephony/Simulator/UTRANWorld.h"
+#include "Telephony/Simulator/UTRAN/UTRANWorld.h"
 #include "Tests/RoundTrip/RoundTripFixture.h"
 
 #include <cmath>

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
 
 #include <cstdint>
 #include <initializer_list>

@@ -1,12 +1,12 @@
 // What decoding costs in memory: nothing, once a scalar section's keys are there.
 
-#include "Platform/Dictionary.h"
 #include "Sections/GSMUMTS/ZPH_GSMClassIndex.h"
 #include "Sections/LTE/LTEClassIndex.h"
 #include "Sections/UTRAN/UTRANClassIndex.h"
 #include "Tests/Fakes/CountedAllocations.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/RecordBuilder.h"
+#include "Values/Dictionary.h"
 
 #include <gtest/gtest.h>
 #include <stdexcept>

@@ -1,11 +1,11 @@
 #pragma once
 
 #include "LogGenerator/Template/Base.h"
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/LogRecorder.h"
 #include "Tests/Fakes/RecordBuilder.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
 
 #include <gtest/gtest.h>
 #include <string>

@@ -2,12 +2,12 @@
 
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/Template/ZPHLogGenerator2.h"
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
 #include "Platform/Resources.h"
 #include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Fakes/LogRecorder.h"
 #include "Tests/Fakes/RecordBuilder.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
 
 #include <gtest/gtest.h>
 #include <string>

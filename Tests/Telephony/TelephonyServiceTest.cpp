@@ -1,10 +1,7 @@
 #include "Telephony/TelephonyService.h"
 
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
-#include "Platform/PropertyList.h"
-#include "Platform/TelephonyConstants.h"
 #include "Platform/TelephonyProtocol.h"
+#include "Records/TelephonyConstants.h"
 #include "Telephony/Simulator/SimulatorSource.h"
 #include "Telephony/StatusReport.h"
 #include "Tests/Fakes/DisplayText.h"
@@ -12,6 +9,9 @@
 #include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Fakes/RecordBuilder.h"
 #include "Tests/Telephony/Collector.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
 #include "Tests/Fakes/FakePreferences.h"
 #include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Fakes/FakeToolkit.h"
@@ -11,6 +9,8 @@
 #include "UI/SpectrelApp.h"
 #include "UI/SpectrelCell.h"
 #include "UI/SpectrelPaneController.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Platform/ScreenToolkit.h"
+#include "UI/ScreenToolkit.h"
 
 #include <functional>
 #include <memory>

@@ -1,10 +1,10 @@
 #pragma once
 
-#include "Platform/ScreenToolkit.h"
 #include "UI/Quick/FindModel.h"
 #include "UI/Quick/PaneModel.h"
 #include "UI/Quick/PlaybackModel.h"
 #include "UI/Quick/SaveModel.h"
+#include "UI/ScreenToolkit.h"
 
 #include <QObject>
 #include <QSizeF>

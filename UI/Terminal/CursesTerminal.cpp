@@ -1,6 +1,6 @@
 #include "UI/Terminal/CursesTerminal.h"
 
-#include "Platform/Base64.h"
+#include "Values/Base64.h"
 
 #include <algorithm>
 #include <array>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Platform/RunLoop.h"
-#include "Platform/ScreenToolkit.h"
+#include "UI/ScreenToolkit.h"
 
 #include <functional>
 #include <memory>

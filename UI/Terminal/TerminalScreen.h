@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Platform/ScreenToolkit.h"
+#include "UI/ScreenToolkit.h"
 #include "UI/Terminal/FindView.h"
 #include "UI/Terminal/Grid.h"
 #include "UI/Terminal/HelpView.h"

@@ -1,6 +1,6 @@
 #include "Telephony/Modem/ModemManager/ModemManagerService.h"
 
-#include "Telephony/Tell.h"
+#include "Telephony/ServiceLine.h"
 
 #include <QDBusArgument>
 #include <QDBusError>

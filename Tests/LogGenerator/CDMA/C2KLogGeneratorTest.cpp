@@ -2,7 +2,7 @@
 
 #include "LogGenerator/CDMA/Lookup.h"
 #include "LogGenerator/GeneratorSlot.h"
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
 
 #include <set>
 

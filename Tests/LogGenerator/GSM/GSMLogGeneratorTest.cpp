@@ -1,12 +1,12 @@
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 
 #include "LogGenerator/GeneratorSlot.h"
-#include "Platform/PropertyList.h"
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/FakeResources.h"
 #include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Fakes/LogRecorder.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <gtest/gtest.h>
 

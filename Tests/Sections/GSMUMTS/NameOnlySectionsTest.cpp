@@ -1,10 +1,10 @@
 // The sections that only keep their place on the screen.
 
-#include "Sections/GSMUMTS/CellChangeCounters.h"
-#include "Sections/GSMUMTS/CodingScheme.h"
-#include "Sections/GSMUMTS/NonRankedGSMSet.h"
-#include "Sections/GSMUMTS/NonRankedUMTSSet.h"
-#include "Sections/GSMUMTS/UMTSRRMeasurement.h"
+#include "Sections/GSMUMTS/GSM/CodingScheme.h"
+#include "Sections/GSMUMTS/GSM/NonRankedGSMSet.h"
+#include "Sections/GSMUMTS/Mobility/CellChangeCounters.h"
+#include "Sections/GSMUMTS/UMTS/NonRankedUMTSSet.h"
+#include "Sections/GSMUMTS/UMTS/UMTSRRMeasurement.h"
 #include "Tests/Sections/SectionFixture.h"
 
 namespace spectrel {

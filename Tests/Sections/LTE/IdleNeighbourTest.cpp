@@ -1,12 +1,12 @@
 // The two sections of the idle-mode neighbour measurement, code 0xB180.
 
 #include "LogGenerator/Template/ArrayOutOfBoundsException.h"
-#include "Platform/List.h"
 #include "Sections/LTE/IdleNeighbourRecord.h"
 #include "Sections/LTE/NeighborCellsList.h"
 #include "Sections/LTE/NeighborMeasurementMisc.h"
 #include "Tests/Sections/BitSweep.h"
 #include "Tests/Sections/SectionFixture.h"
+#include "Values/List.h"
 
 namespace spectrel {
 namespace {

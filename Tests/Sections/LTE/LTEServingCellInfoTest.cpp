@@ -1,9 +1,9 @@
 #include "Sections/LTE/LTEServingCellInfo.h"
 
-#include "Platform/List.h"
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
 #include "Tests/Sections/BitSweep.h"
 #include "Tests/Sections/SectionFixture.h"
+#include "Values/List.h"
 
 #include <map>
 

@@ -1,4 +1,4 @@
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
 #include "Sections/LTE/LTELogGenerator.h"
 #include "Tests/Sections/TemplateFixture.h"
 

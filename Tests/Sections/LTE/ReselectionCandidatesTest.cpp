@@ -1,12 +1,12 @@
 // The two sections of the reselection candidates, code 0xB186.
 
 #include "LogGenerator/Template/ArrayOutOfBoundsException.h"
-#include "Platform/List.h"
 #include "Sections/LTE/ReselectionCandidatesList.h"
 #include "Sections/LTE/ReselectionCandidatesMisc.h"
 #include "Sections/LTE/ReselectionRecord.h"
 #include "Tests/Sections/BitSweep.h"
 #include "Tests/Sections/SectionFixture.h"
+#include "Values/List.h"
 
 namespace spectrel {
 namespace {

@@ -1,6 +1,6 @@
 #include "Sections/UTRAN/UTRANServingCellInfo.h"
 
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
 #include "Tests/Sections/BitSweep.h"
 #include "Tests/Sections/SectionFixture.h"
 

@@ -1,4 +1,4 @@
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
 #include "Sections/UTRAN/UTRANLogGenerator.h"
 #include "Tests/Sections/TemplateFixture.h"
 

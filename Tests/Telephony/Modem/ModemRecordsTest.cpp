@@ -1,11 +1,11 @@
 #include "Telephony/Modem/ModemRecords.h"
 
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
-#include "Platform/PropertyList.h"
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
 #include "Telephony/Encoders/RecordWriter.h"
 #include "Tests/Fakes/DisplayText.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <gtest/gtest.h>
 #include <limits>

@@ -1,13 +1,13 @@
 #include "Telephony/Modem/ModemSource.h"
 
-#include "Platform/Dictionary.h"
-#include "Platform/List.h"
-#include "Platform/PropertyList.h"
-#include "Platform/TelephonyConstants.h"
+#include "Records/TelephonyConstants.h"
 #include "Telephony/Encoders/RecordWriter.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Telephony/Modem/FakeModemService.h"
+#include "Values/Dictionary.h"
+#include "Values/List.h"
+#include "Values/PropertyList/PropertyList.h"
 
 #include <gtest/gtest.h>
 

@@ -1,0 +1,11 @@
+#pragma once
+
+#include "CommandLine/Commands/Arguments.h"
+
+namespace spectrel {
+
+/// Opens the screens that the arguments and the surroundings ask for: the graphical ones (a program of their own beside
+/// this one), the terminal ones, or none at all, printing as `watch` does. Answers the program's exit status.
+int runApplication(const Arguments& arguments);
+
+} // namespace spectrel

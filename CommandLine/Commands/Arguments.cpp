@@ -1,0 +1,163 @@
+#include "CommandLine/Commands/Arguments.h"
+
+#include "CommandLine/Options/OptionTypes.h"
+
+#include <CLI/CLI.hpp>
+#include <iostream>
+
+namespace spectrel {
+
+namespace {
+
+constexpr const char* Description =
+    "Live radio diagnostics: which cell am I on, how well do I hear it, what else is there?\n"
+    "Without a command it opens the screens; where there is no terminal and no display it prints as 'watch' does.";
+
+constexpr const char* Environment =
+    "Environment:\n"
+    "  SPECTREL_PORT_DIR       where the telephony service is met (default: $XDG_RUNTIME_DIR/spectrel)\n"
+    "  SPECTREL_CRASH_LOG_DIR  where snapshots go (default: $XDG_STATE_HOME/spectrel/CrashReporter)\n"
+    "  SPECTREL_DEVICE_ROOT    prefix of the device's absolute paths (default: /)\n"
+    "  SPECTREL_DIAGNOSTIC_LOG file for what the decoders tell their developers (default: none)\n"
+    "  NO_COLOR                no colours in the terminal screens\n"
+    "Exit status: 0 done, 1 something could not be done, 2 wrong usage.";
+
+constexpr OptionForm<OutputFormat> FormatForm {
+    "tree|json|changes|csv|none", outputFormatNamed, "is not one of tree, json, changes, csv, none"};
+
+void addFormat(CLI::App& command, OutputFormat& format)
+{
+    addFormedOption(command, "--format", format, FormatForm, "How the display is printed (default: tree)");
+}
+
+void addLimits(CLI::App& command, std::optional<std::uint64_t>& count, const char* what,
+    std::optional<std::chrono::milliseconds>& duration)
+{
+    addFormedOption(command, "--count", count, CountForm, what);
+    addFormedOption(command, "--duration", duration, DurationForm, "End after this time");
+}
+
+void addCommon(CLI::App& command, Arguments& arguments)
+{
+    command.set_version_flag("--version", "spectrel " SPECTREL_VERSION);
+    addFormedOption(
+        command, "--resources", arguments.resources, FolderForm, "Take the display templates from this folder");
+    addFormedOption(
+        command, "--log", arguments.logFile, FileForm, "Write every system-log line to this file: <PRIORITY>TEXT");
+}
+
+void addScreens(CLI::App& command, Arguments& arguments)
+{
+    auto* graphical = command.add_flag_callback(
+        "--gui", [&arguments] { arguments.screens = ScreenChoice::Graphical; }, "Open the graphical screens");
+    command
+        .add_flag_callback(
+            "--terminal", [&arguments] { arguments.screens = ScreenChoice::Terminal; }, "Open the terminal screens")
+        ->excludes(graphical);
+}
+
+void addTechnology(CLI::App& command, std::optional<Technology>& technology)
+{
+    addFormedOption(
+        command, "--technology", technology, TechnologyForm, "The technology, where the file does not tell");
+}
+
+void addWatch(CLI::App& program, Arguments& arguments)
+{
+    CLI::App& command = *program.add_subcommand("watch", "Print the live session, once at each refresh");
+    command.callback([&arguments] { arguments.job = Job::Watch; });
+    addCommon(command, arguments);
+    addFormat(command, arguments.watch.format);
+    addLimits(command, arguments.watch.count, "End after this many refreshes", arguments.watch.duration);
+}
+
+void addDecode(CLI::App& program, Arguments& arguments)
+{
+    DecodeOptions& decode = arguments.decode;
+    CLI::App& command = *program.add_subcommand(
+        "decode", "Decode recordings (captures, snapshots, DLF files) offline and print the display");
+    command.callback([&arguments] { arguments.job = Job::Decode; });
+    addCommon(command, arguments);
+    command.add_option("FILE", decode.files, "The recordings, decoded one after the other; - is standard input")
+        ->required()
+        ->type_name("");
+    addFormat(command, decode.format);
+    command.add_flag("--each", decode.each, "With --format json: one line for each message");
+    addTechnology(command, decode.technology);
+    addFormedOption(command, "--snapshot", decode.snapshotDirectory, FolderForm,
+        "Write a snapshot file into this folder at the end");
+    command.add_flag("--keep-going", decode.keepGoing, "Go on after a message that would end the program");
+}
+
+void addView(CLI::App& program, Arguments& arguments)
+{
+    CLI::App& command = *program.add_subcommand(
+        "view", "Browse a recording or a snapshot in the screens; a recording plays, pauses, steps and seeks");
+    command.callback([&arguments] { arguments.job = Job::View; });
+    addCommon(command, arguments);
+    addScreens(command, arguments);
+    addFormedOption(command, "FILE", arguments.view.file, FileForm, "A capture, a snapshot or a DLF file")
+        ->required()
+        ->type_name("");
+    addTechnology(command, arguments.view.technology);
+}
+
+void addRecord(CLI::App& program, Arguments& arguments)
+{
+    CLI::App& command = *program.add_subcommand("record", "Record the live session into a capture file (pcap)");
+    command.callback([&arguments] { arguments.job = Job::Record; });
+    addCommon(command, arguments);
+    RecordingFilesOptions& files = arguments.record.files;
+    addFormedOption(command, "FILE", files.target, FileForm,
+        "The capture file; an existing one is overwritten. A folder (or a new one: FOLDER/) takes numbered files, on "
+        "from those that are there. - is standard output")
+        ->required()
+        ->type_name("");
+    addFormedOption(command, "--rollover", files.largestFile, SizeForm,
+        "Begin a further file before one has more bytes than this, such as 100M");
+    addFormedOption(command, "--rollover-time", files.longestFile, DurationForm,
+        "Begin a further file after this time, such as 1h");
+    addFormedOption(
+        command, "--keep", files.keep, CountForm, "Of the numbered files keep the last so many, remove the older ones");
+    addLimits(command, arguments.record.count, "End after this many messages", arguments.record.duration);
+}
+
+/// What no single option can tell.
+void checkTogether(const Arguments& arguments)
+{
+    if (arguments.decode.each && arguments.decode.format != OutputFormat::Json)
+        throw CLI::ValidationError("--each", "goes with --format json only");
+    const RecordingFilesOptions& files = arguments.record.files;
+    if (files.target == "-" && (files.largestFile || files.longestFile || files.keep))
+        throw CLI::ValidationError(files.largestFile ? "--rollover"
+                : files.longestFile                  ? "--rollover-time"
+                                                     : "--keep",
+            "standard output is one stream, not several files");
+}
+
+} // namespace
+
+std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
+{
+    CLI::App program(Description, "spectrel");
+    program.footer(Environment);
+    program.require_subcommand(0, 1);
+    addCommon(program, arguments);
+    addScreens(program, arguments);
+    addWatch(program, arguments);
+    addDecode(program, arguments);
+    addView(program, arguments);
+    addRecord(program, arguments);
+    try {
+        program.parse(argc, argv);
+        checkTogether(arguments);
+    } catch (const CLI::Success& answered) {
+        return program.exit(answered); // --help and --version, on standard output
+    } catch (const CLI::ParseError& error) {
+        std::cerr << "spectrel: " << error.what() << " (see spectrel --help)\n";
+        return ExitStatus::WrongUsage;
+    }
+    return std::nullopt;
+}
+
+} // namespace spectrel

@@ -1,0 +1,116 @@
+#include "CommandLine/Commands/Decode.h"
+
+#include "CommandLine/Program/ErrorLine.h"
+#include "Monitor/MessageText.h"
+#include "Monitor/Viewing/OfflineSession.h"
+
+#include <cstdio>
+#include <exception>
+
+namespace spectrel {
+
+namespace {
+
+/// Runs the files through one session and prints as it goes.
+class Decoding {
+public:
+    explicit Decoding(const DecodeOptions& options)
+        : _options(options)
+        , _session(options.snapshotDirectory.has_value())
+        , _output(stdout, options.format)
+    {
+    }
+
+    int run()
+    {
+        for (const std::string& file : _options.files) {
+            if (!decodeFile(file))
+                break;
+        }
+        if (!_options.each)
+            _output.printDisplay(_session.display());
+        saveSnapshot();
+        if (!_output.flush())
+            fail("standard output: cannot be written");
+        return _status;
+    }
+
+private:
+    void fail(const std::string& line)
+    {
+        _output.flush(); // what was decoded comes before the complaint
+        report(line);
+        _status = 1;
+    }
+
+    /// False when a message has ended the decoding.
+    bool decodeFile(const std::string& path)
+    {
+        const bool isStandardInput = path == "-";
+        const std::string file = isStandardInput ? "standard input" : path;
+        std::string reason;
+        const auto reader = openRecording(isStandardInput ? "/dev/stdin" : path, reason);
+        if (!reader) {
+            fail(file + ": " + reason);
+            return true;
+        }
+        const auto technology = reader->technology() ? reader->technology() : _options.technology;
+        if (!technology) {
+            fail(file + ": does not tell its technology; name it with --technology");
+            return true;
+        }
+        _session.useTechnology(*technology);
+        RecordedMessage message;
+        while (reader->next(message)) {
+            if (!decodeMessage(file, message))
+                return false;
+        }
+        if (!reader->damage().empty())
+            fail(file + ": " + reader->damage());
+        return true;
+    }
+
+    bool decodeMessage(const std::string& file, const RecordedMessage& message)
+    {
+        const std::uint64_t n = _n++;
+        try {
+            _session.apply(message);
+        } catch (const std::exception& raised) {
+            const std::string line = file + ": message " + std::to_string(n) + " (" + codeText(message.body)
+                + ") ends the program: " + exceptionName(raised);
+            if (!_options.keepGoing) {
+                fail(line);
+                return false;
+            }
+            _output.flush();
+            report(line);
+        }
+        if (_options.each)
+            _output.printNumberedJson(n, _session.display());
+        else
+            _output.printChanges(n, message.time, _session.display());
+        return true;
+    }
+
+    void saveSnapshot()
+    {
+        std::string reason;
+        if (_options.snapshotDirectory && !_session.saveSnapshot(*_options.snapshotDirectory, reason))
+            fail("cannot write the snapshot: " + reason);
+    }
+
+    const DecodeOptions& _options;
+    OfflineSession _session;
+    OutputWriter _output;
+    std::uint64_t _n = 0;
+    int _status = 0;
+};
+
+} // namespace
+
+int decode(const DecodeOptions& options)
+{
+    return Decoding(options).run();
+}
+
+} // namespace spectrel

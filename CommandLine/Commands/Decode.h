@@ -1,0 +1,26 @@
+#pragma once
+
+#include "CommandLine/Output/OutputWriter.h"
+#include "Records/Recording.h"
+
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace spectrel {
+
+/// What `spectrel decode` was asked for.
+struct DecodeOptions {
+    std::vector<std::string> files;
+    OutputFormat format = OutputFormat::Tree;
+    bool each = false; // with Json: one line for each message
+    bool keepGoing = false; // past a message that would end the running application
+    std::optional<Technology> technology; // where a file does not tell
+    std::optional<std::string> snapshotDirectory;
+};
+
+/// Decodes the recordings one after the other, as one session, and prints the display to standard output. Answers the
+/// program's exit status.
+int decode(const DecodeOptions& options);
+
+} // namespace spectrel

@@ -1,0 +1,116 @@
+#include "CommandLine/Commands/Record.h"
+
+#include "CommandLine/Program/ErrorLine.h"
+#include "CommandLine/Program/LiveServices.h"
+#include "Platform/Qt/TerminationSignals.h"
+#include "Records/Recording.h"
+
+namespace spectrel {
+
+namespace {
+
+/// Messages reach the file at the latest this long after they came.
+constexpr std::chrono::milliseconds FlushDelay {500};
+
+class Recorder final : public SpectrelModelObserver {
+public:
+    explicit Recorder(const RecordOptions& options)
+        : _options(options)
+        , _files(options.files)
+        , _model(_live.services(), *this, LiveServices::portPrefixFor("Record"))
+    {
+    }
+
+    int run()
+    {
+        if (!_files.prepare()) {
+            fail(_files.error());
+            return _status;
+        }
+        const TerminationSignals terminationSignals([this](int) { _live.runLoop().quit(); });
+        _live.runLoop().async([this] { _model.restartMonitor(); });
+        if (_options.duration)
+            _live.runLoop().after(*_options.duration, [this] { _live.runLoop().quit(); });
+        _live.runLoop().run();
+        _model.destroyPorts();
+        flush();
+        if (_files.count() == 0 && _status == 0)
+            fail(RecordingFiles::spoken(_options.files.target) + ": nothing was recorded, for no session was opened");
+        else if (_status == 0)
+            report(RecordingFiles::spoken(_files.path()) + ": " + std::to_string(_messages) + " messages"
+                + (_files.count() > 1 ? " in " + std::to_string(_files.count()) + " files, this one being the last"
+                                      : ""));
+        return _status;
+    }
+
+    bool modelShouldApply(ByteView body) override
+    {
+        if (const auto technology = technologyOfConstant(_model.technology());
+            technology && _status == 0 && _messages != _options.count)
+            write(*technology, body);
+        return false;
+    }
+    void updateViewControllerFromModel() override { }
+    void sessionDidChange() override
+    {
+        if (_model.isConnected())
+            begin();
+        else if (!_model.lostReason().empty())
+            report("Connecting... (" + _model.lostReason() + ")");
+    }
+
+private:
+    void fail(const std::string& line)
+    {
+        report(line);
+        _status = 1;
+        _live.runLoop().quit();
+    }
+
+    /// The file is there from the session's start on, before the first message.
+    void begin()
+    {
+        const auto technology = technologyOfConstant(_model.technology());
+        if (technology && _status == 0 && !_files.begin(*technology, Clock::installed().now()))
+            fail(_files.error());
+    }
+
+    void write(Technology technology, ByteView body)
+    {
+        const std::size_t before = _files.count();
+        if (!_files.write(technology, Clock::installed().now(), body))
+            return fail(_files.error());
+        if (before > 0 && _files.count() > before)
+            report("recording into " + _files.path());
+        if (!_flushIsDue) {
+            _flushIsDue = true;
+            _live.runLoop().after(FlushDelay, [this] { flush(); });
+        }
+        if (++_messages == _options.count)
+            _live.runLoop().quit();
+    }
+
+    void flush()
+    {
+        _flushIsDue = false;
+        if (!_files.flush() && _status == 0)
+            fail(_files.error());
+    }
+
+    const RecordOptions& _options;
+    RecordingFiles _files;
+    LiveServices _live;
+    SpectrelModel _model;
+    std::uint64_t _messages = 0;
+    bool _flushIsDue = false;
+    int _status = 0;
+};
+
+} // namespace
+
+int record(const RecordOptions& options)
+{
+    return Recorder(options).run();
+}
+
+} // namespace spectrel

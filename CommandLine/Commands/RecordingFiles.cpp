@@ -1,0 +1,184 @@
+#include "CommandLine/Commands/RecordingFiles.h"
+
+#include <algorithm>
+#include <cerrno>
+#include <charconv>
+#include <cstdio>
+#include <cstring>
+#include <filesystem>
+#include <unistd.h>
+
+namespace spectrel {
+
+namespace fs = std::filesystem;
+
+namespace {
+
+constexpr std::string_view FolderPrefix = "spectrel-";
+constexpr std::string_view Extension = ".pcap";
+constexpr std::uint64_t FileHeaderLength = 24;
+constexpr std::uint64_t PacketHeaderLength = 16;
+
+/// The number in "spectrel-000001-lte.pcap"; 0 in any other name.
+std::uint64_t numberOf(const std::string& name)
+{
+    std::uint64_t number = 0;
+    if (!name.starts_with(FolderPrefix) || !name.ends_with(Extension))
+        return 0;
+    const char* const first = name.data() + FolderPrefix.size();
+    const auto end = std::from_chars(first, name.data() + name.size(), number);
+    return end.ec == std::errc() && *end.ptr == '-' ? number : 0;
+}
+
+std::string folderName(std::uint64_t number, Technology technology)
+{
+    char digits[32];
+    std::snprintf(digits, sizeof digits, "%06llu", static_cast<unsigned long long>(number));
+    return std::string(FolderPrefix) + digits + "-" + std::string(technologyName(technology)) + std::string(Extension);
+}
+
+/// The numbered files of a folder, by their numbers.
+std::vector<std::pair<std::uint64_t, fs::path>> numberedFiles(const std::string& folder)
+{
+    std::vector<std::pair<std::uint64_t, fs::path>> files;
+    std::error_code error;
+    for (fs::directory_iterator each(folder, error); !error && each != fs::directory_iterator();
+         each.increment(error)) {
+        if (const auto number = numberOf(each->path().filename().string()); number > 0)
+            files.emplace_back(number, each->path());
+    }
+    std::ranges::sort(files);
+    return files;
+}
+
+} // namespace
+
+RecordingFiles::RecordingFiles(RecordingFilesOptions options)
+    : _options(std::move(options))
+{
+}
+
+std::string RecordingFiles::spoken(const std::string& path)
+{
+    return path == "-" ? "standard output" : path;
+}
+
+bool RecordingFiles::failed(const std::string& path, const std::string& reason)
+{
+    _error = spoken(path) + ": " + reason;
+    return false;
+}
+
+bool RecordingFiles::prepare()
+{
+    const std::string& target = _options.target;
+    std::error_code error;
+    _isFolder = target.ends_with('/') || fs::is_directory(target, error);
+    if (_isFolder) {
+        fs::create_directories(target, error);
+        if (error)
+            return failed(target, error.message());
+    }
+    const std::string folder = _isFolder ? target : fs::path(target).parent_path().string();
+    if (target != "-" && ::access(folder.empty() ? "." : folder.c_str(), W_OK) != 0)
+        return failed(target, std::strerror(errno));
+    return true;
+}
+
+std::uint64_t RecordingFiles::latestNumber() const
+{
+    const auto files = numberedFiles(_options.target);
+    return files.empty() ? 0 : files.back().first;
+}
+
+bool RecordingFiles::begin(Technology technology, Moment time)
+{
+    return _writer || beginNext(technology, time);
+}
+
+bool RecordingFiles::write(Technology technology, Moment time, ByteView message)
+{
+    if ((!_writer || technology != _technology || isFull(message.size(), time)) && !beginNext(technology, time))
+        return false;
+    if (!_writer->write(time, message))
+        return failed(_path, _writer->error());
+    _bytes += PacketHeaderLength + message.size();
+    return true;
+}
+
+/// A file holds at least one message, however large.
+bool RecordingFiles::isFull(std::size_t message, Moment time) const
+{
+    if (_options.largestFile && _bytes > FileHeaderLength
+        && _bytes + PacketHeaderLength + message > *_options.largestFile)
+        return true;
+    return _options.longestFile && time - _begun >= *_options.longestFile;
+}
+
+bool RecordingFiles::beginNext(Technology technology, Moment time)
+{
+    if (_writer && _options.target == "-")
+        return failed("standard output", "one stream cannot tell of another technology; the recording ends");
+    if (!flush())
+        return false;
+    if (!createNext(technology))
+        return false;
+    ++_count;
+    _technology = technology;
+    _bytes = FileHeaderLength;
+    _begun = time;
+    removeOldest();
+    return true;
+}
+
+/// Two recorders never share a file, for a number that is taken is passed over.
+bool RecordingFiles::createNext(Technology technology)
+{
+    if (_isFolder)
+        _number = latestNumber();
+    std::string reason;
+    do {
+        ++_number;
+        _path = numberedPath(technology);
+        const bool isTarget = _path == _options.target;
+        _writer = (isTarget ? createRecording : createNewRecording)(_path, technology, reason);
+    } while (!_writer && reason.empty());
+    return _writer || failed(_path, reason);
+}
+
+std::string RecordingFiles::numberedPath(Technology technology) const
+{
+    const fs::path target(_options.target);
+    if (_isFolder)
+        return (target / folderName(_number, technology)).string();
+    if (_number == 1)
+        return _options.target;
+    const std::string name = target.stem().string() + "-" + std::to_string(_number) + target.extension().string();
+    return (target.parent_path() / name).string();
+}
+
+/// What cannot be removed stays.
+void RecordingFiles::removeOldest()
+{
+    if (!_options.keep)
+        return;
+    std::error_code error;
+    if (_isFolder) {
+        const auto files = numberedFiles(_options.target);
+        for (std::size_t i = 0; i + *_options.keep < files.size(); ++i)
+            fs::remove(files[i].second, error);
+        return;
+    }
+    _written.push_back(_path);
+    if (_written.size() > *_options.keep) {
+        fs::remove(_written.front(), error);
+        _written.erase(_written.begin());
+    }
+}
+
+bool RecordingFiles::flush()
+{
+    return !_writer || _writer->flush() || failed(_path, _writer->error());
+}
+
+} // namespace spectrel

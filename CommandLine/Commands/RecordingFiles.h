@@ -1,0 +1,77 @@
+#pragma once
+
+#include "Records/Recording.h"
+
+#include <chrono>
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace spectrel {
+
+/// Where a session is recorded, and when a further file begins.
+struct RecordingFilesOptions {
+    /// A capture file, "-" (standard output), or a folder: one that is there, or a name that ends with a slash.
+    std::string target;
+    std::optional<std::uint64_t> largestFile; // bytes
+    std::optional<std::chrono::milliseconds> longestFile; // of time
+    std::optional<std::uint64_t> keep; // of the numbered files, the latest
+};
+
+/// The capture files of one recorded session.
+///
+/// A file FILE.pcap is followed by FILE-2.pcap, FILE-3.pcap and so on: the first is overwritten, the others take
+/// numbers that are free. In a folder the files are numbered on from those that are there: "spectrel-000001-lte.pcap".
+/// A file begins with the first message, when it is full or its time is over, and when the technology changes.
+class RecordingFiles {
+public:
+    explicit RecordingFiles(RecordingFilesOptions options);
+
+    /// Makes the folder at need. False, with `error`, when there is no place to write.
+    bool prepare();
+    /// Begins the first file, so that it is there before the first message.
+    bool begin(Technology technology, Moment time);
+    bool write(Technology technology, Moment time, ByteView message);
+    bool flush();
+
+    /// A file's name as messages tell it; "-" is standard output.
+    static std::string spoken(const std::string& path);
+    /// The current file; empty before the first.
+    const std::string& path() const
+    {
+        return _path;
+    }
+    std::size_t count() const
+    {
+        return _count;
+    }
+    /// Names the file.
+    const std::string& error() const
+    {
+        return _error;
+    }
+
+private:
+    bool isFull(std::size_t message, Moment time) const;
+    bool beginNext(Technology technology, Moment time);
+    bool createNext(Technology technology);
+    std::string numberedPath(Technology technology) const;
+    std::uint64_t latestNumber() const;
+    void removeOldest();
+    bool failed(const std::string& path, const std::string& reason);
+
+    RecordingFilesOptions _options;
+    bool _isFolder = false;
+    std::uint64_t _number = 0; // of the latest file
+    std::unique_ptr<RecordingWriter> _writer;
+    Technology _technology = Technology::LTE;
+    std::string _path;
+    std::size_t _count = 0; // of files begun
+    std::uint64_t _bytes = 0; // of the current file
+    Moment _begun {}; // the current file
+    std::vector<std::string> _written; // outside of folders: the files begun, oldest first
+    std::string _error;
+};
+
+} // namespace spectrel

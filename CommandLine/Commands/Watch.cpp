@@ -1,0 +1,78 @@
+#include "CommandLine/Commands/Watch.h"
+
+#include "CommandLine/Program/CrashReport.h"
+#include "CommandLine/Program/ErrorLine.h"
+#include "CommandLine/Program/LiveServices.h"
+#include "Platform/Qt/TerminationSignals.h"
+
+#include <cstdio>
+
+namespace spectrel {
+
+namespace {
+
+class Watching final : public SpectrelModelObserver {
+public:
+    explicit Watching(const WatchOptions& options)
+        : _options(options)
+        , _output(stdout, options.format)
+        , _model(_live.services(), *this, LiveServices::portPrefixFor("Watch"))
+    {
+    }
+    ~Watching() override
+    {
+        Ending::remove();
+    }
+
+    int run()
+    {
+        Ending::install(_model, {});
+        const TerminationSignals terminationSignals([this](int) { _live.runLoop().quit(); });
+        _live.runLoop().async([this] { _model.restartMonitor(); });
+        if (_options.duration)
+            _live.runLoop().after(*_options.duration, [this] { _live.runLoop().quit(); });
+        _output.flush();
+        _live.runLoop().run();
+        return _status;
+    }
+
+    void updateViewControllerFromModel() override
+    {
+        _model.topLevelNodes(); // builds the display, and the history entry of this refresh
+        const Value& display = _model.state()[StateKey::Display];
+        _output.printDisplay(display);
+        if (_options.format == OutputFormat::Tree)
+            _output.printLine("");
+        _output.printChanges(_refreshes, Clock::installed().now(), display);
+        if (!_output.flush()) {
+            report("standard output: cannot be written");
+            _status = 1;
+            _live.runLoop().quit();
+        }
+        if (++_refreshes == _options.count)
+            _live.runLoop().quit();
+    }
+
+    void sessionDidChange() override
+    {
+        if (!_model.isConnected() && !_model.lostReason().empty())
+            report("Connecting... (" + _model.lostReason() + ")");
+    }
+
+private:
+    const WatchOptions& _options;
+    LiveServices _live;
+    OutputWriter _output;
+    SpectrelModel _model;
+    std::uint64_t _refreshes = 0;
+    int _status = 0;
+};
+
+} // namespace
+
+int watch(const WatchOptions& options)
+{
+    return Watching(options).run();
+}
+
+} // namespace spectrel

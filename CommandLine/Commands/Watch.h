@@ -1,0 +1,22 @@
+#pragma once
+
+#include "CommandLine/Output/OutputWriter.h"
+
+#include <chrono>
+#include <cstdint>
+#include <optional>
+
+namespace spectrel {
+
+/// What `spectrel watch` was asked for.
+struct WatchOptions {
+    OutputFormat format = OutputFormat::Tree;
+    std::optional<std::uint64_t> count; // refreshes
+    std::optional<std::chrono::milliseconds> duration;
+};
+
+/// Prints a live session, once at each refresh, until interrupted or until what was asked for has been printed. Answers
+/// the program's exit status.
+int watch(const WatchOptions& options);
+
+} // namespace spectrel

@@ -1,0 +1,131 @@
+#include "CommandLine/Output/OutputWriter.h"
+
+#include "CommandLine/Output/DisplayPrinter.h"
+
+#include <array>
+#include <utility>
+
+namespace spectrel {
+
+namespace {
+
+constexpr std::size_t WriteSize = 64 * 1024;
+
+/// Seconds since 1970 with six decimals.
+std::string timeText(Moment time)
+{
+    const auto seconds = std::chrono::floor<std::chrono::seconds>(time);
+    char text[40];
+    std::snprintf(text, sizeof text, "%lld.%06lld", static_cast<long long>(seconds.time_since_epoch().count()),
+        static_cast<long long>((time - seconds).count()));
+    return text;
+}
+
+/// A field of RFC 4180: quoted where it holds a separator, a quote or a line end.
+void appendCsvField(std::string_view field, std::string& out)
+{
+    if (field.find_first_of(",\"\r\n") == std::string_view::npos) {
+        out += field;
+        return;
+    }
+    out += '"';
+    for (const char character : field) {
+        if (character == '"')
+            out += '"';
+        out += character;
+    }
+    out += '"';
+}
+
+} // namespace
+
+std::optional<OutputFormat> outputFormatNamed(std::string_view name)
+{
+    static constexpr std::array<std::pair<std::string_view, OutputFormat>, 5> Formats {{
+        {"tree", OutputFormat::Tree},
+        {"json", OutputFormat::Json},
+        {"changes", OutputFormat::Changes},
+        {"csv", OutputFormat::Csv},
+        {"none", OutputFormat::None},
+    }};
+    for (const auto& [known, format] : Formats) {
+        if (known == name)
+            return format;
+    }
+    return std::nullopt;
+}
+
+OutputWriter::OutputWriter(std::FILE* stream, OutputFormat format)
+    : _stream(stream)
+    , _format(format)
+{
+    if (format == OutputFormat::Csv)
+        _gathered += "n,time,path,value\r\n";
+}
+
+void OutputWriter::printDisplay(const Value& display)
+{
+    if (_format == OutputFormat::Tree) {
+        appendTree(display, _gathered);
+    } else if (_format == OutputFormat::Json) {
+        appendJson(display, _gathered);
+        _gathered += '\n';
+    }
+    flushWhenLarge();
+}
+
+void OutputWriter::printNumberedJson(std::uint64_t n, const Value& display)
+{
+    _gathered += "{\"n\": " + std::to_string(n) + ", \"display\": ";
+    appendJson(display, _gathered);
+    _gathered += "}\n";
+    flushWhenLarge();
+}
+
+void OutputWriter::printChanges(std::uint64_t n, Moment time, const Value& display)
+{
+    if (_format != OutputFormat::Changes && _format != OutputFormat::Csv)
+        return;
+    _changes.update(display, [&](const std::string& path, const std::string* value) {
+        if (_format == OutputFormat::Csv) {
+            _gathered += std::to_string(n) + "," + timeText(time) + ",";
+            appendCsvField(path, _gathered);
+            _gathered += ',';
+            appendCsvField(value ? std::string_view(*value) : std::string_view(), _gathered);
+            _gathered += "\r\n";
+            return;
+        }
+        _gathered += "{\"n\": " + std::to_string(n) + ", \"time\": " + timeText(time) + ", \"path\": ";
+        appendJsonText(path, _gathered);
+        _gathered += ", \"value\": ";
+        if (value)
+            appendJsonText(*value, _gathered);
+        else
+            _gathered += "null";
+        _gathered += "}\n";
+    });
+    flushWhenLarge();
+}
+
+void OutputWriter::printLine(std::string_view line)
+{
+    _gathered += line;
+    _gathered += '\n';
+    flushWhenLarge();
+}
+
+void OutputWriter::flushWhenLarge()
+{
+    if (_gathered.size() >= WriteSize)
+        flush();
+}
+
+bool OutputWriter::flush()
+{
+    if (std::fwrite(_gathered.data(), 1, _gathered.size(), _stream) != _gathered.size() || std::fflush(_stream) != 0)
+        _hasFailed = true;
+    _gathered.clear();
+    return !_hasFailed;
+}
+
+} // namespace spectrel

@@ -1,0 +1,110 @@
+#include "CommandLine/Program/CrashReport.h"
+
+#include "CommandLine/Program/ErrorLine.h"
+#include "Monitor/MessageText.h"
+#include "Monitor/Snapshot.h"
+#include "Monitor/SpectrelModel.h"
+#include "Platform/Clock.h"
+#include "Platform/Places.h"
+#include "Platform/SystemLog.h"
+
+#include <chrono>
+#include <cstdlib>
+#include <exception>
+#include <filesystem>
+#include <system_error>
+#include <utility>
+
+namespace spectrel {
+
+namespace {
+
+SpectrelModel* endingModel = nullptr;
+std::function<void()> giveScreenBack;
+std::string reasonOfEnding = "unknown reason";
+
+std::string currentExceptionName()
+{
+    try {
+        if (const auto current = std::current_exception())
+            std::rethrow_exception(current);
+    } catch (const std::exception& exception) {
+        return exceptionName(exception);
+    } catch (...) {
+        return "an exception of unknown kind";
+    }
+    return "no exception: the program was told to terminate";
+}
+
+/// No snapshot that the user has just saved is overwritten: the seconds in the name go on until one is free.
+std::string freeSnapshotPath(Moment now)
+{
+    std::string path;
+    std::error_code error;
+    do {
+        path = snapshotPath(Places::crashLogDirectory(), now);
+        now += std::chrono::seconds(1);
+    } while (std::filesystem::exists(path, error));
+    return path;
+}
+
+void tellEverywhere(const std::string& line)
+{
+    report(line);
+    SPECTREL_LOG(Priority::Error, "%s", line.c_str());
+}
+
+} // namespace
+
+void Ending::install(SpectrelModel& model, std::function<void()> restoreScreen)
+{
+    endingModel = &model;
+    giveScreenBack = std::move(restoreScreen);
+    std::set_terminate(&Ending::terminate);
+}
+
+void Ending::remove()
+{
+    endingModel = nullptr;
+    giveScreenBack = {};
+}
+
+void Ending::terminate() noexcept
+{
+    static bool isEnding = false;
+    if (!std::exchange(isEnding, true)) {
+        if (giveScreenBack)
+            giveScreenBack();
+        tell();
+        saveWhatIsLeft();
+    }
+    std::abort();
+}
+
+void Ending::tell()
+{
+    reasonOfEnding = "ended by " + currentExceptionName();
+    const ByteView message = endingModel ? endingModel->messageInProgress() : ByteView();
+    if (message.empty())
+        return tellEverywhere(reasonOfEnding);
+    tellEverywhere(reasonOfEnding + ", raised by a message of " + std::to_string(message.size()) + " bytes, "
+        + codeText(message) + ": " + hexadecimal(message));
+}
+
+void Ending::saveWhatIsLeft()
+{
+    if (!endingModel)
+        return;
+    const ListRef contents = std::exchange(endingModel, nullptr)->getLastContents();
+    if (!contents)
+        return;
+    const Moment now = Clock::installed().now();
+    const std::string path = freeSnapshotPath(now);
+    std::string reason;
+    if (writeSnapshot(makeSnapshot(now, contents, "Spectrel " + reasonOfEnding), path, reason))
+        tellEverywhere("what was received is kept in " + path);
+    else
+        tellEverywhere("cannot write " + path + ": " + reason);
+}
+
+} // namespace spectrel

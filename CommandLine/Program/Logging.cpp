@@ -1,0 +1,61 @@
+#include "CommandLine/Program/Logging.h"
+
+#include "CommandLine/Program/ErrorLine.h"
+#include "Platform/Places.h"
+#include "Platform/SystemLog.h"
+
+namespace spectrel {
+
+namespace {
+
+/// The least urgent lines that go to the system log; traces, a line for each section and record, stay out of it.
+constexpr int SystemLogPriority = Priority::Error;
+constexpr int EveryPriority = 7;
+
+} // namespace
+
+bool Logging::start(const std::optional<std::string>& file, Use use)
+{
+    return startDiagnostics() && startLog(file, use);
+}
+
+bool Logging::startDiagnostics()
+{
+    const std::string path = Places::diagnosticLog();
+    std::string reason;
+    if (!path.empty() && !(_diagnostics = DiagnosticFile::create(path, reason))) {
+        report(path + ": " + reason);
+        return false;
+    }
+    return true;
+}
+
+bool Logging::startLog(const std::optional<std::string>& file, Use use)
+{
+    if (file) {
+        _path = *file;
+        std::string reason;
+        _file =
+            FileLog::create(_path, use == Use::Live ? FileLog::Writing::EachLine : FileLog::Writing::Buffered, reason);
+        if (!_file) {
+            report(_path + ": " + reason);
+            return false;
+        }
+        SystemLog::install(_file.get(), EveryPriority);
+    } else if (use == Use::Live) {
+        _system = std::make_unique<SyslogLog>();
+        SystemLog::install(_system.get(), SystemLogPriority);
+    }
+    return true;
+}
+
+bool Logging::finish()
+{
+    SystemLog::install(nullptr, -1);
+    if (!_file || _file->flush())
+        return true;
+    report(_path + ": the log could not be written whole");
+    return false;
+}
+
+} // namespace spectrel

@@ -1,0 +1,26 @@
+#include "CommandLine/Program/ViewingApplication.h"
+
+#include "CommandLine/Program/ErrorLine.h"
+#include "CommandLine/Program/ExitStatus.h"
+#include "Monitor/Snapshot.h"
+#include "Platform/Preferences.h"
+#include "UI/SpectrelApp.h"
+
+namespace spectrel {
+
+int runViewingApplication(ViewedFile& file, const std::string& path, QtRunLoop& runLoop, ScreenToolkit& toolkit)
+{
+    const auto tell = [&path](const std::string& line) { report(path + ": " + line); };
+    if (!file.damage().empty())
+        tell(file.damage());
+    NoPreferences preferences;
+    SpectrelApp application({runLoop, file.clock(), preferences, toolkit,
+        [&](SpectrelModelObserver& observer) { return file.makeModel(runLoop, observer, tell); }, writeSnapshot, {},
+        false});
+    application.applicationDidFinishLaunching();
+    runLoop.run();
+    application.applicationWillTerminate();
+    return file.damage().empty() ? ExitStatus::Done : ExitStatus::Failed;
+}
+
+} // namespace spectrel

@@ -1,0 +1,48 @@
+#pragma once
+
+#include "LogGenerator/GeneratorSlot.h"
+#include "Monitor/Viewing/RecordingClock.h"
+#include "Records/Recording.h"
+#include "Values/Dictionary.h"
+
+#include <cstdint>
+#include <string>
+
+namespace spectrel {
+
+/// Applies recorded messages as a live session would, on the recording's own clock.
+///
+/// Refresh ticks fall 2.0 s, 4.0 s, ... after the first message; a message at the very time of a tick comes before it.
+class OfflineSession {
+public:
+    /// `keepsHistory`: run the refresh ticks and keep the raw messages, as a snapshot needs them; otherwise the raw
+    /// messages are forgotten, so that memory does not grow with the recording.
+    explicit OfflineSession(bool keepsHistory);
+
+    /// A recording of another technology replaces the generator, as a baseband that changes its technology does.
+    void useTechnology(Technology technology);
+    /// Passes on what the message raises.
+    void apply(const RecordedMessage& message);
+    /// The display as it stands; absent when there is none.
+    const Value& display() const;
+
+    /// Refreshes once more and writes the snapshot file, both at the last message's time. False, with `reason`, when it
+    /// cannot be written.
+    bool saveSnapshot(const std::string& directory, std::string& reason);
+
+private:
+    void runTicksBefore(Moment time);
+    void refresh(Moment time);
+
+    bool _keepsHistory;
+    RecordingClock _clock;
+    Dictionary _state;
+    GeneratorSlot _generator;
+    std::uint64_t _messages = 0;
+    std::size_t _rawBytes = 0; // kept by the generator since it last let go of them
+    bool _updated = false; // since the last refresh
+    Moment _first {};
+    Moment _last {};
+};
+
+} // namespace spectrel

@@ -1,0 +1,49 @@
+#include "Monitor/Viewing/ViewedFile.h"
+
+#include "Monitor/Viewing/RecordingModel.h"
+#include "Monitor/Viewing/SnapshotModel.h"
+#include "Values/Dictionary.h"
+
+#include <filesystem>
+#include <system_error>
+#include <utility>
+
+namespace spectrel {
+
+std::unique_ptr<ViewedFile> ViewedFile::open(
+    const std::string& path, std::optional<Technology> technology, const Clock& deviceClock, std::string& reason)
+{
+    std::error_code error;
+    const auto status = std::filesystem::status(path, error);
+    if (std::filesystem::exists(status) && !std::filesystem::is_regular_file(status)
+        && !std::filesystem::is_directory(status)) {
+        reason = "not a plain file: it could not be read again for going back";
+        return nullptr;
+    }
+    auto reader = openRecording(path, reason);
+    if (!reader)
+        return nullptr;
+    std::unique_ptr<ViewedFile> file(new ViewedFile(deviceClock));
+    if ((file->_snapshot = reader->snapshot())) {
+        const std::string* made = (*file->_snapshot)["Timestamp"].string();
+        Moment moment {};
+        if (made && parseDefaultDateForm(*made, moment))
+            file->_clock.set(moment);
+        return file;
+    }
+    file->_recording = RecordingTrack::open(path, std::move(reader), technology, reason);
+    if (!file->_recording)
+        return nullptr;
+    file->_damage = file->_recording->damage();
+    return file;
+}
+
+std::unique_ptr<MonitorModel> ViewedFile::makeModel(RunLoop& runLoop, SpectrelModelObserver& observer, Report report)
+{
+    if (_snapshot)
+        return std::make_unique<SnapshotModel>(runLoop, observer, *_snapshot);
+    return std::make_unique<RecordingModel>(
+        runLoop, observer, _clock, std::move(*std::exchange(_recording, std::nullopt)), std::move(report));
+}
+
+} // namespace spectrel

@@ -1,0 +1,24 @@
+#pragma once
+
+#include "Records/Recording.h"
+
+#include <array>
+#include <optional>
+
+namespace spectrel {
+
+/// A capture's link type tells the technology.
+struct LinkType {
+    int number; // one of the numbers that captures leave to private use
+    Technology technology;
+};
+
+constexpr std::array<LinkType, 5> LinkTypes {{
+    {147, Technology::IFX},
+    {148, Technology::GSM},
+    {149, Technology::CDMA},
+    {150, Technology::LTE},
+    {151, Technology::UTRAN},
+}};
+
+} // namespace spectrel

@@ -1,0 +1,62 @@
+#pragma once
+
+#include "Records/Technology.h"
+#include "Values/Bytes.h"
+#include "Values/Moment.h"
+#include "Values/Value.h"
+
+#include <cstdint>
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace spectrel {
+
+/// One inbound log message as it was delivered, wrapper and all.
+struct RecordedMessage {
+    Moment time;
+    ByteView body; // valid until the next one is read
+};
+
+/// Reads a recording message by message, whatever the kind of file: a capture, a snapshot or a DLF.
+class RecordingReader {
+public:
+    virtual ~RecordingReader() = default;
+    /// None when the file does not tell it.
+    virtual std::optional<Technology> technology() const = 0;
+    /// False at the end and at damage; `damage` then tells which.
+    virtual bool next(RecordedMessage& message) = 0;
+    /// What ended the reading early, with the place in the file ("message 12 at byte 3481: ..."); empty at a clean end.
+    virtual const std::string& damage() const = 0;
+    /// The whole snapshot that the messages come from; null in any other kind of file.
+    virtual DictionaryRef snapshot() const
+    {
+        return nullptr;
+    }
+};
+
+/// Opens a recording; its content tells its kind. Null when it cannot be read or is of no known kind, with `reason`
+/// telling why (without the file's name).
+std::unique_ptr<RecordingReader> openRecording(const std::string& path, std::string& reason);
+
+/// Writes a capture file (classic pcap); the link type tells the technology.
+class RecordingWriter {
+public:
+    virtual ~RecordingWriter() = default;
+    /// False when the message cannot be written; `error` tells why.
+    virtual bool write(Moment time, ByteView body) = 0;
+    virtual bool flush() = 0;
+    virtual const std::string& error() const = 0;
+};
+
+/// Null when the file cannot be made, with `reason` telling why. "-" is standard output.
+///
+/// A program that is killed, at whatever time, leaves a file that can be read: a new one has its head from the start,
+/// and at most the last message is cut, where the kill struck in the midst of a write.
+std::unique_ptr<RecordingWriter> createRecording(const std::string& path, Technology technology, std::string& reason);
+/// The same for a name that no file has yet: null with an empty `reason` when one has it.
+std::unique_ptr<RecordingWriter> createNewRecording(
+    const std::string& path, Technology technology, std::string& reason);
+
+} // namespace spectrel

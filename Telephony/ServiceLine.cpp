@@ -1,0 +1,12 @@
+#include "Telephony/ServiceLine.h"
+
+#include <cstdio>
+
+namespace spectrel {
+
+void tell(const std::string& line)
+{
+    std::fprintf(stderr, "spectrel-telephonyd: %s\n", line.c_str());
+}
+
+} // namespace spectrel

@@ -1,0 +1,174 @@
+#include "Telephony/Simulator/CDMA/CDMAWorld.h"
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+
+namespace spectrel {
+
+namespace {
+
+using namespace std::chrono_literals;
+
+constexpr std::size_t Sites = 12;
+constexpr double SiteDistance = 550; // metres
+constexpr double SectorPower = 27; // dBm, antenna gains and what the car takes included
+constexpr double Noise = -105; // dBm in 1.23 MHz, the receiver's own included
+constexpr double Hysteresis = 2; // by which a pilot must be better to serve: 3 dB
+
+// The active set (3GPP2 C.S0005, pilot set maintenance), by pilots' shares of the received power.
+constexpr double AddShare = 0.2; // T_ADD, -14 dB of a pilot that is a fifth of its sector's power
+constexpr double DropShare = 0.126; // T_DROP, -16 dB
+constexpr std::chrono::milliseconds DropTime = 4s; // T_TDROP
+constexpr std::size_t LargestActiveSet = 6;
+
+/// What the phone does, and until when in each round.
+struct Phase {
+    std::chrono::milliseconds end;
+    CDMAWorld::Activity activity;
+};
+
+constexpr std::array<Phase, 6> Phases {{
+    {10s, CDMAWorld::Activity::Idle},
+    {11s, CDMAWorld::Activity::DataSetup},
+    {66s, CDMAWorld::Activity::Data},
+    {72s, CDMAWorld::Activity::Idle},
+    {114s, CDMAWorld::Activity::Voice},
+    {120s, CDMAWorld::Activity::Idle},
+}};
+constexpr std::chrono::milliseconds Round = Phases.back().end;
+
+double milliwatts(double decibels)
+{
+    return std::pow(10, decibels / 10);
+}
+
+double inDecibels(double ratio)
+{
+    return 10 * std::log10(ratio);
+}
+
+CDMASector sectorOf(std::size_t site)
+{
+    CDMASector sector;
+    sector.pn = static_cast<std::uint16_t>(4 * ((11 + site * 37) % 128)); // neighbours far apart, PN_INC 4
+    sector.isHome = site < Sites / 2;
+    sector.systemId = sector.isHome ? 16420 : 16422;
+    sector.networkId = static_cast<std::uint16_t>(1 + site / 4);
+    sector.baseId = static_cast<std::uint16_t>(1601 + 16 * site);
+    sector.packetZone = sector.isHome ? 7 : 8;
+    return sector;
+}
+
+} // namespace
+
+CDMAWorld::CDMAWorld(Scene scene, std::uint32_t seed)
+    : _dice(seed)
+    , _road(scene, Sites, SiteDistance, _dice)
+    , _secondAntenna(_dice)
+{
+    for (std::size_t site = 0; site < Sites; ++site)
+        _sectors.push_back(sectorOf(site));
+    measure();
+    reselect();
+    maintainActiveSet({});
+}
+
+void CDMAWorld::advance(std::chrono::milliseconds step)
+{
+    _elapsed += step;
+    _road.advance(step, _dice);
+    _secondAntenna.advance(step, _dice);
+    measure();
+    reselect();
+    maintainActiveSet(step);
+    // The weaker the pilots, the less power control can hold the one broken frame in a hundred.
+    const double active = inDecibels(shareOf(serving()));
+    _isFrameBad = _dice.between(0, 1) < 0.01 + std::max(0.0, -4 - active) * 0.02;
+    if (activity() == Activity::Data)
+        _counters.advance(step, inDecibels(servingSignal()), transmitted(), _dice);
+    if (_elapsed % 1s == 0s) {
+        _second = static_cast<std::uint32_t>(_elapsed / 1s);
+        _atSecond = _counters;
+    }
+}
+
+void CDMAWorld::measure()
+{
+    _total = milliwatts(Noise);
+    for (std::size_t mast = 0; mast < _sectors.size(); ++mast) {
+        _sectors[mast].power = milliwatts(SectorPower - _road.loss(mast));
+        _total += _sectors[mast].power;
+    }
+}
+
+void CDMAWorld::reselect()
+{
+    const auto best =
+        static_cast<std::size_t>(std::ranges::max_element(_sectors, {}, &CDMASector::power) - _sectors.begin());
+    if (_sectors[best].power > Hysteresis * _sectors[_serving].power)
+        _serving = best;
+}
+
+void CDMAWorld::maintainActiveSet(std::chrono::milliseconds step)
+{
+    auto size = static_cast<std::size_t>(std::ranges::count(_sectors, true, &CDMASector::isActive));
+    for (CDMASector& sector : _sectors) {
+        const double share = shareOf(sector);
+        sector.weakFor = share < DropShare ? sector.weakFor + step : 0ms;
+        const bool isDropped = sector.isActive && sector.weakFor >= DropTime;
+        const bool isAdded = !sector.isActive && share > AddShare && size < LargestActiveSet;
+        if (isDropped || isAdded) {
+            sector.isActive = isAdded;
+            size += isAdded ? 1 : -1;
+        }
+    }
+}
+
+CDMAWorld::Activity CDMAWorld::activity() const
+{
+    const auto now = _elapsed % Round;
+    return std::ranges::find_if(Phases, [now](const Phase& phase) { return now < phase.end; })->activity;
+}
+
+bool CDMAWorld::isAwake() const
+{
+    return _elapsed % 5s < 1s;
+}
+
+std::vector<CDMAPilot> CDMAWorld::activePilots() const
+{
+    std::vector<CDMAPilot> pilots {{serving().pn, shareOf(serving())}};
+    if (activity() == Activity::Idle)
+        return pilots;
+    for (const CDMASector& sector : _sectors) {
+        if (sector.isActive && sector.pn != serving().pn)
+            pilots.push_back({sector.pn, shareOf(sector)});
+    }
+    pilots.resize(std::min(pilots.size(), LargestActiveSet), pilots.front());
+    return pilots;
+}
+
+double CDMAWorld::received() const
+{
+    return inDecibels(_total);
+}
+
+double CDMAWorld::receivedBySecond() const
+{
+    return received() - 1 + _secondAntenna.decibels() / 2;
+}
+
+double CDMAWorld::transmitted() const
+{
+    constexpr double OpenLoop = -76; // dB: sum of received and transmitted power (3GPP2 C.S0011, band class 1)
+    return std::clamp(OpenLoop - received(), -50.0, 23.0);
+}
+
+double CDMAWorld::servingSignal() const
+{
+    constexpr double OwnNoise = 0.02; // of the pilot's power, by filters and echoes: 17 dB at best
+    return serving().power / (_total - (1 - OwnNoise) * serving().power);
+}
+
+} // namespace spectrel

@@ -1,0 +1,98 @@
+#include "Telephony/Simulator/IFX/IFXWorld.h"
+
+#include <algorithm>
+
+namespace spectrel {
+
+namespace {
+
+using namespace std::chrono_literals;
+
+constexpr std::size_t Sites = 10;
+constexpr double SiteDistance = 700; // metres
+constexpr double CellPower = 33; // dBm; the path loss at 900 MHz is some 10 dB below that of the formula
+constexpr double Hysteresis = 4; // dB by which a cell must be better
+constexpr double Sensitivity = -104; // dBm
+
+constexpr std::chrono::milliseconds Round = 120s;
+constexpr std::chrono::milliseconds CallStart = 30s; // in each round
+constexpr std::chrono::milliseconds CallEnd = 85s;
+
+} // namespace
+
+IFXWorld::IFXWorld(Scene scene, std::uint32_t seed)
+    : _dice(seed)
+    , _road(scene, Sites, SiteDistance, _dice)
+{
+    for (std::size_t site = 0; site < Sites; ++site) {
+        IFXCell cell;
+        cell.channel = static_cast<std::uint16_t>(12 + site * 47 % 100); // neighbours far apart
+        cell.networkColour = 3;
+        cell.stationColour = static_cast<std::uint8_t>(_dice.below(8));
+        cell.locationArea = site < Sites / 2 ? 1201 : 1202;
+        cell.routingArea = site < Sites / 2 ? 1 : 2;
+        cell.identity = static_cast<std::uint16_t>(20010 + 10 * site);
+        _cells.push_back(cell);
+    }
+    measure();
+    _serving = strongest();
+}
+
+void IFXWorld::advance(std::chrono::milliseconds step)
+{
+    const double seconds = std::chrono::duration<double>(step).count();
+    _elapsed += step;
+    _road.advance(step, _dice);
+    measure();
+    if (const std::size_t best = strongest(); _cells[best].level > serving().level + Hysteresis) {
+        _serving = best;
+        ++_cellsVisited;
+    }
+    const double margin = serving().level - Sensitivity;
+    _quality = static_cast<unsigned>(std::clamp((20 - margin) / 3 + _dice.between(-0.5, 1), 0.0, 7.0));
+    if (!isTalking()) { // one at a time: class B
+        _received += 25'000 * seconds * _dice.between(0, 1);
+        _sent += 4'000 * seconds * _dice.between(0, 1);
+    }
+}
+
+void IFXWorld::measure()
+{
+    for (std::size_t mast = 0; mast < _cells.size(); ++mast)
+        _cells[mast].level = std::clamp(CellPower - _road.loss(mast), -110.0, -48.0);
+}
+
+std::size_t IFXWorld::strongest() const
+{
+    return static_cast<std::size_t>(std::ranges::max_element(_cells, {}, &IFXCell::level) - _cells.begin());
+}
+
+std::vector<const IFXCell*> IFXWorld::neighbours(std::size_t atMost) const
+{
+    std::vector<const IFXCell*> others;
+    for (const IFXCell& cell : _cells) {
+        if (&cell != &serving() && cell.level > Sensitivity)
+            others.push_back(&cell);
+    }
+    std::ranges::stable_sort(others, std::ranges::greater(), &IFXCell::level);
+    others.resize(std::min(others.size(), atMost));
+    return others;
+}
+
+bool IFXWorld::isTalking() const
+{
+    const auto now = _elapsed % Round;
+    return now >= CallStart && now < CallEnd;
+}
+
+std::chrono::seconds IFXWorld::talkingFor() const
+{
+    return isTalking() ? std::chrono::duration_cast<std::chrono::seconds>(_elapsed % Round - CallStart) : 0s;
+}
+
+unsigned IFXWorld::timingAdvance() const
+{
+    return static_cast<unsigned>(std::clamp(_road.distance(_serving) / 554, 0.0, 63.0));
+}
+
+} // namespace spectrel

@@ -1,0 +1,191 @@
+#include "Telephony/Simulator/LTE/LTEIdleMode.h"
+
+#include <algorithm>
+
+namespace spectrel {
+
+namespace {
+
+constexpr int PhonePower = 23; // dBm, power class 3 (3GPP TS 36.101, table 6.2.2-1)
+constexpr double Audible = -24; // dB of RSRQ
+constexpr unsigned LargestCycleCount = 63; // the record's field has six bits
+constexpr std::size_t NeighboursTold = 32;
+
+/// The second antenna's path is a little longer.
+constexpr std::uint32_t SecondAntennaDelay = 2; // samples
+
+LTEIdleNeighbour neighbourReport(const LTECell& cell)
+{
+    LTEIdleNeighbour report;
+    report.physicalCellId = cell.physicalCellId;
+    report.measured = cell.measured;
+    report.average = cell.average;
+    report.receiveLevel = cell.receiveLevel();
+    report.frequencyOffset = cell.frequencyOffset;
+    report.antennas[0] = {cell.frameOffset, cell.sampleOffset};
+    report.antennas[1] = {cell.frameOffset, cell.sampleOffset + SecondAntennaDelay};
+    return report;
+}
+
+} // namespace
+
+LTEIdleMode::LTEIdleMode(const LTERoad& road)
+    : _road(road)
+    , _candidateFor(road.cells().size())
+{
+}
+
+void LTEIdleMode::start(std::size_t serving)
+{
+    _serving = serving;
+    _report = {};
+    std::ranges::fill(_candidateFor, std::chrono::milliseconds::zero());
+    judgeServing();
+    judgeOthers();
+}
+
+std::optional<std::size_t> LTEIdleMode::cycle()
+{
+    ++_turn;
+    judgeServing();
+    judgeOthers();
+    if (_report.cyclesBelowZero >= CyclesUntilLost) {
+        if (const auto cell = strongestSuitable())
+            return cell;
+    }
+    return bestOf(ReselectionTime + Cycle); // seen at both ends of the time
+}
+
+void LTEIdleMode::judgeServing()
+{
+    using namespace LTEMeasurementRule;
+    const LTECell& cell = servingCell();
+    const LTELayer& layer = *cell.layer;
+    const int level = cell.receiveLevel();
+    std::uint8_t rules = 0;
+    if (!layer.intraSearch || level <= *layer.intraSearch)
+        rules |= SameCarrier;
+    if (!layer.nonIntraSearch || level <= *layer.nonIntraSearch)
+        rules |= LowerPriorities;
+    if (std::ranges::any_of(LTERoad::layers(), [&](const LTELayer& other) { return other.priority > layer.priority; }))
+        rules |= HigherPriorities;
+
+    const LTEServingReport last = _report;
+    _report.channel = cell.downlinkChannel;
+    _report.physicalCellId = cell.physicalCellId;
+    _report.priority = layer.priority;
+    _report.measured = cell.measured;
+    _report.average = cell.average;
+    _report.leastLevel = layer.leastLevel;
+    _report.greatestPower = layer.greatestPower;
+    _report.phonePower = PhonePower;
+    _report.receiveLevel = level;
+    _report.cyclesBelowZero = level < 0 ? std::min(last.cyclesBelowZero + 1, LargestCycleCount) : 0;
+    _report.intraSearch = layer.intraSearch;
+    _report.nonIntraSearch = layer.nonIntraSearch;
+    _report.areRulesUpdated = rules != last.rules;
+    _report.rules = rules;
+}
+
+void LTEIdleMode::judgeOthers()
+{
+    _candidates.clear();
+    for (std::size_t index = 0; index < _road.cells().size(); ++index) {
+        const LTECell& cell = _road.cells()[index];
+        if (index == _serving || !isCandidate(cell)) {
+            _candidateFor[index] = std::chrono::milliseconds::zero();
+            continue;
+        }
+        _candidateFor[index] += Cycle;
+        _candidates.push_back(
+            {ReselectionTechnology::LTE, cell.layer->priority, cell.downlinkChannel, cell.physicalCellId, cell.band});
+    }
+    for (const OtherCell& cell : _road.otherCells()) {
+        if (isCandidate(cell))
+            _candidates.push_back(cell.candidate);
+    }
+}
+
+bool LTEIdleMode::isCandidate(const LTECell& cell) const
+{
+    const LTELayer& from = *servingCell().layer;
+    const LTELayer& to = *cell.layer;
+    if (to.priority > from.priority)
+        return cell.receiveLevel() > to.highThreshold;
+    if (&to == &from)
+        return cell.receiveLevel() > 0 && cell.average.rsrp > servingCell().average.rsrp + Hysteresis;
+    return servingCell().receiveLevel() < from.servingLowThreshold && cell.receiveLevel() > to.lowThreshold;
+}
+
+bool LTEIdleMode::isCandidate(const OtherCell& cell) const
+{
+    constexpr int LowThreshold = 6; // dB
+    return servingCell().receiveLevel() < servingCell().layer->servingLowThreshold
+        && cell.receiveLevel() > LowThreshold;
+}
+
+std::optional<std::size_t> LTEIdleMode::bestOf(std::chrono::milliseconds atLeast) const
+{
+    std::optional<std::size_t> best;
+    const auto rank = [this](std::size_t index) {
+        const LTECell& cell = _road.cells()[index];
+        return std::pair(cell.layer->priority, cell.average.rsrp);
+    };
+    for (std::size_t index = 0; index < _candidateFor.size(); ++index) {
+        if (_candidateFor[index] >= atLeast && (!best || rank(index) > rank(*best)))
+            best = index;
+    }
+    return best;
+}
+
+std::optional<std::size_t> LTEIdleMode::strongestSuitable() const
+{
+    std::optional<std::size_t> best;
+    for (std::size_t index = 0; index < _road.cells().size(); ++index) {
+        const LTECell& cell = _road.cells()[index];
+        if (cell.receiveLevel() > 0 && (!best || cell.average.rsrp > _road.cells()[*best].average.rsrp))
+            best = index;
+    }
+    return best;
+}
+
+std::vector<const LTELayer*> LTEIdleMode::carriersToMeasure() const
+{
+    using namespace LTEMeasurementRule;
+    const LTELayer& own = *servingCell().layer;
+    std::vector<const LTELayer*> carriers;
+    for (const LTELayer& layer : LTERoad::layers()) {
+        const std::uint8_t rule = &layer == &own ? SameCarrier
+            : layer.priority > own.priority      ? HigherPriorities
+                                                 : LowerPriorities;
+        if (_report.rules & rule)
+            carriers.push_back(&layer);
+    }
+    return carriers;
+}
+
+LTENeighbourReport LTEIdleMode::neighbours() const
+{
+    const auto carriers = carriersToMeasure();
+    if (carriers.empty())
+        return {};
+    const LTELayer& carrier = *carriers[_turn % carriers.size()];
+    LTENeighbourReport report {carrier.downlinkChannel, carrier.leastLevel, {}};
+    for (const LTECell& cell : _road.cells()) {
+        if (cell.layer == &carrier && &cell != &servingCell() && cell.average.rsrq > Audible)
+            report.neighbours.push_back(neighbourReport(cell));
+    }
+    std::ranges::sort(report.neighbours, [](const auto& a, const auto& b) { return a.average.rsrp > b.average.rsrp; });
+    report.neighbours.resize(std::min(report.neighbours.size(), NeighboursTold));
+    return report;
+}
+
+ReselectionReport LTEIdleMode::candidate() const
+{
+    ReselectionReport report {_report.channel, _report.physicalCellId, {}};
+    if (!_candidates.empty())
+        report.candidates.push_back(_candidates[_turn % _candidates.size()]);
+    return report;
+}
+
+} // namespace spectrel

@@ -1,0 +1,129 @@
+#include "Telephony/Simulator/LTE/LTEWorld.h"
+
+#include <algorithm>
+
+namespace spectrel {
+
+namespace {
+
+constexpr double Offset = 3; // dB by which a cell must be stronger to be handed over to, event A3...
+constexpr std::chrono::milliseconds TimeToTrigger {640}; // ... for this long (3GPP TS 36.331, TimeToTrigger)
+constexpr double ConnectionLost = -127; // dBm of RSRP
+constexpr double Measurable = -19; // dB of RSRQ; of weaker cells the phone knows no more than that they are there
+constexpr double Audible = -25; // dB of RSRQ
+constexpr std::size_t MeasuredTold = 8;
+
+bool isStronger(const LTECell* a, const LTECell* b)
+{
+    return a->average.rsrp > b->average.rsrp;
+}
+
+} // namespace
+
+LTEWorld::LTEWorld(Scene scene, std::uint32_t seed)
+    : _dice(seed)
+    , _journey(scene, LTERoad::Length, _dice)
+    , _road(_dice)
+    , _connection({12, 30}, {20, 50}, {6, 10}, _dice)
+{
+    _road.advance(std::chrono::milliseconds::zero(), _journey, _dice);
+    _serving = strongest();
+    _idleMode.start(_serving);
+}
+
+void LTEWorld::advance(std::chrono::milliseconds step)
+{
+    _elapsed += step;
+    _journey.advance(step, _dice);
+    _road.advance(step, _journey, _dice);
+    const bool wasConnected = isConnected();
+    _connection.advance(step, _dice);
+    if (!_connection.isOn())
+        _hasLostConnection = false;
+    if (isConnected())
+        advanceConnection(step);
+    if (!isConnected())
+        advanceIdle(wasConnected);
+}
+
+void LTEWorld::advanceIdle(bool hasJustBecomeIdle)
+{
+    if (hasJustBecomeIdle)
+        _idleMode.start(_serving);
+    if (_elapsed % LTEIdleMode::Cycle != std::chrono::milliseconds::zero())
+        return;
+    if (const auto cell = _idleMode.cycle(); cell && *cell != _serving) {
+        _serving = *cell;
+        _idleMode.start(_serving);
+    }
+}
+
+void LTEWorld::advanceConnection(std::chrono::milliseconds step)
+{
+    handOver(step);
+    _hasLostConnection = servingCell().average.rsrp < ConnectionLost;
+    if (_hasLostConnection)
+        return;
+    _subframe = static_cast<std::uint8_t>(_dice.below(10));
+    transfer(step);
+}
+
+void LTEWorld::handOver(std::chrono::milliseconds step)
+{
+    const std::size_t best = strongest();
+    if (best == _serving || _road.cells()[best].average.rsrp < servingCell().average.rsrp + Offset) {
+        _targetFor = {};
+        return;
+    }
+    _targetFor = best == _target ? _targetFor + step : step;
+    _target = best;
+    if (_targetFor >= TimeToTrigger) {
+        _serving = best;
+        _targetFor = {};
+    }
+}
+
+void LTEWorld::transfer(std::chrono::milliseconds step)
+{
+    const double seconds = std::chrono::duration<double>(step).count();
+    const double quality = std::clamp((servingCell().average.rsrp + 115) / 45, 0.02, 1.0);
+    _received += 2.5e6 * quality * seconds * _dice.between(0.2, 1);
+    _sent += 2.0e5 * quality * seconds * _dice.between(0.2, 1);
+}
+
+std::size_t LTEWorld::strongest() const
+{
+    const auto& cells = _road.cells();
+    const auto best = std::ranges::max_element(
+        cells, [](const LTECell& a, const LTECell& b) { return a.average.rsrp < b.average.rsrp; });
+    return static_cast<std::size_t>(best - cells.begin());
+}
+
+LTEConnectedReport LTEWorld::connectedReport() const
+{
+    const LTECell& serving = servingCell();
+    LTEConnectedReport report {serving.downlinkChannel, serving.physicalCellId, _subframe, serving.average, {}, {}};
+    for (const LTECell* cell : neighbours(_road.cells().size())) {
+        if (cell->layer != serving.layer || cell->average.rsrq < Audible)
+            continue;
+        if (cell->average.rsrq >= Measurable && report.measured.size() < MeasuredTold)
+            report.measured.push_back({cell->physicalCellId, cell->average});
+        else
+            report.detected.push_back(cell->physicalCellId);
+    }
+    return report;
+}
+
+std::vector<const LTECell*> LTEWorld::neighbours(std::size_t atMost) const
+{
+    std::vector<const LTECell*> others;
+    for (const LTECell& cell : _road.cells()) {
+        if (&cell != &servingCell())
+            others.push_back(&cell);
+    }
+    std::ranges::sort(others, isStronger);
+    others.resize(std::min(others.size(), atMost));
+    return others;
+}
+
+} // namespace spectrel

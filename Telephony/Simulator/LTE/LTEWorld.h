@@ -1,0 +1,77 @@
+#pragma once
+
+#include "Telephony/Reports/LTECell.h"
+#include "Telephony/Reports/LTEReports.h"
+#include "Telephony/Simulator/LTE/LTEIdleMode.h"
+#include "Telephony/Simulator/LTE/LTERoad.h"
+#include "Telephony/Simulator/Radio.h"
+#include "Telephony/Simulator/Usage.h"
+
+#include <chrono>
+#include <cstdint>
+#include <vector>
+
+namespace spectrel {
+
+/// A phone that is driven along a road past LTE sites: who serves it, what else it hears, what it has transferred.
+///
+/// It is idle and connected by turns: idle it reselects cells as `LTEIdleMode` tells, connected the network hands it
+/// over to a cell that is stronger for a while. The same seed gives the same drive.
+class LTEWorld {
+public:
+    LTEWorld(Scene scene, std::uint32_t seed);
+
+    void advance(std::chrono::milliseconds step);
+
+    bool isConnected() const
+    {
+        return _connection.isOn() && !_hasLostConnection;
+    }
+    const LTECell& servingCell() const
+    {
+        return _road.cells()[_serving];
+    }
+    const LTERoad& road() const
+    {
+        return _road;
+    }
+    /// Idle mode's findings; of the last time when the phone is connected.
+    const LTEIdleMode& idleMode() const
+    {
+        return _idleMode;
+    }
+    LTEConnectedReport connectedReport() const;
+    /// The strongest other cells, strongest first.
+    std::vector<const LTECell*> neighbours(std::size_t atMost) const;
+    std::uint64_t bytesReceived() const
+    {
+        return static_cast<std::uint64_t>(_received);
+    }
+    std::uint64_t bytesSent() const
+    {
+        return static_cast<std::uint64_t>(_sent);
+    }
+
+private:
+    void advanceIdle(bool hasJustBecomeIdle);
+    void advanceConnection(std::chrono::milliseconds step);
+    void handOver(std::chrono::milliseconds step);
+    void transfer(std::chrono::milliseconds step);
+    std::size_t strongest() const;
+
+    Dice _dice;
+    Journey _journey;
+    LTERoad _road;
+    std::size_t _serving = 0;
+    LTEIdleMode _idleMode {_road};
+    Habit _connection;
+    bool _hasLostConnection = false; // until the habit's next turn
+    std::chrono::milliseconds _elapsed {0};
+    std::size_t _target = 0; // stronger than the serving cell
+    std::chrono::milliseconds _targetFor {0};
+    std::uint8_t _subframe = 0;
+    double _received = 0;
+    double _sent = 0;
+};
+
+} // namespace spectrel

@@ -1,0 +1,103 @@
+#include "Monitor/Viewing/OfflineSession.h"
+
+#include "Tests/Fakes/FakeResources.h"
+#include "Tests/Fakes/LogRecorder.h"
+#include "Tests/Fakes/RecordBuilder.h"
+#include "Tests/Fakes/ScratchFolder.h"
+#include "Values/PropertyList/PropertyList.h"
+
+#include <cstdlib>
+#include <filesystem>
+#include <gtest/gtest.h>
+
+namespace spectrel {
+namespace {
+
+using namespace std::chrono_literals;
+
+class OfflineSessionTest : public testing::Test {
+protected:
+    OfflineSessionTest()
+    {
+        resources.lists["LTE"] = Dictionary::make({{"Serving Cell Info", Dictionary::make()}});
+        session.useTechnology(Technology::LTE);
+    }
+    void applyAt(std::chrono::milliseconds offset)
+    {
+        session.apply({Start + offset, record});
+    }
+    /// How many messages each history entry of the saved snapshot holds, and when it was made.
+    std::string history()
+    {
+        std::string reason;
+        EXPECT_TRUE(session.saveSnapshot(folder, reason)) << reason;
+        std::string text;
+        for (const auto& file : std::filesystem::directory_iterator(folder)) {
+            const auto snapshot = readPropertyListFile(file.path().string());
+            for (const Value& entry : (*snapshot->dictionary())["Data"].list()->elements()) {
+                const Dictionary& fields = *entry.dictionary();
+                if (const auto& raw = fields["DisplayState"].data())
+                    text += std::to_string(raw->size() / record.size()) + "@" + fields["Date"].string()->substr(17, 2)
+                        + " ";
+            }
+        }
+        return text;
+    }
+
+    static constexpr Moment Start {std::chrono::seconds(1'700'000'000 - 1'700'000'000 % 60)};
+    const Bytes record = RecordBuilder(0xB0C2, 38).bytes();
+    LogRecorder log;
+    FakeResources resources;
+    const ScratchFolder scratch;
+    const std::string folder = scratch.path().string();
+    OfflineSession session {true};
+};
+
+TEST_F(OfflineSessionTest, MessageAtTheVeryTimeOfATickComesBeforeIt)
+{
+    for (const auto offset : {0ms, 1999ms, 2000ms, 2001ms})
+        applyAt(offset);
+    EXPECT_EQ(history(), "3@02 1@02 ");
+}
+
+TEST_F(OfflineSessionTest, IdleTicksAddNothing)
+{
+    applyAt(0ms);
+    applyAt(30s);
+    EXPECT_EQ(history(), "1@02 1@30 ");
+}
+
+TEST_F(OfflineSessionTest, FirstMessageIsRefreshedAtTheFirstTickAfterIt)
+{
+    applyAt(0ms);
+    applyAt(2001ms);
+    applyAt(5s);
+    EXPECT_EQ(history(), "1@02 1@04 1@05 ");
+}
+
+TEST_F(OfflineSessionTest, TimeThatRunsBackwardsStandsStill)
+{
+    applyAt(3s);
+    applyAt(0ms);
+    EXPECT_EQ(history(), "2@03 ");
+}
+
+TEST_F(OfflineSessionTest, RecordingOfAnotherTechnologyReplacesTheDisplayAndKeepsTheHistory)
+{
+    applyAt(0ms);
+    resources.lists["ZPH_GSM"] = Dictionary::make({{"SIM Info", Dictionary::make()}});
+    session.useTechnology(Technology::GSM);
+    EXPECT_TRUE(session.display().isAbsent());
+    applyAt(1s);
+    EXPECT_EQ(history(), "1@00 1@01 ");
+}
+
+TEST_F(OfflineSessionTest, NothingToSaveIsSaid)
+{
+    std::string reason;
+    EXPECT_FALSE(session.saveSnapshot(folder, reason));
+    EXPECT_EQ(reason, "there is no message to save");
+}
+
+} // namespace
+} // namespace spectrel

@@ -1,0 +1,169 @@
+#include "Telephony/Simulator/CDMA/CDMAWorld.h"
+
+#include <algorithm>
+#include <gtest/gtest.h>
+#include <set>
+#include <string>
+
+namespace spectrel {
+namespace {
+
+using namespace std::chrono_literals;
+using Activity = CDMAWorld::Activity;
+
+constexpr int FiveMinutes = 3000; // steps
+
+/// Calls `look` after every step of a drive.
+template <typename Look> void drive(Scene scene, std::uint32_t seed, int steps, Look look)
+{
+    CDMAWorld world(scene, seed);
+    for (int step = 0; step < steps; ++step) {
+        world.advance(100ms);
+        look(world);
+    }
+}
+
+std::string diary(std::uint32_t seed)
+{
+    std::string text;
+    drive(Scene::Drive, seed, 600, [&text](const CDMAWorld& world) {
+        text += std::to_string(world.serving().pn) + " " + std::to_string(world.received()) + " "
+            + std::to_string(world.countersAtSecond().forwardBits()) + "\n";
+    });
+    return text;
+}
+
+TEST(CDMAWorldTest, SameSeedGivesTheSameDrive)
+{
+    EXPECT_EQ(diary(7), diary(7));
+    EXPECT_NE(diary(7), diary(8));
+}
+
+TEST(CDMAWorldTest, DrivePassesSeveralSitesAndDoesEverything)
+{
+    std::set<std::uint16_t> pilots;
+    std::set<Activity> activities;
+    std::size_t largestActiveSet = 0;
+    drive(Scene::Drive, 1, FiveMinutes, [&](const CDMAWorld& world) {
+        pilots.insert(world.serving().pn);
+        activities.insert(world.activity());
+        largestActiveSet = std::max(largestActiveSet, world.activePilots().size());
+    });
+    EXPECT_GE(pilots.size(), 4u);
+    EXPECT_EQ(activities.size(), 4u);
+    EXPECT_GE(largestActiveSet, 2u) << "soft handoff";
+}
+
+TEST(CDMAWorldTest, StandingStillKeepsTheSite)
+{
+    std::set<std::uint16_t> pilots;
+    drive(Scene::Still, 1, 600, [&](const CDMAWorld& world) { pilots.insert(world.serving().pn); });
+    EXPECT_LE(pilots.size(), 2u) << "shadowing alone may move it between two";
+}
+
+TEST(CDMAWorldTest, ValuesBelongTogether)
+{
+    for (const Scene scene : {Scene::Walk, Scene::Drive, Scene::Stress}) {
+        drive(scene, 3, FiveMinutes, [](const CDMAWorld& world) {
+            const auto pilots = world.activePilots();
+            ASSERT_GE(pilots.size(), 1u);
+            ASSERT_LE(pilots.size(), 6u);
+            EXPECT_EQ(pilots.front().pn, world.serving().pn);
+            double shares = 0;
+            std::set<std::uint16_t> different;
+            for (const CDMAPilot& pilot : pilots) {
+                EXPECT_LT(pilot.pn, 512);
+                different.insert(pilot.pn);
+                shares += pilot.share;
+            }
+            EXPECT_LT(shares, 1);
+            EXPECT_EQ(different.size(), pilots.size());
+            EXPECT_GT(world.received(), -105);
+            EXPECT_LT(world.received(), -25);
+            EXPECT_GE(world.transmitted(), -50);
+            EXPECT_LE(world.transmitted(), 23);
+        });
+    }
+}
+
+TEST(CDMAWorldTest, IdlePhoneHearsOnlyItsOwnPilot)
+{
+    drive(Scene::Drive, 1, FiveMinutes, [](const CDMAWorld& world) {
+        if (world.activity() == Activity::Idle) {
+            EXPECT_EQ(world.activePilots().size(), 1u);
+        }
+    });
+}
+
+TEST(CDMAWorldTest, CountersMoveOnceASecondAndOnlyWithData)
+{
+    std::uint32_t second = 0;
+    std::uint64_t bits = 0;
+    bool wasMovingData = false;
+    drive(Scene::Drive, 1, FiveMinutes, [&](const CDMAWorld& world) {
+        const bool hasNewCount = world.countersAtSecond().forwardBits() != bits;
+        if (world.second() == second) {
+            EXPECT_FALSE(hasNewCount);
+        } else {
+            EXPECT_EQ(world.second(), second + 1);
+            EXPECT_TRUE(!hasNewCount || wasMovingData || world.activity() == Activity::Data);
+        }
+        wasMovingData = world.activity() == Activity::Data;
+        second = world.second();
+        bits = world.countersAtSecond().forwardBits();
+    });
+    EXPECT_GT(bits, 50'000'000u) << "in two and a half sessions";
+}
+
+TEST(CDMAWorldTest, SomeFramesOfACallAreBadAndMostAreGood)
+{
+    int frames = 0;
+    int bad = 0;
+    drive(Scene::Drive, 1, FiveMinutes, [&](const CDMAWorld& world) {
+        frames += world.activity() == Activity::Voice;
+        bad += world.activity() == Activity::Voice && world.isFrameBad();
+    });
+    EXPECT_GT(bad, 0);
+    EXPECT_LT(bad * 20, frames);
+}
+
+TEST(EVDOCountersTest, BitsAreThoseOfThePackets)
+{
+    Dice dice(5);
+    EVDOCounters counters;
+    for (int step = 0; step < 1000; ++step)
+        counters.advance(100ms, dice.between(-18, 15), dice.between(-40, 23), dice);
+    std::uint64_t forward = 0;
+    for (std::size_t format = 0; format < ForwardFormats.size(); ++format)
+        forward += std::uint64_t(counters.forward()[format]) * ForwardFormats[format].bits;
+    EXPECT_EQ(forward, counters.forwardBits());
+    std::uint64_t reverse = 0;
+    for (std::size_t interlace = 0; interlace < EVDOCounters::Interlaces; ++interlace) {
+        for (std::size_t mode = 0; mode < EVDOCounters::Modes; ++mode) {
+            for (std::size_t payload = 0; payload < ReversePayloads.size(); ++payload) {
+                for (const std::uint32_t arrived : counters.reverse(interlace, mode, payload).arrived)
+                    reverse += std::uint64_t(arrived) * ReversePayloads[payload];
+            }
+        }
+    }
+    EXPECT_EQ(reverse, counters.reverseBits());
+}
+
+TEST(EVDOCountersTest, BetterSignalCarriesMore)
+{
+    const auto carried = [](double signal, double power) {
+        Dice dice(5);
+        EVDOCounters counters;
+        for (int step = 0; step < 100; ++step)
+            counters.advance(100ms, signal, power, dice);
+        return std::pair(counters.forwardBits(), counters.reverseBits());
+    };
+    EXPECT_GT(carried(12, -10).first, 3 * carried(0, -10).first);
+    EXPECT_GT(carried(0, -10).first, 3 * carried(-10, -10).first);
+    EXPECT_GT(carried(-20, -10).first, 0u) << "the lowest rate always works";
+    EXPECT_LE(carried(12, -10).first, 10u * 3'072'000) << "ten seconds at the highest rate";
+    EXPECT_GT(carried(0, -10).second, 3 * carried(0, 20).second);
+}
+
+} // namespace
+} // namespace spectrel

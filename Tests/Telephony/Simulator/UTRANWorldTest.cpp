@@ -1,0 +1,237 @@
+#include "Telephony/Simulator/UTRAN/UTRANWorld.h"
+
+#include <algorithm>
+#include <gtest/gtest.h>
+#include <set>
+#include <string>
+
+namespace spectrel {
+namespace {
+
+using namespace std::chrono_literals;
+
+constexpr int Drive = 6000; // steps, ten minutes
+
+std::string drive(Scene scene, std::uint32_t seed)
+{
+    UTRANWorld world(scene, seed);
+    std::string text;
+    for (int step = 0; step < 1200; ++step) {
+        world.advance(100ms);
+        text += std::to_string(world.servingCell().rscp) + " " + std::to_string(world.bytesReceived()) + "\n";
+    }
+    return text;
+}
+
+TEST(UTRANWorldTest, SameSeedGivesTheSameDrive)
+{
+    EXPECT_EQ(drive(Scene::Drive, 7), drive(Scene::Drive, 7));
+    EXPECT_NE(drive(Scene::Drive, 7), drive(Scene::Drive, 8));
+    EXPECT_NE(drive(Scene::Drive, 7), drive(Scene::Still, 7));
+}
+
+TEST(UTRANWorldTest, ConnectionPassesThroughEveryMode)
+{
+    UTRANWorld world(Scene::Drive, 1);
+    std::set<RRCMode> modes;
+    for (int step = 0; step < Drive; ++step) {
+        world.advance(100ms);
+        modes.insert(world.mode());
+    }
+    EXPECT_EQ(modes.size(), 6u);
+}
+
+TEST(UTRANWorldTest, PhoneMovesByTheRankingOnly)
+{
+    UTRANWorld world(Scene::Drive, 2);
+    int moves = 0;
+    for (int step = 0; step < Drive; ++step) {
+        const UTRANCell& last = world.servingCell();
+        const RRCMode mode = world.mode();
+        world.advance(100ms);
+        if (&world.servingCell() == &last)
+            continue;
+        ++moves;
+        EXPECT_GT(world.servingCell().rscp, last.rscp + UTRANThresholds::Hysteresis);
+        EXPECT_GT(world.servingCell().rscp, UTRANThresholds::LeastRSCP);
+        if (mode != RRCMode::CellDCH && world.servingCell().channel != last.channel) {
+            EXPECT_LE(last.rscp - UTRANThresholds::LeastRSCP, UTRANThresholds::SearchBelow);
+        }
+    }
+    EXPECT_GE(moves, 10);
+}
+
+/// The told cells beside the serving one.
+std::vector<UTRANNeighbour> others(const UTRANWorld& world)
+{
+    auto told = world.neighbours();
+    std::erase_if(told, [](const UTRANNeighbour& cell) { return cell.set == UTRANCellSet::Active; });
+    return told;
+}
+
+bool hasOtherChannel(const UTRANWorld& world)
+{
+    return std::ranges::any_of(
+        others(world), [&world](const UTRANNeighbour& cell) { return cell.channel != world.servingCell().channel; });
+}
+
+TEST(UTRANWorldTest, IdlePhoneMeasuresItsOwnChannelUnderTheMastToo)
+{
+    UTRANWorld world(Scene::Drive, 1);
+    int near = 0;
+    int withNeighbours = 0;
+    for (int step = 0; step < Drive; ++step) {
+        world.advance(100ms);
+        if (world.mode() == RRCMode::CellDCH || world.receiveLevel() <= UTRANThresholds::SearchBelow)
+            continue;
+        ++near;
+        withNeighbours += others(world).empty() ? 0 : 1;
+        EXPECT_FALSE(hasOtherChannel(world)) << "those wait until the serving cell has fallen";
+    }
+    EXPECT_GT(near, 100);
+    EXPECT_GT(withNeighbours, near / 2);
+}
+
+TEST(UTRANWorldTest, OtherChannelsAreMeasuredOnceTheServingCellHasFallenOrOnADedicatedChannel)
+{
+    UTRANWorld world(Scene::Drive, 1);
+    int fallen = 0;
+    int dedicated = 0;
+    for (int step = 0; step < Drive; ++step) {
+        world.advance(100ms);
+        if (!hasOtherChannel(world))
+            continue;
+        const bool hasFallen = world.receiveLevel() <= UTRANThresholds::SearchBelow;
+        fallen += hasFallen && world.mode() != RRCMode::CellDCH ? 1 : 0;
+        dedicated += !hasFallen ? 1 : 0;
+        EXPECT_TRUE(hasFallen || world.mode() == RRCMode::CellDCH);
+    }
+    EXPECT_GT(fallen, 100);
+    EXPECT_GT(dedicated, 100);
+}
+
+TEST(UTRANWorldTest, CellsAreDetectedOnTheOwnChannelOfADedicatedOneOnly)
+{
+    UTRANWorld world(Scene::Drive, 1);
+    int detected = 0;
+    for (int step = 0; step < Drive; ++step) {
+        world.advance(100ms);
+        for (const UTRANNeighbour& cell : world.neighbours()) {
+            if (cell.set != UTRANCellSet::Detected)
+                continue;
+            ++detected;
+            EXPECT_EQ(world.mode(), RRCMode::CellDCH);
+            EXPECT_EQ(cell.channel, world.servingCell().channel);
+        }
+    }
+    EXPECT_GT(detected, 100);
+}
+
+TEST(UTRANWorldTest, ServingCellIsTheActiveSetOfADedicatedChannel)
+{
+    UTRANWorld world(Scene::Drive, 1);
+    for (int step = 0; step < Drive; ++step) {
+        world.advance(100ms);
+        const auto neighbours = world.neighbours();
+        const auto active = std::ranges::find(neighbours, UTRANCellSet::Active, &UTRANNeighbour::set);
+        ASSERT_EQ(active != neighbours.end(), world.mode() == RRCMode::CellDCH);
+        if (active != neighbours.end()) {
+            EXPECT_EQ(active->parameter, world.servingCell().parameter);
+        }
+    }
+}
+
+TEST(UTRANWorldTest, TransportChannelsBelongToDedicatedChannels)
+{
+    UTRANWorld world(Scene::Drive, 1);
+    int weak = 0;
+    for (int step = 0; step < Drive; ++step) {
+        world.advance(100ms);
+        const TransportReport report = world.transportChannels();
+        ASSERT_EQ(report.channels.empty(), world.mode() != RRCMode::CellDCH);
+        ASSERT_EQ(report.composites.empty(), report.channels.empty());
+        for (const CodedCompositeChannel& composite : report.composites) {
+            for (std::size_t slot = composite.slots; slot < composite.signalToInterference.size(); ++slot)
+                EXPECT_EQ(composite.signalToInterference[slot], 0);
+        }
+        for (const TransportChannel& channel : report.channels) {
+            EXPECT_LE(channel.blockErrors, 100);
+            weak += channel.blockErrors > 5 ? 1 : 0;
+        }
+    }
+    EXPECT_GT(weak, 0) << "somewhere the signal gets weak";
+}
+
+TEST(UTRANWorldTest, InTheValleyOnlyHelpCanBeCalled)
+{
+    UTRANWorld world(Scene::Drive, 1);
+    int without = 0;
+    for (int step = 0; step < Drive; ++step) {
+        world.advance(100ms);
+        if (world.isInService())
+            continue;
+        ++without;
+        EXPECT_EQ(world.mode(), RRCMode::Disconnected);
+        EXPECT_LE(world.servingCell().rscp, UTRANThresholds::LeastRSCP);
+    }
+    EXPECT_GT(without, 10);
+    EXPECT_LT(without, Drive / 4);
+}
+
+TEST(UTRANWorldTest, GSMCellsAreToldStrongestFirst)
+{
+    UTRANWorld world(Scene::Walk, 1);
+    world.advance(100ms);
+    const auto cells = world.gsmNeighbours();
+    ASSERT_FALSE(cells.empty());
+    EXPECT_TRUE(std::ranges::is_sorted(cells, std::ranges::greater(), &GSMNeighbour::rssi));
+    for (const GSMNeighbour& cell : cells) {
+        EXPECT_LT(cell.identity, 0x4000);
+        EXPECT_LT(cell.networkColour, 8);
+        EXPECT_LT(cell.stationColour, 8);
+    }
+}
+
+/// Advances until the mode is there, and tells how long that took.
+std::chrono::milliseconds until(RRCConnection& connection, RRCMode mode, bool isNeeded)
+{
+    std::chrono::milliseconds elapsed {0};
+    while (connection.mode() != mode && elapsed < 1min) {
+        connection.advance(100ms, isNeeded);
+        elapsed += 100ms;
+    }
+    return elapsed;
+}
+
+TEST(RRCConnectionTest, IsSetUpAndSteppedDown)
+{
+    RRCConnection connection;
+    EXPECT_EQ(until(connection, RRCMode::Connecting, true), 100ms);
+    EXPECT_EQ(until(connection, RRCMode::CellDCH, true), 900ms);
+    connection.advance(1min, true);
+    EXPECT_TRUE(connection.isOnDedicatedChannel()) << "for as long as it is needed";
+    EXPECT_EQ(until(connection, RRCMode::CellFACH, false), 3s);
+    EXPECT_EQ(until(connection, RRCMode::CellPCH, false), 5s);
+    EXPECT_EQ(until(connection, RRCMode::URAPCH, false), 8s);
+    EXPECT_EQ(until(connection, RRCMode::Disconnected, false), 10s);
+}
+
+TEST(RRCConnectionTest, ComesBackFromPagingThroughTheCommonChannel)
+{
+    RRCConnection connection;
+    until(connection, RRCMode::CellDCH, true);
+    until(connection, RRCMode::URAPCH, false);
+    EXPECT_EQ(until(connection, RRCMode::CellFACH, true), 100ms);
+    EXPECT_EQ(until(connection, RRCMode::CellDCH, true), 500ms);
+}
+
+TEST(RRCConnectionTest, LosesItsCellAtOnce)
+{
+    RRCConnection connection;
+    until(connection, RRCMode::CellDCH, true);
+    connection.lose();
+    EXPECT_EQ(connection.mode(), RRCMode::Disconnected);
+}
+
+} // namespace
+} // namespace spectrel
