@@ -8,7 +8,7 @@
 #include "Platform/Preferences.h"
 #include "Platform/Qt/QtClock.h"
 #include "Platform/Qt/QtRunLoop.h"
-#include "Tests/UI/FakeModel.h"
+#include "Tests/Fakes/FakeModel.h"
 #include "UI/Quick/QuickFrontEnd.h"
 #include "UI/SpectrelApp.h"
 #include "Values/Dictionary.h"

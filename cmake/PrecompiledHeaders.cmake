@@ -7,11 +7,10 @@ set(standard_headers
     <optional> <span> <string> <string_view> <utility> <variant> <vector>)
 
 function(spectrel_precompiled name)
-    cmake_parse_arguments(ARG "" "" "HEADERS;USES;DEFINITIONS" ${ARGN})
+    cmake_parse_arguments(ARG "" "" "HEADERS;USES" ${ARGN})
     file(CONFIGURE OUTPUT ${CMAKE_BINARY_DIR}/precompiled/${name}.cpp CONTENT "// Only its headers count.\n")
     add_library(${name} OBJECT ${CMAKE_BINARY_DIR}/precompiled/${name}.cpp)
     target_link_libraries(${name} PRIVATE spectrel_options ${ARG_USES})
-    target_compile_definitions(${name} PRIVATE ${ARG_DEFINITIONS})
     target_precompile_headers(${name} PRIVATE ${ARG_HEADERS})
 endfunction()
 
@@ -26,10 +25,7 @@ if(SPECTREL_PRECOMPILED_HEADERS)
 endif()
 if(BUILD_TESTING)
     find_package(GTest REQUIRED)
-    set(test_definitions
-        SPECTREL_SOURCE_DIR="${CMAKE_SOURCE_DIR}" SPECTREL_BIN_DIR="${CMAKE_RUNTIME_OUTPUT_DIRECTORY}")
     spectrel_precompiled(spectrel_precompiled_tests
         HEADERS ${standard_headers} <gmock/gmock.h> <gtest/gtest.h>
-        USES GTest::gmock GTest::gtest_main
-        DEFINITIONS ${test_definitions})
+        USES GTest::gmock GTest::gtest_main)
 endif()

@@ -8,8 +8,8 @@ spectrel_test(test_qt_platform
     USES spectrel_qt spectrel_syslog spectrel_fakes spectrel_port_fixtures Qt6::DBus)
 
 spectrel_test(test_message_ports
-    SOURCES AllocationTest.cpp ${CMAKE_SOURCE_DIR}/Tests/Fakes/CountedAllocations.cpp LocalPortTest.cpp PortFixture.h PortNameTest.cpp RemotePortTest.cpp WireTest.cpp
-    USES spectrel_qt spectrel_ports spectrel_fakes spectrel_port_fixtures)
+    SOURCES AllocationTest.cpp LocalPortTest.cpp PortFixture.h PortNameTest.cpp RemotePortTest.cpp WireTest.cpp
+    USES spectrel_qt spectrel_ports spectrel_fakes spectrel_port_fixtures spectrel_counted_allocations)
 
 spectrel_test(test_telephony_server
     SOURCES SocketTelephonyServerTest.cpp

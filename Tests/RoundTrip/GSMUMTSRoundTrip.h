@@ -5,6 +5,7 @@
 #include "Telephony/Simulator/GSMUMTS/GSMUMTSWorld.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/LogRecorder.h"
+#include "Tests/Fakes/SourceFolder.h"
 
 #include <cstdlib>
 #include <gtest/gtest.h>
@@ -95,7 +96,7 @@ private:
     }
 
     LogRecorder _recorder;
-    DirectoryResources _resources {SPECTREL_SOURCE_DIR "/Resources"};
+    DirectoryResources _resources {sourcePath("Resources")};
     std::unique_ptr<ZPH_GSMLogGenerator> _generator = ZPH_GSMLogGenerator::generator();
     Dictionary _state;
 };

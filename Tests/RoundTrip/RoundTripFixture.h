@@ -4,6 +4,7 @@
 #include "Platform/Resources.h"
 #include "Records/Recording.h"
 #include "Tests/Fakes/FakeRunLoop.h"
+#include "Tests/Fakes/SourceFolder.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
 
@@ -63,7 +64,7 @@ private:
     }
 
     FakeRunLoop _time;
-    const DirectoryResources _shipped {SPECTREL_SOURCE_DIR "/Resources"};
+    const DirectoryResources _shipped {sourcePath("Resources")};
     std::unique_ptr<LogGenerator> _generator;
     Dictionary _state;
 };

@@ -6,6 +6,7 @@
 #include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Fakes/LogRecorder.h"
 #include "Tests/Fakes/RecordBuilder.h"
+#include "Tests/Fakes/SourceFolder.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
 
@@ -82,7 +83,7 @@ private:
 
     FakeRunLoop _time;
     LogRecorder _log;
-    const DirectoryResources _shipped {SPECTREL_SOURCE_DIR "/Resources"};
+    const DirectoryResources _shipped {sourcePath("Resources")};
 };
 
 } // namespace spectrel

@@ -1,11 +1,11 @@
 #pragma once
 
+#include "Tests/Fakes/FakeModel.h"
 #include "Tests/Fakes/FakePreferences.h"
 #include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Fakes/FakeToolkit.h"
 #include "Tests/Fakes/LogRecorder.h"
 #include "Tests/Fakes/ScratchFolder.h"
-#include "Tests/UI/FakeModel.h"
 #include "UI/SpectrelApp.h"
 #include "UI/SpectrelCell.h"
 #include "UI/SpectrelPaneController.h"

@@ -1,7 +1,7 @@
 #include "UI/PlaybackController.h"
 
+#include "Tests/Fakes/FakePlayback.h"
 #include "Tests/UI/AppFixture.h"
-#include "Tests/UI/FakePlayback.h"
 
 namespace spectrel {
 namespace {

@@ -1,3 +1,4 @@
+#include "Tests/Fakes/SourceFolder.h"
 #include "Tests/LogGenerator/CDMA/C2KFixture.h"
 
 #include "LogGenerator/CDMA/Lookup.h"
@@ -290,7 +291,7 @@ void collectLeaves(const Value& value, std::multiset<std::string>& leaves)
 
 TEST(C2KTemplateTest, ShippedTemplateShowsEveryVariableAndNothingElse)
 {
-    const DirectoryResources shipped(SPECTREL_SOURCE_DIR "/Resources");
+    const DirectoryResources shipped(sourcePath("Resources"));
     const auto layout = shipped.propertyList("C2KTemplate");
     ASSERT_TRUE(layout);
     std::multiset<std::string> leaves;

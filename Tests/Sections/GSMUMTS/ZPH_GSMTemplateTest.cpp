@@ -5,6 +5,7 @@
 #include "Sections/GSMUMTS/ZPH_GSMLogGenerator.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/RecordBuilder.h"
+#include "Tests/Fakes/SourceFolder.h"
 #include "Tests/Sections/CellInformation.h"
 
 #include <gtest/gtest.h>
@@ -89,7 +90,7 @@ private:
         }
     }
 
-    DirectoryResources _resources {SPECTREL_SOURCE_DIR "/Resources"};
+    DirectoryResources _resources {sourcePath("Resources")};
 };
 
 std::multiset<std::string> keysOf(const Value& value)

@@ -1,4 +1,4 @@
-#include "Tests/UI/FakePlayback.h"
+#include "Tests/Fakes/FakePlayback.h"
 #include "Tests/UI/Terminal/TerminalFixture.h"
 
 namespace spectrel {

@@ -1,4 +1,5 @@
 #include "Tests/Fakes/ScratchFolder.h"
+#include "Tests/Fakes/SourceFolder.h"
 #include "Tests/Values/PropertyList/ValueText.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
@@ -20,7 +21,7 @@ constexpr int Lists = 200;
 bool runScript(const std::string& arguments)
 {
     const std::string command =
-        "/usr/bin/env python3 '" SPECTREL_SOURCE_DIR "/Tests/Values/PropertyList/PropertyListCorpus.py' " + arguments;
+        "/usr/bin/env python3 '" + sourcePath("Tests/Values/PropertyList/PropertyListCorpus.py") + "' " + arguments;
     return std::system(command.c_str()) == 0;
 }
 
