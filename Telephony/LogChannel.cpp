@@ -1,7 +1,8 @@
 #include "Telephony/LogChannel.h"
 
 #include "Platform/TelephonyProtocol.h"
-#include "Telephony/Encoders/RecordWriter.h"
+#include "Records/Frame.h"
+#include "Telephony/RoutedCode.h"
 #include "Telephony/ServiceLine.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
@@ -56,7 +57,7 @@ std::optional<Subscription> Subscription::fromStartCommand(const Value& command)
     const Value& ordinary = (*dictionary)[Protocol::OrdinaryCodesKey];
     const Value& extra = (*dictionary)[Protocol::ExtraCodesKey];
     subscription._wantsEverything = ordinary.isAbsent() && extra.isAbsent();
-    if (!addCodes(ordinary, 0, subscription._codes) || !addCodes(extra, ExtraStreamOffset, subscription._codes))
+    if (!addCodes(ordinary, 0, subscription._codes) || !addCodes(extra, ExtraStream, subscription._codes))
         return std::nullopt;
     return subscription;
 }

@@ -13,9 +13,9 @@
 #include "Telephony/Modem/ModemSource.h"
 #include "Telephony/ServiceLine.h"
 #include "Telephony/Simulator/SimulatedRecording.h"
-#include "Telephony/Simulator/SimulatorSource.h"
 #include "Telephony/Sources/RelaySource.h"
 #include "Telephony/Sources/ReplaySource.h"
+#include "Telephony/Sources/SimulatorSource.h"
 #include "Telephony/StatusReport.h"
 #include "Telephony/TelephonyService.h"
 

@@ -4,7 +4,6 @@
 #include "Telephony/Encoders/BitPacker.h"
 #include "Telephony/Encoders/PropertyListRecords.h"
 #include "Telephony/Encoders/RecordWriter.h"
-#include "Telephony/Simulator/UTRAN/UTRANWorld.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
 
@@ -14,7 +13,6 @@ namespace spectrel {
 
 namespace {
 
-constexpr std::size_t NeighboursTold = 4;
 constexpr double BSICReadable = -95; // dBm: of weaker GSM cells the colours are not known
 
 /// RSCP in the 92 levels of a report, 0 being below -115 dBm (3GPP TS 25.123, 9.1.1.1.3).
@@ -123,12 +121,12 @@ Bytes utranSIMFilesRecord(const UTRANCell& cell, Moment time)
     return simFilesRecord(time, {cell.locationArea, cell.locationArea, 1, "UTRAN preferred"});
 }
 
-Bytes utranCellInformationRecord(const UTRANWorld& world, Moment time)
+Bytes utranCellInformationRecord(const UTRANCell& serving, std::span<const UTRANCell* const> others, Moment time)
 {
-    auto cells = List::make({cellDictionary(world.servingCell(), kRKCellMonitorCellTypeServing)});
-    const auto others = world.otherCells();
-    for (std::size_t index = 0; index < std::min(others.size(), NeighboursTold); ++index)
-        cells->append(cellDictionary(*others[index], kRKCellMonitorCellTypeNeighbor));
+    constexpr std::size_t MaxNeighbours = 4;
+    auto cells = List::make({cellDictionary(serving, kRKCellMonitorCellTypeServing)});
+    for (const UTRANCell* cell : others.first(std::min(others.size(), MaxNeighbours)))
+        cells->append(cellDictionary(*cell, kRKCellMonitorCellTypeNeighbor));
     return propertyListRecord(0xFF0001, cells, time);
 }
 

@@ -52,6 +52,20 @@ struct NetworkReport {
     friend bool operator==(const NetworkReport&, const NetworkReport&) = default;
 };
 
+/// Where a phone is, as its network counts places.
+struct Place {
+    RadioSystem system = RadioSystem::None;
+    std::uint16_t locationArea = 0xFFFE;
+    std::uint8_t routingArea = 0xFF;
+    friend bool operator==(const Place&, const Place&) = default;
+};
+
+/// What a packet data session has transferred.
+struct PacketTransfer {
+    std::uint64_t bytesReceived = 0;
+    std::uint64_t bytesSent = 0;
+};
+
 // UMTS
 
 /// The sets of 3GPP TS 25.331, 8.4.0.

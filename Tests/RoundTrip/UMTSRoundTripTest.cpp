@@ -181,7 +181,7 @@ TEST_F(UMTSRoundTripTest, HSDPAShowsBothCarriersProcesses)
 TEST_F(UMTSRoundTripTest, CellInformationShowsTheServingCellAndItsNeighbours)
 {
     drive(1, 8, [&](const GSMUMTSWorld& world) {
-        deliver(gsmumtsCellInformationRecord(world, Now));
+        deliver(gsmumtsCellInformationRecord(world.cellInformation(), Now));
         if (const UMTSCell* cell = world.now().umtsCell) {
             EXPECT_EQ(shown("UMTS RR Info", "Cell ID"), std::to_string(cell->identity));
             EXPECT_EQ(shown("UMTS RR Info", "UARFCN"), std::to_string(cell->downlinkChannel));

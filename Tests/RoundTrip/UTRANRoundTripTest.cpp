@@ -45,7 +45,7 @@ TEST_F(UTRANRoundTripTest, ServingCellFromBothRecords)
 {
     drive(1, [this](const UTRANWorld& world) {
         const UTRANCell& cell = world.servingCell();
-        deliver(utranCellInformationRecord(world, Time));
+        deliver(utranCellInformationRecord(world.servingCell(), world.otherCells(), Time));
         EXPECT_EQ(number("Serving Cell Info", "Cell ID"), cell.identity);
         EXPECT_EQ(number("Serving Cell Info", "Local Area Code"), cell.locationArea);
         EXPECT_EQ(number("Serving Cell Info", "Cell Scrambling Code"), cell.parameter);

@@ -2,7 +2,7 @@
 
 #include "Platform/TelephonyProtocol.h"
 #include "Records/TelephonyConstants.h"
-#include "Telephony/Simulator/SimulatorSource.h"
+#include "Telephony/Sources/SimulatorSource.h"
 #include "Telephony/StatusReport.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/FakeMessagePorts.h"

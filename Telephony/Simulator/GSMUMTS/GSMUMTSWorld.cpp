@@ -193,6 +193,23 @@ void GSMUMTSWorld::transfer(std::chrono::milliseconds step)
     _sent += received * 0.08;
 }
 
+GSMUMTSCellInformation GSMUMTSWorld::cellInformation() const
+{
+    GSMUMTSCellInformation information {_now.umtsCell, _now.gsmCell, {}, {}, measuresGSM()};
+    if (system() != RadioSystem::None) {
+        information.umtsNeighbours = _umts.ranking();
+        information.gsmNeighbours = _gsm.neighbours();
+    }
+    return information;
+}
+
+std::optional<PacketTransfer> GSMUMTSWorld::session() const
+{
+    if (!_now.hasSession)
+        return std::nullopt;
+    return PacketTransfer {bytesReceived(), static_cast<std::uint64_t>(_sent)};
+}
+
 NetworkReport GSMUMTSWorld::network() const
 {
     NetworkReport report;

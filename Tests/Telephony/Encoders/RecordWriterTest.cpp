@@ -69,28 +69,13 @@ TEST(RecordWriterTest, AntennasRecordHasTheAntennasAtOffset20)
 TEST(RecordWriterTest, CellInformationTellsTheServingCellFirst)
 {
     const LTEWorld world(Scene::Drive, 1);
-    const Bytes record = lteCellInformationRecord(world, Epoch1980);
+    const Bytes record = lteCellInformationRecord(world.servingCell(), world.neighbours(4), Epoch1980);
     const auto cells = parsePropertyList(ByteView(record).subspan(13));
     ASSERT_TRUE(cells && cells->list());
     EXPECT_EQ(cells->list()->count(), 5u);
     const auto& serving = *(*cells->list())[0].dictionary();
     EXPECT_EQ(serving["kRKCellMonitorCellType"], Value("kRKCellMonitorCellTypeServing"));
     EXPECT_EQ(serving["kRKCellMonitorPID"].int32(), world.servingCell().physicalCellId);
-}
-
-TEST(RoutedCodeTest, IsReadBehindAWrapperAndOnlyFromKnownTypes)
-{
-    std::uint32_t code = 0;
-    Bytes record = RecordWriter(0xFF0002, Epoch1980).take();
-    EXPECT_TRUE(routedCode(record, code));
-    EXPECT_EQ(code, 0xFF0002u);
-    record.insert(record.begin(), {0x81, 0});
-    EXPECT_TRUE(routedCode(record, code));
-    EXPECT_EQ(code, 0xFF0002u);
-    record[2] = 0x10;
-    EXPECT_FALSE(routedCode(record, code));
-    EXPECT_FALSE(routedCode(Bytes(12, 1), code));
-    EXPECT_FALSE(routedCode({}, code));
 }
 
 } // namespace

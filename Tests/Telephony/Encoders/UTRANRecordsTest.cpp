@@ -101,7 +101,8 @@ TEST(UTRANRecordsTest, CodedCompositeChannelsStandWhereTheTransportChannelsPutTh
 TEST(UTRANRecordsTest, CellInformationTellsTheServingCellFirst)
 {
     const UTRANWorld world(Scene::Drive, 1);
-    const auto cells = parsePropertyList(ByteView(utranCellInformationRecord(world, Epoch1980)).subspan(13));
+    const auto cells = parsePropertyList(
+        ByteView(utranCellInformationRecord(world.servingCell(), world.otherCells(), Epoch1980)).subspan(13));
     ASSERT_TRUE(cells && cells->list());
     EXPECT_EQ(cells->list()->count(), 5u);
     const auto& serving = *(*cells->list())[0].dictionary();

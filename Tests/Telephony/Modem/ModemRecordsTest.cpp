@@ -1,7 +1,7 @@
 #include "Telephony/Modem/ModemRecords.h"
 
 #include "Records/TelephonyConstants.h"
-#include "Telephony/Encoders/RecordWriter.h"
+#include "Telephony/RoutedCode.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"

@@ -1,7 +1,7 @@
 #include "Telephony/Modem/ModemSource.h"
 
 #include "Records/TelephonyConstants.h"
-#include "Telephony/Encoders/RecordWriter.h"
+#include "Telephony/RoutedCode.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Telephony/Modem/FakeModemService.h"

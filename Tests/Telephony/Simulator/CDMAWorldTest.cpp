@@ -28,7 +28,7 @@ std::string diary(std::uint32_t seed)
     std::string text;
     drive(Scene::Drive, seed, 600, [&text](const CDMAWorld& world) {
         text += std::to_string(world.serving().pn) + " " + std::to_string(world.received()) + " "
-            + std::to_string(world.countersAtSecond().forwardBits()) + "\n";
+            + std::to_string(world.countsAtSecond().forwardBits) + "\n";
     });
     return text;
 }
@@ -101,7 +101,7 @@ TEST(CDMAWorldTest, CountersMoveOnceASecondAndOnlyWithData)
     std::uint64_t bits = 0;
     bool wasMovingData = false;
     drive(Scene::Drive, 1, FiveMinutes, [&](const CDMAWorld& world) {
-        const bool hasNewCount = world.countersAtSecond().forwardBits() != bits;
+        const bool hasNewCount = world.countsAtSecond().forwardBits != bits;
         if (world.second() == second) {
             EXPECT_FALSE(hasNewCount);
         } else {
@@ -110,7 +110,7 @@ TEST(CDMAWorldTest, CountersMoveOnceASecondAndOnlyWithData)
         }
         wasMovingData = world.activity() == Activity::Data;
         second = world.second();
-        bits = world.countersAtSecond().forwardBits();
+        bits = world.countsAtSecond().forwardBits;
     });
     EXPECT_GT(bits, 50'000'000u) << "in two and a half sessions";
 }
@@ -127,36 +127,36 @@ TEST(CDMAWorldTest, SomeFramesOfACallAreBadAndMostAreGood)
     EXPECT_LT(bad * 20, frames);
 }
 
-TEST(EVDOCountersTest, BitsAreThoseOfThePackets)
+TEST(EVDOTrafficTest, BitsAreThoseOfThePackets)
 {
     Dice dice(5);
-    EVDOCounters counters;
+    EVDOTraffic traffic;
     for (int step = 0; step < 1000; ++step)
-        counters.advance(100ms, dice.between(-18, 15), dice.between(-40, 23), dice);
+        traffic.advance(100ms, dice.between(-18, 15), dice.between(-40, 23), dice);
     std::uint64_t forward = 0;
     for (std::size_t format = 0; format < ForwardFormats.size(); ++format)
-        forward += std::uint64_t(counters.forward()[format]) * ForwardFormats[format].bits;
-    EXPECT_EQ(forward, counters.forwardBits());
+        forward += std::uint64_t(traffic.counts().forward[format]) * ForwardFormats[format].bits;
+    EXPECT_EQ(forward, traffic.counts().forwardBits);
     std::uint64_t reverse = 0;
-    for (std::size_t interlace = 0; interlace < EVDOCounters::Interlaces; ++interlace) {
-        for (std::size_t mode = 0; mode < EVDOCounters::Modes; ++mode) {
+    for (std::size_t interlace = 0; interlace < EVDOCounts::Interlaces; ++interlace) {
+        for (std::size_t mode = 0; mode < EVDOCounts::Modes; ++mode) {
             for (std::size_t payload = 0; payload < ReversePayloads.size(); ++payload) {
-                for (const std::uint32_t arrived : counters.reverse(interlace, mode, payload).arrived)
+                for (const std::uint32_t arrived : traffic.counts().reverse[interlace][mode][payload].arrived)
                     reverse += std::uint64_t(arrived) * ReversePayloads[payload];
             }
         }
     }
-    EXPECT_EQ(reverse, counters.reverseBits());
+    EXPECT_EQ(reverse, traffic.counts().reverseBits);
 }
 
-TEST(EVDOCountersTest, BetterSignalCarriesMore)
+TEST(EVDOTrafficTest, BetterSignalCarriesMore)
 {
     const auto carried = [](double signal, double power) {
         Dice dice(5);
-        EVDOCounters counters;
+        EVDOTraffic traffic;
         for (int step = 0; step < 100; ++step)
-            counters.advance(100ms, signal, power, dice);
-        return std::pair(counters.forwardBits(), counters.reverseBits());
+            traffic.advance(100ms, signal, power, dice);
+        return std::pair(traffic.counts().forwardBits, traffic.counts().reverseBits);
     };
     EXPECT_GT(carried(12, -10).first, 3 * carried(0, -10).first);
     EXPECT_GT(carried(0, -10).first, 3 * carried(-10, -10).first);
