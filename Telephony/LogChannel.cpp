@@ -72,7 +72,6 @@ LogChannel::LogChannel(RunLoop& runLoop, LogSource& source, unsigned number, std
     : _runLoop(runLoop)
     , _source(source)
     , _onEnd(std::move(onEnd))
-    , _alive(std::make_shared<bool>(true))
 {
     _status.name = "channel " + std::to_string(number);
 }
@@ -172,14 +171,12 @@ ChannelStatus LogChannel::status() const
 /// The client is gone. Its end may be noticed in the middle of a delivery, so it is dealt with from the queue.
 void LogChannel::end()
 {
-    _runLoop.async([this, alive = std::weak_ptr(_alive)] {
-        if (alive.expired())
-            return;
+    _runLoop.async(_lifetime.guard([this] {
         tell(_status.name + " closed: " + _status.client + " is gone, after " + std::to_string(_status.sent)
             + " messages");
         const auto onEnd = std::move(_onEnd);
         onEnd(); // destroys this channel
-    });
+    }));
 }
 
 } // namespace spectrel

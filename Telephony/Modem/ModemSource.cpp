@@ -49,15 +49,6 @@ private:
     std::array<std::optional<Bytes>, Kinds> _waiting;
 };
 
-/// An action that is dropped once the listening that it belongs to has ended.
-template <typename Action> auto ModemSource::whileListening(Action action)
-{
-    return [listening = std::weak_ptr(_listening), action = std::move(action)](auto&&... arguments) {
-        if (!listening.expired())
-            action(std::forward<decltype(arguments)>(arguments)...);
-    };
-}
-
 ModemSource::ModemSource(RunLoop& runLoop, const Clock& clock, std::unique_ptr<ModemService> service, std::string wish)
     : _runLoop(runLoop)
     , _clock(clock)
@@ -170,10 +161,10 @@ void ModemSource::forgetCells()
 /// Channels live with one modem and one technology: a change ends them, and their clients begin anew.
 void ModemSource::endChannels()
 {
-    _runLoop.async([this, alive = std::weak_ptr(_alive)] {
-        if (!alive.expired() && _basebandHandler)
+    _runLoop.async(_lifetime.guard([this] {
+        if (_basebandHandler)
             _basebandHandler();
-    });
+    }));
 }
 
 void ModemSource::followTechnology()
@@ -189,7 +180,7 @@ void ModemSource::beginListening()
 {
     if (_listening || !_modem || _streams.empty())
         return;
-    _listening = std::make_shared<bool>(true);
+    _listening.emplace();
     tryEverything();
     _cellTimer = _runLoop.repeat(CellInterval, [this] { askForCells(); });
     askForCells();
@@ -222,7 +213,7 @@ void ModemSource::raiseSignalRate()
     if (_previousSignalRate || !rate || (*rate > 0 && *rate <= SignalRate))
         return;
     _previousSignalRate = rate;
-    _service->setSignalRate(_modem->id, SignalRate, whileListening([this](ModemOutcome outcome) {
+    _service->setSignalRate(_modem->id, SignalRate, _listening->guard([this](ModemOutcome outcome) {
         if (outcome == ModemOutcome::Done)
             return;
         _previousSignalRate.reset();
@@ -250,7 +241,7 @@ void ModemSource::askForCells()
     if (!_canListCells)
         return askForLocation();
     _isAsking = true;
-    _service->listCells(_modem->id, whileListening([this](ModemOutcome outcome, std::vector<CellFacts> cells) {
+    _service->listCells(_modem->id, _listening->guard([this](ModemOutcome outcome, std::vector<CellFacts> cells) {
         takeCells(outcome, std::move(cells));
     }));
 }
@@ -279,7 +270,7 @@ void ModemSource::askForLocation()
     if (!_canLocate)
         return takeLocation(ModemOutcome::Failed, std::nullopt);
     _isAsking = true;
-    _service->locate(_modem->id, whileListening([this](ModemOutcome outcome, std::optional<LocationFacts> location) {
+    _service->locate(_modem->id, _listening->guard([this](ModemOutcome outcome, std::optional<LocationFacts> location) {
         takeLocation(outcome, std::move(location));
     }));
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Platform/Clock.h"
+#include "Platform/Lifetime.h"
 #include "Platform/RunLoop.h"
 #include "Telephony/LogSource.h"
 #include "Telephony/Modem/ModemService.h"
@@ -62,14 +63,13 @@ private:
     void send(Kind kind);
     void tellOnce(bool& isTold, const std::string& line);
     void remove(Stream& stream);
-    template <typename Action> auto whileListening(Action action);
 
     RunLoop& _runLoop;
     const Clock& _clock;
     std::unique_ptr<ModemService> _service;
     std::string _wish;
     std::function<void()> _basebandHandler;
-    std::shared_ptr<bool> _alive = std::make_shared<bool>(true);
+    Lifetime _lifetime;
 
     Technology _technology = Technology::GSM;
     std::optional<ModemFacts> _modem; // the one in use
@@ -80,7 +80,7 @@ private:
     bool _isSignalDenialTold = false;
 
     std::vector<Stream*> _streams;
-    std::shared_ptr<bool> _listening; // to one modem, from the first channel or the modem's coming on
+    std::optional<Lifetime> _listening; // to one modem, from the first channel or the modem's coming on
     std::unique_ptr<Timer> _cellTimer;
     std::optional<std::uint32_t> _previousSignalRate; // to be put back
     bool _isAsking = false; // for cells or location, and not answered yet

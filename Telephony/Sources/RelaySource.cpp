@@ -65,10 +65,7 @@ std::unique_ptr<LogStream> RelaySource::start(MessageSink& sink)
     auto stream = std::make_unique<Stream>(*this, sink);
     _streams.push_back(stream.get());
     // From the queue: the channel does not have its stream yet.
-    _runLoop.async([this, alive = std::weak_ptr(_alive)] {
-        if (!alive.expired())
-            pump();
-    });
+    _runLoop.async(_lifetime.guard([this] { pump(); }));
     return stream;
 }
 
@@ -162,14 +159,12 @@ void RelaySource::begin()
     if (!before || before == _technology || !_basebandHandler)
         return;
     _isChanging = true;
-    _runLoop.async([this, alive = std::weak_ptr(_alive)] {
-        if (alive.expired())
-            return;
+    _runLoop.async(_lifetime.guard([this] {
         _isChanging = false;
         if (_basebandHandler)
             _basebandHandler(); // ends the channels, and with them their streams
         pump();
-    });
+    }));
 }
 
 void RelaySource::refuse()
@@ -197,15 +192,13 @@ void RelaySource::settleSoon()
 {
     if (!_stream || std::exchange(_isSettling, true))
         return;
-    _runLoop.after(SettlingTime, [this, alive = std::weak_ptr(_alive)] {
-        if (alive.expired())
-            return;
+    _runLoop.after(SettlingTime, _lifetime.guard([this] {
         _isSettling = false;
         if (!_stream)
             return;
         _stream->settle();
         pump();
-    });
+    }));
 }
 
 std::string RelaySource::status() const

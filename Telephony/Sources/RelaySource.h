@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Platform/Lifetime.h"
 #include "Platform/RunLoop.h"
 #include "Platform/StreamInput.h"
 #include "Records/Recording.h"
@@ -69,7 +70,7 @@ private:
     std::optional<Technology> _givenTechnology;
     std::function<void()> _onFailure;
     std::function<void()> _basebandHandler;
-    std::shared_ptr<bool> _alive = std::make_shared<bool>(true);
+    Lifetime _lifetime;
 
     std::optional<Technology> _technology; // of the latest stream
     std::unique_ptr<RecordingStream> _stream; // of the current writer, until all it wrote is relayed

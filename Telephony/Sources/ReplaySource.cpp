@@ -1,5 +1,6 @@
 #include "Telephony/Sources/ReplaySource.h"
 
+#include "Platform/Lifetime.h"
 #include "Telephony/ServiceLine.h"
 
 #include <cmath>
@@ -26,7 +27,6 @@ public:
         , _clock(clock)
         , _options(options)
         , _sink(sink)
-        , _alive(std::make_shared<bool>(true))
     {
         later(std::chrono::nanoseconds::zero());
     }
@@ -67,10 +67,7 @@ private:
 
     void later(std::chrono::nanoseconds delay)
     {
-        const auto job = [this, alive = std::weak_ptr(_alive)] {
-            if (!alive.expired())
-                play();
-        };
+        const auto job = _lifetime.guard([this] { play(); });
         if (delay > std::chrono::nanoseconds::zero())
             _runLoop.after(delay, job);
         else
@@ -158,7 +155,7 @@ private:
     const Clock& _clock;
     const ReplayOptions& _options;
     MessageSink& _sink;
-    std::shared_ptr<bool> _alive;
+    Lifetime _lifetime;
     std::unique_ptr<RecordingReader> _reader;
     std::size_t _file = 0; // the next one to open
     std::optional<RecordedMessage> _message; // read, not delivered yet
