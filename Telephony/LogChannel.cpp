@@ -27,7 +27,7 @@ Bytes serialised(const Value& value)
 
 Bytes errorAnswer(const char* text)
 {
-    return serialised(Dictionary::make({{std::string(Protocol::ErrorKey), text}}));
+    return serialised(Dictionary::make({{Protocol::ErrorKey, text}}));
 }
 
 /// Adds a list of 16-bit codes; false when there is a value that is no such list.
@@ -120,8 +120,7 @@ std::optional<Bytes> LogChannel::handleRequest(std::int32_t id, ByteView body)
     }
     const auto request = parsePropertyList(body);
     if (request && request->dictionary() && request->dictionary()->contains(Protocol::GetTechnologyKey)) {
-        return serialised(
-            Dictionary::make({{std::string(Protocol::GetTechnologyKey), technologyConstant(_source.technology())}}));
+        return serialised(Dictionary::make({{Protocol::GetTechnologyKey, technologyConstant(_source.technology())}}));
     }
     auto subscription = request ? Subscription::fromStartCommand(*request) : std::nullopt;
     if (!subscription) {

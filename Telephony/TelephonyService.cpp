@@ -15,9 +15,9 @@ using Protocol::ChannelError;
 Bytes answer(ChannelError error, const std::string& portName = {})
 {
     const auto text = serialisePropertyList(Dictionary::make({
-        {std::string(Protocol::DomainKey), Value::integer(error == ChannelError::None ? 0 : 1)},
-        {std::string(Protocol::ErrorKey), Value::integer(static_cast<std::int32_t>(error))},
-        {std::string(Protocol::PortNameKey), portName},
+        {Protocol::DomainKey, Value::integer(error == ChannelError::None ? 0 : 1)},
+        {Protocol::ErrorKey, Value::integer(static_cast<std::int32_t>(error))},
+        {Protocol::PortNameKey, portName},
     }));
     return {text->begin(), text->end()};
 }

@@ -20,7 +20,9 @@ namespace spectrel {
 namespace {
 
 using namespace std::chrono_literals;
+using TelephonyProtocol::ChannelError;
 using testing::ElementsAre;
+namespace Protocol = TelephonyProtocol;
 
 /// Hands its messages over at once and remembers who listens.
 class ListSource final : public LogSource {
@@ -92,18 +94,29 @@ protected:
         const auto value = reply ? parsePropertyList(*reply) : std::nullopt;
         return value.value_or(Value());
     }
+    Value askService(const Value& request, std::int32_t id = Protocol::CreateLogChannelId)
+    {
+        return ask(std::string(Protocol::ServicePort), id, request);
+    }
+    Value askForChannel(const Value& client = "client")
+    {
+        return askService(Dictionary::make({{Protocol::CreateLogChannelKey, client}}));
+    }
+    static ChannelError errorOf(const Value& reply)
+    {
+        return static_cast<ChannelError>((*reply.dictionary())[Protocol::ErrorKey].int32().value_or(-1));
+    }
     std::string openChannel(const std::string& client = "client")
     {
-        const Value reply = ask("org.spectrel.Telephony", 1, Dictionary::make({{"CreateLogChannel", client}}));
-        return *(*reply.dictionary())["PortName"].string();
+        return *(*askForChannel(client).dictionary())[Protocol::PortNameKey].string();
     }
     void start(const std::string& channel, ListRef ordinary, ListRef extra)
     {
-        auto command = Dictionary::make({{"SetState", "Streaming"}});
-        command->set("SetZephyrLogCodes", ordinary);
-        command->set("SetRkExtraCodes", extra);
+        auto command = Dictionary::make({{Protocol::SetStateKey, Protocol::StreamingState}});
+        command->set(Protocol::OrdinaryCodesKey, ordinary);
+        command->set(Protocol::ExtraCodesKey, extra);
         ports.sent.clear();
-        EXPECT_TRUE(ask(channel, 0, command).isAbsent()) << "a start command is not answered";
+        EXPECT_TRUE(ask(channel, Protocol::LogChannelId, command).isAbsent()) << "a start command is not answered";
     }
     static ListRef codes(std::initializer_list<int> numbers)
     {
@@ -121,7 +134,7 @@ protected:
 
 TEST_F(TelephonyServiceTest, ChannelIsOpenedWithAPortOfItsOwn)
 {
-    EXPECT_EQ(displayText(ask("org.spectrel.Telephony", 1, Dictionary::make({{"CreateLogChannel", "client"}}))),
+    EXPECT_EQ(displayText(askForChannel()),
         "{\"Domain\": int 0, \"Error\": int 0, \"PortName\": \"org.spectrel.Telephony.LogChannel.1\"}");
     EXPECT_NE(openChannel("other"), openChannel("third"));
     EXPECT_EQ(service.channels(), 3u);
@@ -129,37 +142,33 @@ TEST_F(TelephonyServiceTest, ChannelIsOpenedWithAPortOfItsOwn)
 
 TEST_F(TelephonyServiceTest, MalformedWishGetsAnErrorAndNoChannel)
 {
-    const Value wishes[] = {Dictionary::make(), Dictionary::make({{"CreateLogChannel", ""}}),
-        Dictionary::make({{"CreateLogChannel", Value::integer(1)}}), List::make()};
-    for (const Value& wish : wishes)
-        EXPECT_EQ((*ask("org.spectrel.Telephony", 1, wish).dictionary())["Error"].int32(), 22) << displayText(wish);
-    EXPECT_EQ((*ask("org.spectrel.Telephony", 9, wishes[0]).dictionary())["Error"].int32(), 22);
+    for (const Value& client : {Value(""), Value::integer(1)})
+        EXPECT_EQ(errorOf(askForChannel(client)), ChannelError::MalformedRequest) << displayText(client);
+    for (const Value& request : {Value(Dictionary::make()), Value(List::make())})
+        EXPECT_EQ(errorOf(askService(request)), ChannelError::MalformedRequest) << displayText(request);
+    EXPECT_EQ(errorOf(askService(Dictionary::make(), 9)), ChannelError::MalformedRequest);
     const Bytes garbage {1, 2};
-    EXPECT_TRUE(ports.request("org.spectrel.Telephony", 1, garbage));
+    EXPECT_TRUE(ports.request(std::string(Protocol::ServicePort), Protocol::CreateLogChannelId, garbage));
     EXPECT_EQ(service.channels(), 0u);
 }
 
 TEST_F(TelephonyServiceTest, ClientWithoutAPortGetsAnError)
 {
     ports.refuseRemote = true;
-    EXPECT_EQ(
-        (*ask("org.spectrel.Telephony", 1, Dictionary::make({{"CreateLogChannel", "gone"}})).dictionary())["Error"]
-            .int32(),
-        2);
+    EXPECT_EQ(errorOf(askForChannel("gone")), ChannelError::NoSuchPort);
 }
 
 TEST_F(TelephonyServiceTest, ChannelsAreBounded)
 {
     for (std::size_t count = 0; count < TelephonyService::MostChannels; ++count)
         openChannel();
-    EXPECT_EQ((*ask("org.spectrel.Telephony", 1, Dictionary::make({{"CreateLogChannel", "one"}})).dictionary())["Error"]
-                  .int32(),
-        24);
+    EXPECT_EQ(errorOf(askForChannel()), ChannelError::TooManyChannels);
 }
 
 TEST_F(TelephonyServiceTest, TechnologyIsTheSources)
 {
-    EXPECT_EQ(displayText(ask(openChannel(), 0, Dictionary::make({{"GetTechnology", "GetTechnology"}}))),
+    EXPECT_EQ(displayText(ask(openChannel(), Protocol::LogChannelId,
+                  Dictionary::make({{Protocol::GetTechnologyKey, Protocol::GetTechnologyKey}}))),
         "{\"GetTechnology\": \"kRKLogChannelTechnology_Zephyr_GSM\"}");
 }
 
@@ -168,7 +177,7 @@ TEST_F(TelephonyServiceTest, OnlyTheRequestedCodesAreStreamed)
     const std::string channel = openChannel();
     start(channel, codes({0xB0C2}), codes({1}));
     ASSERT_EQ(ports.sent.size(), 2u);
-    EXPECT_EQ(ports.sent[0].id, 0);
+    EXPECT_EQ(ports.sent[0].id, Protocol::LogChannelId);
     EXPECT_EQ(ports.sent[0].body[4], '\xB0');
     EXPECT_EQ(ports.sent[1].body[0], '\xFF');
     start(channel, codes({}), codes({}));
@@ -187,13 +196,16 @@ TEST_F(TelephonyServiceTest, StartWithoutAnyCodeListStreamsEverything)
 TEST_F(TelephonyServiceTest, MalformedRequestsGetAnErrorAnswer)
 {
     const std::string channel = openChannel();
-    const Value requests[] = {Dictionary::make({{"SetState", "Idle"}}), List::make(), "Streaming",
-        Dictionary::make({{"SetState", "Streaming"}, {"SetZephyrLogCodes", "all"}}),
-        Dictionary::make({{"SetState", "Streaming"}, {"SetZephyrLogCodes", codes({65536})}}),
-        Dictionary::make({{"SetState", "Streaming"}, {"SetRkExtraCodes", codes({-1})}})};
+    const Value requests[] = {Dictionary::make({{Protocol::SetStateKey, "Idle"}}), List::make(),
+        Protocol::StreamingState,
+        Dictionary::make({{Protocol::SetStateKey, Protocol::StreamingState}, {Protocol::OrdinaryCodesKey, "all"}}),
+        Dictionary::make(
+            {{Protocol::SetStateKey, Protocol::StreamingState}, {Protocol::OrdinaryCodesKey, codes({65536})}}),
+        Dictionary::make({{Protocol::SetStateKey, Protocol::StreamingState}, {Protocol::ExtraCodesKey, codes({-1})}})};
     for (const Value& request : requests)
-        EXPECT_TRUE((*ask(channel, 0, request).dictionary())["Error"].string()) << displayText(request);
-    EXPECT_TRUE((*ask(channel, 7, requests[0]).dictionary())["Error"].string());
+        EXPECT_TRUE((*ask(channel, Protocol::LogChannelId, request).dictionary())[Protocol::ErrorKey].string())
+            << displayText(request);
+    EXPECT_TRUE((*ask(channel, 7, requests[0]).dictionary())[Protocol::ErrorKey].string());
     EXPECT_EQ(source.streams, 0);
 }
 
@@ -225,11 +237,10 @@ TEST_F(TelephonyServiceTest, FullClientStopsTheStreamUntilThereIsRoom)
 TEST_F(TelephonyServiceTest, SourceThatIsNotReadyHasNoChannels)
 {
     source.ready = false;
-    const Value wish = Dictionary::make({{"CreateLogChannel", "client"}});
-    EXPECT_EQ((*ask("org.spectrel.Telephony", 1, wish).dictionary())["Error"].int32(), 11);
+    EXPECT_EQ(errorOf(askForChannel()), ChannelError::NotReady);
     EXPECT_EQ(service.channels(), 0u);
     source.ready = true;
-    EXPECT_EQ((*ask("org.spectrel.Telephony", 1, wish).dictionary())["Error"].int32(), 0);
+    EXPECT_EQ(errorOf(askForChannel()), ChannelError::None);
 }
 
 TEST_F(TelephonyServiceTest, StatusTellsWhatIsStreamedToWhom)
