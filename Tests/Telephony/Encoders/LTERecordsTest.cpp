@@ -1,18 +1,12 @@
 #include "Telephony/Encoders/LTERecords.h"
 
 #include "Telephony/Reports/LTEReports.h"
+#include "Tests/Telephony/RecordBytes.h"
 
 #include <gtest/gtest.h>
 
 namespace spectrel {
 namespace {
-
-constexpr Moment Epoch1980 = std::chrono::sys_days(std::chrono::year(1980) / 1 / 6);
-
-Bytes payload(const Bytes& record)
-{
-    return {record.begin() + 13, record.end()};
-}
 
 /// `count` bits of a record from a bit of a byte on, the lower-addressed byte being the lower one.
 unsigned bitsOf(const Bytes& record, std::size_t byte, unsigned first, unsigned count)
@@ -43,12 +37,42 @@ LTEServingReport servingReport()
     return report;
 }
 
+LTECell cell()
+{
+    LTECell some;
+    some.identity = 0x0123456;
+    some.physicalCellId = 0x01F7;
+    some.downlinkChannel = 1300;
+    some.uplinkChannel = 19300;
+    some.band = 3;
+    some.resourceBlocks = 100;
+    some.antennas = 4;
+    some.trackingArea = 0xABCD;
+    return some;
+}
+
+TEST(LTERecordsTest, ServingCellRecordIsLaidOutByteForByte)
+{
+    const Bytes record = lteServingCellRecord(cell(), Epoch1980);
+    const Bytes payload {2, 0xF7, 0x01, 0x14, 0x05, 0x64, 0x4B, 100, 100, 0x56, 0x34, 0x12, 0x00, 0xCD, 0xAB, 3, 0, 0,
+        0, 0, 0, 0, 0, 0, 0};
+    ASSERT_EQ(record.size(), 38u);
+    EXPECT_EQ(payloadOf(record), payload);
+}
+
+TEST(LTERecordsTest, AntennasRecordHasTheAntennasAtOffset20)
+{
+    const Bytes record = lteAntennasRecord(cell(), Epoch1980);
+    ASSERT_EQ(record.size(), 22u);
+    EXPECT_EQ(record[20], 4);
+}
+
 TEST(LTERecordsTest, ConnectedModeHasTheDetectedCellsAfterTheMeasuredOnes)
 {
     LTEConnectedReport report {1300, 257, 9, {-95, 0, -11}, {}, {515, 4}};
     report.measured.push_back({258, {-139.75, 0, -19.875}});
     const Bytes record = lteConnectedModeRecord(report, Epoch1980);
-    EXPECT_EQ(payload(record),
+    EXPECT_EQ(payloadOf(record),
         (Bytes {
             3, 0, 0, 0, 0x14, 0x05, 0x01, 0x01, 9, 0, 180, 0, 72, 0, 1, 2, 0x02, 0x01, 1, 0, 1, 0, 0x03, 0x02, 4, 0}));
 }

@@ -52,11 +52,16 @@ TEST(JourneyTest, PlacesAreAheadOrBehindByTheShorterWay)
 
 TEST(SceneTest, NamesAreThoseOfTheCommandLine)
 {
-    Scene scene = Scene::Drive;
-    EXPECT_TRUE(sceneNamed("still", scene));
-    EXPECT_EQ(scene, Scene::Still);
+    const std::pair<const char*, Scene> names[] = {
+        {"still", Scene::Still}, {"walk", Scene::Walk}, {"drive", Scene::Drive}, {"stress", Scene::Stress}};
+    for (const auto& [name, expected] : names) {
+        Scene scene = expected == Scene::Still ? Scene::Walk : Scene::Still;
+        EXPECT_TRUE(sceneNamed(name, scene)) << name;
+        EXPECT_EQ(scene, expected) << name;
+    }
+    Scene scene = Scene::Walk;
     EXPECT_FALSE(sceneNamed("fly", scene));
-    EXPECT_EQ(scene, Scene::Still);
+    EXPECT_EQ(scene, Scene::Walk);
 }
 
 TEST(PathLossTest, FollowsTheUrbanMacroCell)

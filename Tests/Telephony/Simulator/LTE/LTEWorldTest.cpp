@@ -1,9 +1,12 @@
 #include "Telephony/Simulator/LTE/LTEWorld.h"
 
+#include <algorithm>
 #include <cmath>
+#include <functional>
 #include <gtest/gtest.h>
 #include <set>
 #include <string>
+#include <vector>
 
 namespace spectrel {
 namespace {
@@ -38,17 +41,38 @@ TEST(LTEWorldTest, DrivePassesSeveralCells)
     EXPECT_GE(cells.size(), 5u) << "in five minutes";
 }
 
-TEST(LTEWorldTest, ValuesBelongTogether)
+TEST(LTEWorldTest, CellsAgreeWithTheirCarriers)
+{
+    const LTEWorld world(Scene::Drive, 3);
+    std::set<std::uint32_t> identities;
+    for (const LTECell& cell : world.road().cells()) {
+        EXPECT_LT(cell.physicalCellId, 504);
+        ASSERT_TRUE(cell.layer);
+        EXPECT_EQ(cell.band, cell.layer->band);
+        EXPECT_EQ(cell.downlinkChannel, cell.layer->downlinkChannel);
+        EXPECT_EQ(cell.uplinkChannel, cell.downlinkChannel + 18000);
+        EXPECT_EQ(cell.resourceBlocks, cell.layer->resourceBlocks);
+        EXPECT_TRUE(identities.insert(cell.identity).second) << "an identity of its own";
+    }
+}
+
+TEST(LTEWorldTest, NeighboursAreTheStrongestOtherCells)
 {
     LTEWorld world(Scene::Drive, 3);
     for (int step = 0; step < 3000; ++step) {
         world.advance(100ms);
-        const LTECell& cell = world.servingCell();
-        EXPECT_LT(cell.physicalCellId, 504);
-        EXPECT_EQ(cell.uplinkChannel, cell.downlinkChannel + 18000);
+        std::vector<double> levels; // of the other cells
+        for (const LTECell& cell : world.road().cells()) {
+            if (&cell != &world.servingCell())
+                levels.push_back(cell.average.rsrp);
+        }
+        std::ranges::sort(levels, std::ranges::greater());
         const auto neighbours = world.neighbours(3);
         ASSERT_EQ(neighbours.size(), 3u);
-        EXPECT_GE(neighbours[0]->average.rsrp, neighbours[1]->average.rsrp);
+        for (std::size_t index = 0; index < neighbours.size(); ++index) {
+            EXPECT_NE(neighbours[index], &world.servingCell());
+            EXPECT_EQ(neighbours[index]->average.rsrp, levels[index]);
+        }
     }
 }
 
