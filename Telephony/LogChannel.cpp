@@ -96,7 +96,7 @@ std::unique_ptr<LogChannel> LogChannel::open(RunLoop& runLoop, MessagePorts& por
             self->_stream->resume();
     });
     channel->_status.client = clientPort.substr(0, clientPort.find(EveryClientsSuffix));
-    tell(channel->_status.name + " opened for " + channel->_status.client);
+    printServiceLine(channel->_status.name + " opened for " + channel->_status.client);
     return channel;
 }
 
@@ -115,7 +115,7 @@ LogChannel::~LogChannel()
 std::optional<Bytes> LogChannel::handleRequest(std::int32_t id, ByteView body)
 {
     if (id != Protocol::LogChannelId) {
-        tell(_status.name + ": a request of unknown id " + std::to_string(id));
+        printServiceLine(_status.name + ": a request of unknown id " + std::to_string(id));
         return errorAnswer("unknown message id");
     }
     const auto request = parsePropertyList(body);
@@ -124,7 +124,7 @@ std::optional<Bytes> LogChannel::handleRequest(std::int32_t id, ByteView body)
     }
     auto subscription = request ? Subscription::fromStartCommand(*request) : std::nullopt;
     if (!subscription) {
-        tell(_status.name + ": a request that cannot be understood");
+        printServiceLine(_status.name + ": a request that cannot be understood");
         return errorAnswer("the request cannot be understood");
     }
     startStreaming(std::move(*subscription));
@@ -135,7 +135,7 @@ void LogChannel::startStreaming(Subscription subscription)
 {
     const std::string client = _status.client;
     _status = {_status.name, client, subscription.description(), true, false, Clock::installed().now(), 0, 0, 0, 0};
-    tell(_status.name + ": streaming " + _status.wish + " to " + client);
+    printServiceLine(_status.name + ": streaming " + _status.wish + " to " + client);
     _stream.reset();
     _subscription = std::move(subscription);
     _stream = _source.start(*this);
@@ -150,7 +150,7 @@ bool LogChannel::deliver(ByteView message)
     const SendStatus status = _client->sendRequest(Protocol::LogChannelId, message, std::chrono::nanoseconds::zero(),
         std::chrono::nanoseconds::zero(), ReplyMode::None, nullptr);
     if (status == SendStatus::TransportError)
-        tell(_status.name + ": a message of " + std::to_string(message.size()) + " bytes cannot be sent");
+        printServiceLine(_status.name + ": a message of " + std::to_string(message.size()) + " bytes cannot be sent");
     _status.isFull = status == SendStatus::SendTimeout;
     if (status == SendStatus::Success)
         ++_status.sent;
@@ -171,7 +171,7 @@ ChannelStatus LogChannel::status() const
 void LogChannel::end()
 {
     _runLoop.async(_lifetime.guard([this] {
-        tell(_status.name + " closed: " + _status.client + " is gone, after " + std::to_string(_status.sent)
+        printServiceLine(_status.name + " closed: " + _status.client + " is gone, after " + std::to_string(_status.sent)
             + " messages");
         const auto onEnd = std::move(_onEnd);
         onEnd(); // destroys this channel

@@ -166,7 +166,7 @@ Bytes cdmaSystemInformationRecord(const CDMAReport& report, Moment time)
         .u16(sector.networkId)
         .zeros(77) // country, channel and time
         .u8(sector.packetZone)
-        .u8(6) // least protocol revision
+        .u8(6) // minimum protocol revision
         .u8(6) // protocol revision in use: IS-2000 release 0
         .zeros(50) // services
         .u16(sector.baseId)

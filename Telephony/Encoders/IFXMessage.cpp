@@ -23,11 +23,11 @@ std::string colourCode(const IFXCell& cell)
     return std::to_string(cell.networkColour) + "-" + std::to_string(cell.stationColour);
 }
 
-/// Path loss criterion (3GPP TS 45.008, 6.4): level above the cell's least one.
+/// Path loss criterion (3GPP TS 45.008, 6.4): level above the cell's minimum.
 std::string criterion(const IFXCell& cell)
 {
-    constexpr long LeastLevel = -104;
-    return std::to_string(std::lround(cell.level) - LeastLevel);
+    constexpr long RxLevAccessMin = -104;
+    return std::to_string(std::lround(cell.level) - RxLevAccessMin);
 }
 
 Value registration(const IFXReport& report)

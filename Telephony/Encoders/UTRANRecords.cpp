@@ -24,7 +24,7 @@ std::uint32_t rscpLevel(double dBm)
 BitPacker neighbourFields(const UTRANNeighbour& cell)
 {
     BitPacker fields;
-    fields.field(14, cell.channel).field(7, cell.parameter).field(8, rscpLevel(cell.rscp));
+    fields.field(14, cell.channel).field(7, cell.cellParameterId).field(8, rscpLevel(cell.rscp));
     fields.field(2, static_cast<std::uint32_t>(cell.set)).field(1, cell.isJointlyDetected ? 1 : 0);
     return fields;
 }
@@ -39,7 +39,7 @@ DictionaryRef cellDictionary(const UTRANCell& cell, std::string_view type)
     dictionary->set(kRKCellMonitorLAC, Value::integer(cell.locationArea));
     dictionary->set(kRKCellMonitorCellId, Value::integer(cell.identity));
     dictionary->set(kRKCellMonitorBandInfo, Value::integer(34)); // 2010 to 2025 MHz
-    dictionary->set(kRKCellMonitorSCN, Value::integer(cell.parameter));
+    dictionary->set(kRKCellMonitorSCN, Value::integer(cell.cellParameterId));
     dictionary->set(kRKCellMonitorUARFCN, Value::integer(cell.channel));
     return dictionary;
 }
@@ -67,9 +67,9 @@ Bytes utranServingCellRecord(const UTRANCell& cell, bool isInService, Moment tim
 
 Bytes utranNeighbourRecord(std::span<const UTRANNeighbour> cells, Moment time)
 {
-    constexpr std::size_t LargestCount = 127;
+    constexpr std::size_t MaxCount = 127;
     constexpr std::size_t EntrySize = 16;
-    cells = cells.first(std::min(cells.size(), LargestCount));
+    cells = cells.first(std::min(cells.size(), MaxCount));
     RecordWriter record(0xD00A, time);
     record.zeros(3).u8(static_cast<std::uint32_t>(cells.size() << 1)).zeros(151);
     for (const UTRANNeighbour& cell : cells) {
@@ -81,8 +81,8 @@ Bytes utranNeighbourRecord(std::span<const UTRANNeighbour> cells, Moment time)
 
 Bytes utranGSMNeighbourRecord(std::span<const GSMNeighbour> cells, Moment time)
 {
-    constexpr std::size_t LargestCount = 255;
-    cells = cells.first(std::min(cells.size(), LargestCount));
+    constexpr std::size_t MaxCount = 255;
+    cells = cells.first(std::min(cells.size(), MaxCount));
     RecordWriter record(0xD00E, time);
     record.zeros(3).u8(static_cast<std::uint32_t>(cells.size()));
     for (const GSMNeighbour& cell : cells) {
@@ -96,10 +96,10 @@ Bytes utranGSMNeighbourRecord(std::span<const GSMNeighbour> cells, Moment time)
 
 Bytes utranTransportChannelRecord(const TransportReport& report, Moment time)
 {
-    constexpr std::size_t LargestChannelCount = 63;
-    constexpr std::size_t LargestCompositeCount = 15;
-    const std::size_t channels = std::min(report.channels.size(), LargestChannelCount);
-    const std::size_t composites = std::min(report.composites.size(), LargestCompositeCount);
+    constexpr std::size_t MaxChannels = 63;
+    constexpr std::size_t MaxComposites = 15;
+    const std::size_t channels = std::min(report.channels.size(), MaxChannels);
+    const std::size_t composites = std::min(report.composites.size(), MaxComposites);
     const BitPacker counts = BitPacker()
                                  .gap(6)
                                  .field(6, static_cast<std::uint32_t>(channels))

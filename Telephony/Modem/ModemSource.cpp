@@ -16,7 +16,7 @@ const std::string HowToPermit = "to permit it, have spectrel-modem.conf and spec
 
 } // namespace
 
-/// One channel's share. A record tells a state: for a client that is busy, only the newest of each kind waits.
+/// One channel's share. A record holds a state: for a client that is busy, only the newest of each kind waits.
 class ModemSource::Stream final : public LogStream {
 public:
     Stream(ModemSource& source, MessageSink& sink)
@@ -98,10 +98,10 @@ void ModemSource::lookAround()
         takeModem(*chosen);
     else if (chosen)
         update(*chosen);
-    tellPresence();
+    printPresence();
 }
 
-void ModemSource::tellPresence()
+void ModemSource::printPresence()
 {
     std::string presence;
     if (_modem)
@@ -112,21 +112,21 @@ void ModemSource::tellPresence()
     else
         presence = _wish.empty() ? "no modem; waiting for one" : "no modem '" + _wish + "'; waiting for it";
     if (presence != std::exchange(_presence, presence))
-        tell(presence);
+        printServiceLine(presence);
 }
 
 void ModemSource::leaveModem()
 {
-    tell(modemName(*_modem) + " is no longer used");
+    printServiceLine(modemName(*_modem) + " is no longer used");
     endListening();
     _modem.reset();
-    endChannels(); // so that the programs tell that nothing is heard any more
+    endChannels(); // so that the programs show that nothing is heard any more
 }
 
 void ModemSource::takeModem(const ModemFacts& modem)
 {
     _modem = modem;
-    _isShortcomingTold = false;
+    _isShortcomingPrinted = false;
     send(Sim);
     send(Contexts);
     beginListening();
@@ -172,7 +172,7 @@ void ModemSource::followTechnology()
     if (!_modem->technology || *_modem->technology == _technology)
         return;
     _technology = *_modem->technology;
-    tell("the technology is now " + std::string(technologyName(_technology)));
+    printServiceLine("the technology is now " + std::string(technologyName(_technology)));
     endChannels();
 }
 
@@ -218,7 +218,7 @@ void ModemSource::raiseSignalRate()
             return;
         _previousSignalRate.reset();
         if (outcome == ModemOutcome::Denied)
-            tellOnce(_isSignalDenialTold,
+            printOnce(_isSignalDenialPrinted,
                 "this user may not set how often the modem measures (Signal.Setup): signal values are shown only where "
                 "another program has set it; "
                     + HowToPermit);
@@ -252,12 +252,12 @@ void ModemSource::takeCells(ModemOutcome outcome, std::vector<CellFacts> cells)
     _cells = std::move(cells);
     _canListCells = outcome == ModemOutcome::Done || outcome == ModemOutcome::Failed;
     if (outcome == ModemOutcome::Denied)
-        tellOnce(_isDenialTold,
+        printOnce(_isDenialPrinted,
             "this user may not list the modem's cells (GetCellInfo): only the serving cell is shown, from location and "
             "signal; "
                 + HowToPermit);
     if (outcome == ModemOutcome::Unsupported)
-        tellOnce(_isShortcomingTold,
+        printOnce(_isShortcomingPrinted,
             modemName(*_modem) + " cannot list its cells: only the serving cell is shown, from location and signal");
     if (_cells.empty())
         return askForLocation();
@@ -283,7 +283,7 @@ void ModemSource::takeLocation(ModemOutcome outcome, std::optional<LocationFacts
     if (outcome == ModemOutcome::Unsupported || outcome == ModemOutcome::Denied)
         _canLocate = false;
     if (outcome == ModemOutcome::Denied)
-        tellOnce(_isLocationDenialTold,
+        printOnce(_isLocationDenialPrinted,
             "this user may not ask where the modem is registered (GetLocation): the serving cell has its network only; "
                 + HowToPermit);
     send(Cells);
@@ -312,10 +312,10 @@ void ModemSource::send(Kind kind)
         stream->send(kind, made);
 }
 
-void ModemSource::tellOnce(bool& isTold, const std::string& line)
+void ModemSource::printOnce(bool& isPrinted, const std::string& line)
 {
-    if (!std::exchange(isTold, true))
-        tell(line);
+    if (!std::exchange(isPrinted, true))
+        printServiceLine(line);
 }
 
 } // namespace spectrel

@@ -16,7 +16,7 @@
 
 namespace spectrel {
 
-/// A real modem: what its service tells of it becomes the records of cell information, SIM files and packet data
+/// A real modem: what its service reports of it becomes the records of cell information, SIM files and packet data
 /// contexts. Asks nothing of the modem while nobody listens.
 ///
 /// The technology is that of the modem's access technology; while that is not known, the last known one, at first GSM.
@@ -41,7 +41,7 @@ private:
     class Stream;
 
     void lookAround();
-    void tellPresence();
+    void printPresence();
     void leaveModem();
     void takeModem(const ModemFacts& modem);
     void update(const ModemFacts& modem);
@@ -61,7 +61,7 @@ private:
 
     Bytes record(Kind kind) const;
     void send(Kind kind);
-    void tellOnce(bool& isTold, const std::string& line);
+    void printOnce(bool& isPrinted, const std::string& line);
     void remove(Stream& stream);
 
     RunLoop& _runLoop;
@@ -73,11 +73,11 @@ private:
 
     Technology _technology = Technology::GSM;
     std::optional<ModemFacts> _modem; // the one in use
-    std::string _presence; // what was last told of modems there or not
-    bool _isDenialTold = false;
-    bool _isShortcomingTold = false;
-    bool _isLocationDenialTold = false;
-    bool _isSignalDenialTold = false;
+    std::string _presence; // the newest line about modems there or not
+    bool _isDenialPrinted = false;
+    bool _isShortcomingPrinted = false;
+    bool _isLocationDenialPrinted = false;
+    bool _isSignalDenialPrinted = false;
 
     std::vector<Stream*> _streams;
     std::optional<Lifetime> _listening; // to one modem, from the first channel or the modem's coming on

@@ -7,8 +7,8 @@ namespace spectrel {
 
 double GSMCell::c1() const
 {
-    constexpr double AccessMinimum = -104; // dBm, RXLEV_ACCESS_MIN
-    return rssi - AccessMinimum; // the phone reaches the power the cell allows, which leaves nothing to take off
+    constexpr double RxLevAccessMin = -104; // dBm, RXLEV_ACCESS_MIN
+    return rssi - RxLevAccessMin; // the phone reaches the power the cell allows, which leaves nothing to take off
 }
 
 std::uint8_t rxLevel(double rssi)

@@ -7,7 +7,7 @@
 #include <optional>
 #include <vector>
 
-/// What a GSM/UMTS phone tells about itself, in natural units; the encoders write it as log records.
+/// What a GSM/UMTS phone reports about itself, in natural units; the encoders write it as log records.
 namespace spectrel {
 
 // Mobility
@@ -93,7 +93,7 @@ struct RankedUMTSCell {
     double rankedRscp = 0; // dBm, averaged
     double ecno = 0; // dB
     double rank = 0; // R of 3GPP TS 25.304, 5.2.6.1.4
-    bool isMeasured = true; // heard for long enough to tell its level
+    bool isMeasured = true; // heard for long enough to know its level
 };
 
 struct RankedGSMCell {

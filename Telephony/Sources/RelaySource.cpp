@@ -77,7 +77,7 @@ void RelaySource::remove(Stream& stream)
 void RelaySource::writerCame()
 {
     if (_input->takesFurtherWriters())
-        tell(_input->name() + ": a writer has come");
+        printServiceLine(_input->name() + ": a writer has come");
     _stream = makeRecordingStream(_givenTechnology);
 }
 
@@ -138,7 +138,7 @@ bool RelaySource::take(StreamStep step, const RecordedMessage& message)
         return true;
     case StreamStep::Skipped: {
         const SkippedBytes& skipped = _stream->skipped();
-        tell(_input->name() + ": skipped " + std::to_string(skipped.length) + " bytes at byte "
+        printServiceLine(_input->name() + ": skipped " + std::to_string(skipped.length) + " bytes at byte "
             + std::to_string(skipped.offset) + " of the stream: " + skipped.reason);
         _skippedBytes += skipped.length;
         ++_skippedPlaces;
@@ -155,7 +155,7 @@ void RelaySource::begin()
 {
     const auto before = std::exchange(_technology, _stream->technology());
     if (before != _technology || _streams.empty())
-        tell(_input->name() + ": a stream of technology " + std::string(technologyName(*_technology)));
+        printServiceLine(_input->name() + ": a stream of technology " + std::string(technologyName(*_technology)));
     if (!before || before == _technology || !_basebandHandler)
         return;
     _isChanging = true;
@@ -169,7 +169,7 @@ void RelaySource::begin()
 
 void RelaySource::refuse()
 {
-    tell(_input->name() + ": the stream is refused: " + _stream->reason());
+    printServiceLine(_input->name() + ": the stream is refused: " + _stream->reason());
     _stream.reset();
     if (!_ending)
         _input->dropWriter();
@@ -180,7 +180,7 @@ void RelaySource::refuse()
 
 void RelaySource::finishWriter()
 {
-    tell(_input->name() + ": the writer has ended" + (_ending->empty() ? "" : " (" + *_ending + ")")
+    printServiceLine(_input->name() + ": the writer has ended" + (_ending->empty() ? "" : " (" + *_ending + ")")
         + (_input->takesFurtherWriters() ? "; waiting for the next one" : "; the stream is over"));
     _stream.reset();
     _ending.reset();

@@ -15,7 +15,7 @@ constexpr int MessagesPerTurn = 64;
 /// Messages passed over in one turn.
 constexpr int PassedPerTurn = 20'000;
 /// Of the time between two files, what is waited for.
-constexpr std::chrono::seconds LongestGap {10};
+constexpr std::chrono::seconds MaxGap {10};
 
 } // namespace
 
@@ -79,12 +79,12 @@ private:
     {
         if (_options.speed <= 0)
             return {};
-        const bool isAfterGap = _isFirstOfFile && _message->time - _last > LongestGap;
-        if (!_origin || _message->time < _last || isAfterGap) {
+        const bool isAfterGap = _isFirstOfFile && _message->time - _previous > MaxGap;
+        if (!_origin || _message->time < _previous || isAfterGap) {
             _origin = _message->time;
             _startedAt = _clock.now();
         }
-        _last = _message->time;
+        _previous = _message->time;
         _isFirstOfFile = false;
         const auto recorded = static_cast<double>((_message->time - *_origin).count());
         const std::chrono::microseconds place(std::llround(recorded / _options.speed));
@@ -123,7 +123,7 @@ private:
     bool openNext()
     {
         if (_reader && !_reader->damage().empty())
-            tell(_options.files[_file - 1] + ": " + _reader->damage());
+            printServiceLine(_options.files[_file - 1] + ": " + _reader->damage());
         _reader.reset();
         while (!_reader) {
             if (_file == _options.files.size() && !rewind())
@@ -131,7 +131,7 @@ private:
             std::string reason;
             _reader = openRecording(_options.files[_file++], reason);
             if (!_reader)
-                tell(_options.files[_file - 1] + ": " + reason);
+                printServiceLine(_options.files[_file - 1] + ": " + reason);
         }
         _isFirstOfFile = true;
         return true;
@@ -142,8 +142,8 @@ private:
         const bool hasPlayed = std::exchange(_hasPlayed, false);
         _isEmpty = _isEmpty && !hasPlayed;
         if (!_options.loop || !hasPlayed) {
-            tell(_isEmpty && _range ? "the replay has ended: no message lies between --from and --to"
-                                    : "the replay has ended");
+            printServiceLine(_isEmpty && _range ? "the replay has ended: no message lies between --from and --to"
+                                                : "the replay has ended");
             return false;
         }
         _file = 0;
@@ -162,7 +162,7 @@ private:
     std::optional<std::pair<Moment, Moment>> _range; // of the messages to play; known from the first message on
     std::optional<Moment> _origin;
     Moment _startedAt {};
-    Moment _last {}; // the latest message's time
+    Moment _previous {}; // that of the message before
     bool _isFirstOfFile = false;
     bool _isEmpty = true; // nothing was played so far
     bool _isStopped = false; // the client had no room
@@ -187,17 +187,17 @@ std::unique_ptr<ReplaySource> ReplaySource::open(
             reason = file + ": " + reason;
             return nullptr;
         }
-        const auto told = reader->technology() ? reader->technology() : options.technology;
-        if (!told) {
+        const auto named = reader->technology() ? reader->technology() : options.technology;
+        if (!named) {
             reason = file + ": does not tell its technology; name it with --technology";
             return nullptr;
         }
-        if (technology && technology != told) {
-            reason = file + ": is of technology " + std::string(technologyName(*told)) + ", the first file of "
+        if (technology && technology != named) {
+            reason = file + ": is of technology " + std::string(technologyName(*named)) + ", the first file of "
                 + std::string(technologyName(*technology));
             return nullptr;
         }
-        technology = told;
+        technology = named;
     }
     if (!technology) {
         reason = "no file to replay";

@@ -158,7 +158,7 @@ TEST_F(TelephonyServiceTest, ClientWithoutAPortGetsAnError)
 
 TEST_F(TelephonyServiceTest, ChannelsAreBounded)
 {
-    for (std::size_t count = 0; count < TelephonyService::MostChannels; ++count)
+    for (std::size_t count = 0; count < TelephonyService::MaxChannels; ++count)
         openChannel();
     EXPECT_EQ(errorOf(askForChannel()), ChannelError::TooManyChannels);
 }
@@ -241,7 +241,7 @@ TEST_F(TelephonyServiceTest, SourceThatIsNotReadyHasNoChannels)
     EXPECT_EQ(errorOf(askForChannel()), ChannelError::None);
 }
 
-TEST_F(TelephonyServiceTest, StatusTellsWhatIsStreamedToWhom)
+TEST_F(TelephonyServiceTest, StatusShowsWhatIsStreamedToWhom)
 {
     StatusReport report(loop, service, source);
     EXPECT_THAT(report.lines(), ElementsAre("a list; 0 clients"));

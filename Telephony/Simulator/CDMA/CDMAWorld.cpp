@@ -20,7 +20,7 @@ constexpr double Hysteresis = 2; // by which a pilot must be better to serve: 3 
 constexpr double AddShare = 0.2; // T_ADD, -14 dB of a pilot that is a fifth of its sector's power
 constexpr double DropShare = 0.126; // T_DROP, -16 dB
 constexpr std::chrono::milliseconds DropTime = 4s; // T_TDROP
-constexpr std::size_t LargestActiveSet = 6;
+constexpr std::size_t MaxActiveSet = 6;
 
 /// What the phone does, and until when in each round.
 struct Phase {
@@ -117,7 +117,7 @@ void CDMAWorld::maintainActiveSet(std::chrono::milliseconds step)
         const double share = shareOf(sector);
         sector.weakFor = share < DropShare ? sector.weakFor + step : 0ms;
         const bool isDropped = sector.isActive && sector.weakFor >= DropTime;
-        const bool isAdded = !sector.isActive && share > AddShare && size < LargestActiveSet;
+        const bool isAdded = !sector.isActive && share > AddShare && size < MaxActiveSet;
         if (isDropped || isAdded) {
             sector.isActive = isAdded;
             size += isAdded ? 1 : -1;
@@ -145,7 +145,7 @@ std::vector<CDMAPilot> CDMAWorld::activePilots() const
         if (sector.isActive && sector.system.pn != serving().pn)
             pilots.push_back({sector.system.pn, shareOf(sector)});
     }
-    pilots.resize(std::min(pilots.size(), LargestActiveSet), pilots.front());
+    pilots.resize(std::min(pilots.size(), MaxActiveSet), pilots.front());
     return pilots;
 }
 

@@ -2,8 +2,10 @@
 
 #include "Telephony/Reports/CDMAReport.h"
 #include "Telephony/Simulator/CDMA/EVDOTraffic.h"
+#include "Telephony/Simulator/Dice.h"
+#include "Telephony/Simulator/Journey.h"
 #include "Telephony/Simulator/MastRoad.h"
-#include "Telephony/Simulator/Radio.h"
+#include "Telephony/Simulator/Propagation.h"
 
 #include <chrono>
 #include <cstdint>

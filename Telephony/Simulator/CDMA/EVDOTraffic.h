@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Telephony/Reports/EVDOCounts.h"
-#include "Telephony/Simulator/Radio.h"
+#include "Telephony/Simulator/Dice.h"
 
 #include <array>
 #include <chrono>

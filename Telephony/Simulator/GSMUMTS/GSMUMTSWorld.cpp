@@ -112,7 +112,7 @@ bool GSMUMTSWorld::isUMTSTooWeak() const
     const UMTSCell& cell = _umts.servingCell();
     if (_umts.state() == RRCState::CellDCH)
         return cell.ecno < WeakEcno;
-    if (cell.ecno < UMTSThresholds::MinimumEcno || cell.rscp < UMTSThresholds::MinimumRscp)
+    if (cell.ecno < UMTSThresholds::QQualMin || cell.rscp < UMTSThresholds::QRxLevMin)
         return true;
     return measuresGSM() && _gsm.strongestCell().rssi - UMTSThresholds::GSMOffset > _umts.servingRank();
 }

@@ -1,8 +1,9 @@
 #pragma once
 
 #include "Telephony/Reports/IFXReport.h"
+#include "Telephony/Simulator/Dice.h"
+#include "Telephony/Simulator/Journey.h"
 #include "Telephony/Simulator/MastRoad.h"
-#include "Telephony/Simulator/Radio.h"
 
 #include <chrono>
 #include <cstdint>

@@ -25,13 +25,13 @@ LTEServingReport servingReport()
     report.priority = 5;
     report.measured = {-95.25, -60.5, -12.25};
     report.average = {-95.5, -60, -11.75};
-    report.leastLevel = -124;
-    report.greatestPower = 23;
-    report.phonePower = 20;
-    report.receiveLevel = -7;
+    report.qRxLevMin = -124;
+    report.pMax = 23;
+    report.maxUETransmitPower = 20;
+    report.srxlev = -7;
     report.cyclesBelowZero = 3;
-    report.intraSearch = 46;
-    report.nonIntraSearch = 26;
+    report.sIntraSearch = 46;
+    report.sNonIntraSearch = 26;
     report.areRulesUpdated = true;
     report.rules = 5;
     return report;
@@ -115,9 +115,9 @@ TEST(LTERecordsTest, ServingMeasurementHasEveryFieldAtItsBits)
 TEST(LTERecordsTest, AbsentThresholdsHaveTheirOwnCodes)
 {
     LTEServingReport report = servingReport();
-    report.greatestPower.reset();
-    report.intraSearch.reset();
-    report.nonIntraSearch.reset();
+    report.pMax.reset();
+    report.sIntraSearch.reset();
+    report.sNonIntraSearch.reset();
     const Bytes record = lteServingMeasurementRecord(report, Epoch1980);
     EXPECT_EQ(bitsOf(record, 26, 7, 7), 64u);
     EXPECT_EQ(bitsOf(record, 30, 5, 6), 32u);
@@ -130,7 +130,7 @@ TEST(LTERecordsTest, NeighbourMeasurementHasEveryFieldOfEveryEntryAtItsBits)
     neighbour.physicalCellId = 300;
     neighbour.measured = {-95, -60.5, -12.25};
     neighbour.average = {-94, -60, -11.75};
-    neighbour.receiveLevel = 29;
+    neighbour.srxlev = 29;
     neighbour.frequencyOffset = 0xABCD;
     neighbour.antennas[0] = {1023, 307199};
     neighbour.antennas[1] = {1, 2};
@@ -153,7 +153,7 @@ TEST(LTERecordsTest, NeighbourMeasurementHasEveryFieldOfEveryEntryAtItsBits)
     EXPECT_EQ(bitsOf(record, 58, 3, 19), 2u);
 }
 
-TEST(LTERecordsTest, NeighbourMeasurementTellsOneTo32)
+TEST(LTERecordsTest, NeighbourMeasurementHoldsOneTo32)
 {
     LTENeighbourReport report;
     EXPECT_TRUE(lteNeighbourMeasurementRecord(report, Epoch1980).empty());
@@ -192,7 +192,7 @@ TEST(LTERecordsTest, LaterCandidatesLieOverTheEarlierOnes)
         Bytes(record.begin() + 21, record.begin() + 33), (Bytes {6, 0, 0, 0, 3, 0, 1, 0, 0xCC, 0x29, 0x37, 0x01}));
 }
 
-TEST(LTERecordsTest, NoCandidateIsToldTo)
+TEST(LTERecordsTest, NoCandidateIsWrittenToo)
 {
     const Bytes record = lteReselectionRecord({1300, 44, {}}, Epoch1980);
     EXPECT_EQ(record.size(), 21u);

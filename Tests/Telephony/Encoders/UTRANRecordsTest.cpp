@@ -38,7 +38,7 @@ TEST(UTRANRecordsTest, ServingCellIsLaidOutByteForByte)
 
 TEST(UTRANRecordsTest, NeighboursStand16BytesApartFromOffset168)
 {
-    // 10054 = 0x2746 in 14 bits; parameter 0x55 in 7; -100 dBm is level 16 in 8; set 1 in 2; 1.
+    // 10054 = 0x2746 in 14 bits; cellParameterId 0x55 in 7; -100 dBm is level 16 in 8; set 1 in 2; 1.
     const UTRANNeighbour cells[] {{}, {10054, 0x55, -100, UTRANCellSet::Monitored, true}};
     const Bytes record = utranNeighbourRecord(cells, Epoch1980);
     EXPECT_EQ(record.size(), 200u);

@@ -43,15 +43,15 @@ TEST(CDMAWorldTest, DrivePassesSeveralSitesAndDoesEverything)
 {
     std::set<std::uint16_t> pilots;
     std::set<Activity> activities;
-    std::size_t largestActiveSet = 0;
+    std::size_t maxActiveSet = 0;
     drive(Scene::Drive, 1, FiveMinutes, [&](const CDMAWorld& world) {
         pilots.insert(world.serving().pn);
         activities.insert(world.activity());
-        largestActiveSet = std::max(largestActiveSet, world.activePilots().size());
+        maxActiveSet = std::max(maxActiveSet, world.activePilots().size());
     });
     EXPECT_GE(pilots.size(), 4u);
     EXPECT_EQ(activities.size(), 4u);
-    EXPECT_GE(largestActiveSet, 2u) << "soft handoff";
+    EXPECT_GE(maxActiveSet, 2u) << "soft handoff";
 }
 
 TEST(CDMAWorldTest, StandingStillKeepsTheSite)

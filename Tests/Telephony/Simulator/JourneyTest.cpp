@@ -1,7 +1,8 @@
-#include "Telephony/Simulator/Radio.h"
+#include "Telephony/Simulator/Journey.h"
 
 #include <cmath>
 #include <gtest/gtest.h>
+#include <utility>
 
 namespace spectrel {
 namespace {
@@ -62,13 +63,6 @@ TEST(SceneTest, NamesAreThoseOfTheCommandLine)
     Scene scene = Scene::Walk;
     EXPECT_FALSE(sceneNamed("fly", scene));
     EXPECT_EQ(scene, Scene::Walk);
-}
-
-TEST(PathLossTest, FollowsTheUrbanMacroCell)
-{
-    EXPECT_DOUBLE_EQ(pathLoss(1000), 128.1);
-    EXPECT_NEAR(pathLoss(100), 90.5, 1e-9);
-    EXPECT_EQ(pathLoss(0), pathLoss(35));
 }
 
 } // namespace
