@@ -5,7 +5,7 @@
 #include "LogGenerator/LogGenerator.h"
 #include "Platform/Resources.h"
 #include "Records/Recording.h"
-#include "Telephony/Encoders/RecordWriter.h"
+#include "Telephony/RoutedCode.h"
 #include "Telephony/Simulator/SimulatedRecording.h"
 #include "Tests/Fakes/CountedAllocations.h"
 #include "Tests/Fakes/ScratchFolder.h"

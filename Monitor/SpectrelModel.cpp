@@ -1,6 +1,7 @@
 #include "Monitor/SpectrelModel.h"
 
 #include "Platform/SystemLog.h"
+#include "Platform/TelephonyProtocol.h"
 #include "Values/PropertyList/PropertyList.h"
 
 #include <cstdarg>
@@ -10,8 +11,6 @@
 namespace spectrel {
 
 namespace {
-
-constexpr std::int32_t LogMessageId = 0;
 
 ByteView bytesOf(const std::string& text)
 {
@@ -120,14 +119,15 @@ bool SpectrelModel::openLogChannel(const std::string& localName, std::string& se
 
 void SpectrelModel::configureGenerator()
 {
-    const auto request = serialisePropertyList(Dictionary::make({{"GetTechnology", "GetTechnology"}}));
+    const auto request = serialisePropertyList(
+        Dictionary::make({{TelephonyProtocol::GetTechnologyKey, TelephonyProtocol::GetTechnologyKey}}));
     if (!request) {
         fail(" Could not generate GetTechnology command; cannot configure");
         return;
     }
     std::optional<Bytes> reply;
     const SendStatus status = _sendPort->sendRequest(
-        LogMessageId, bytesOf(*request), RequestTimeout, RequestTimeout, ReplyMode::Wait, &reply);
+        TelephonyProtocol::LogChannelId, bytesOf(*request), RequestTimeout, RequestTimeout, ReplyMode::Wait, &reply);
     if (status != SendStatus::Success) {
         fail(" ***** Could not send the GetTechnology command (got error=%d)", static_cast<int>(status));
         return;
@@ -141,7 +141,7 @@ void SpectrelModel::configureGenerator()
         fail(" ***** Could not parse reply to GetTechnology; cannot configure");
         return;
     }
-    const Value& technology = (*answer->dictionary())["GetTechnology"];
+    const Value& technology = (*answer->dictionary())[TelephonyProtocol::GetTechnologyKey];
     if (technology.isAbsent()) {
         fail(" ***** Reply to GetTechnology had no answer; cannot configure");
         return;
@@ -168,8 +168,8 @@ bool SpectrelModel::startSession()
         fail(" Could not generate PLIST");
         return false;
     }
-    const SendStatus status = _sendPort->sendRequest(
-        LogMessageId, bytesOf(*command), RequestTimeout, std::chrono::nanoseconds::zero(), ReplyMode::None, nullptr);
+    const SendStatus status = _sendPort->sendRequest(TelephonyProtocol::LogChannelId, bytesOf(*command), RequestTimeout,
+        std::chrono::nanoseconds::zero(), ReplyMode::None, nullptr);
     if (status != SendStatus::Success) {
         fail(" ***** Could not send the START command (got error=%d)", static_cast<int>(status));
         return false;
@@ -221,7 +221,7 @@ void SpectrelModel::restartMonitor()
 void SpectrelModel::handleMessage(std::int32_t id, ByteView body) noexcept
 {
     // Nothing catches what a record raises: the process ends here, and the terminate handler finds the message.
-    if (id != LogMessageId)
+    if (id != TelephonyProtocol::LogChannelId)
         return;
     if (_observer.modelShouldApply(body))
         updateWithData(body);

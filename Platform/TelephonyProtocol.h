@@ -12,10 +12,10 @@ inline constexpr std::string_view ServicePort = "org.spectrel.Telephony";
 /// A wish for a log channel: {"CreateLogChannel": <local port name>} with this message id, answered by
 /// {"Domain": integer, "Error": integer, "PortName": text}. The port name is the channel's, for requests of id 0.
 inline constexpr std::int32_t CreateLogChannelId = 1;
-inline constexpr std::string_view CreateLogChannelKey = "CreateLogChannel";
-inline constexpr std::string_view DomainKey = "Domain";
-inline constexpr std::string_view ErrorKey = "Error";
-inline constexpr std::string_view PortNameKey = "PortName";
+inline constexpr const char* CreateLogChannelKey = "CreateLogChannel";
+inline constexpr const char* DomainKey = "Domain";
+inline constexpr const char* ErrorKey = "Error";
+inline constexpr const char* PortNameKey = "PortName";
 
 /// Values under "Error".
 enum class ChannelError : std::int32_t {
@@ -29,12 +29,12 @@ enum class ChannelError : std::int32_t {
 /// Requests on a log channel, and every log message from it, have this id.
 inline constexpr std::int32_t LogChannelId = 0;
 /// {"GetTechnology": "GetTechnology"}, answered by {"GetTechnology": <technology constant>}.
-inline constexpr std::string_view GetTechnologyKey = "GetTechnology";
+inline constexpr const char* GetTechnologyKey = "GetTechnology";
 /// The start command: {"SetState": "Streaming"} with the wanted codes of the two streams, not answered.
-inline constexpr std::string_view SetStateKey = "SetState";
-inline constexpr std::string_view StreamingState = "Streaming";
-inline constexpr std::string_view OrdinaryCodesKey = "SetZephyrLogCodes";
-inline constexpr std::string_view ExtraCodesKey = "SetRkExtraCodes";
+inline constexpr const char* SetStateKey = "SetState";
+inline constexpr const char* StreamingState = "Streaming";
+inline constexpr const char* OrdinaryCodesKey = "SetZephyrLogCodes";
+inline constexpr const char* ExtraCodesKey = "SetRkExtraCodes";
 /// A request that cannot be understood is answered by {"Error": text} where an answer is wanted.
 
 } // namespace spectrel::TelephonyProtocol

@@ -10,7 +10,7 @@ void ChannelQueue::send(ByteView message)
         return;
     _waiting.emplace_back(message.begin(), message.end());
     _bytes += message.size();
-    while (_waiting.size() > MostMessages || _bytes > MostBytes)
+    while (_waiting.size() > MaxMessages || _bytes > MaxBytes)
         dropOldest();
 }
 
@@ -27,9 +27,9 @@ void ChannelQueue::drain()
         _bytes -= _waiting.front().size();
         _waiting.pop_front();
     }
-    if (_waiting.empty() && _lost > _toldLost) {
-        tell("a client was too slow and lost " + std::to_string(_lost - _toldLost) + " messages");
-        _toldLost = _lost;
+    if (_waiting.empty() && _lost > _reportedLost) {
+        printServiceLine("a client was too slow and lost " + std::to_string(_lost - _reportedLost) + " messages");
+        _reportedLost = _lost;
     }
 }
 

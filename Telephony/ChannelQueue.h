@@ -10,11 +10,11 @@
 namespace spectrel {
 
 /// Live messages on their way to one client: what it has no room for waits here. The queue is bounded; beyond it the
-/// oldest go, and the loss is told once the client takes messages again.
+/// oldest go, and the loss is reported once the client takes messages again.
 class ChannelQueue {
 public:
-    static constexpr std::size_t MostMessages = 4096;
-    static constexpr std::size_t MostBytes = 8 * 1024 * 1024;
+    static constexpr std::size_t MaxMessages = 4096;
+    static constexpr std::size_t MaxBytes = 8 * 1024 * 1024;
 
     explicit ChannelQueue(MessageSink& sink)
         : _sink(sink)
@@ -40,7 +40,7 @@ private:
     std::deque<Bytes> _waiting;
     std::size_t _bytes = 0; // of those waiting
     std::uint64_t _lost = 0;
-    std::uint64_t _toldLost = 0;
+    std::uint64_t _reportedLost = 0;
 };
 
 } // namespace spectrel

@@ -1,7 +1,8 @@
 #include "Telephony/LogChannel.h"
 
 #include "Platform/TelephonyProtocol.h"
-#include "Telephony/Encoders/RecordWriter.h"
+#include "Records/Frame.h"
+#include "Telephony/RoutedCode.h"
 #include "Telephony/ServiceLine.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
@@ -26,7 +27,7 @@ Bytes serialised(const Value& value)
 
 Bytes errorAnswer(const char* text)
 {
-    return serialised(Dictionary::make({{std::string(Protocol::ErrorKey), text}}));
+    return serialised(Dictionary::make({{Protocol::ErrorKey, text}}));
 }
 
 /// Adds a list of 16-bit codes; false when there is a value that is no such list.
@@ -56,7 +57,7 @@ std::optional<Subscription> Subscription::fromStartCommand(const Value& command)
     const Value& ordinary = (*dictionary)[Protocol::OrdinaryCodesKey];
     const Value& extra = (*dictionary)[Protocol::ExtraCodesKey];
     subscription._wantsEverything = ordinary.isAbsent() && extra.isAbsent();
-    if (!addCodes(ordinary, 0, subscription._codes) || !addCodes(extra, ExtraStreamOffset, subscription._codes))
+    if (!addCodes(ordinary, 0, subscription._codes) || !addCodes(extra, ExtraStream, subscription._codes))
         return std::nullopt;
     return subscription;
 }
@@ -71,7 +72,6 @@ LogChannel::LogChannel(RunLoop& runLoop, LogSource& source, unsigned number, std
     : _runLoop(runLoop)
     , _source(source)
     , _onEnd(std::move(onEnd))
-    , _alive(std::make_shared<bool>(true))
 {
     _status.name = "channel " + std::to_string(number);
 }
@@ -96,7 +96,7 @@ std::unique_ptr<LogChannel> LogChannel::open(RunLoop& runLoop, MessagePorts& por
             self->_stream->resume();
     });
     channel->_status.client = clientPort.substr(0, clientPort.find(EveryClientsSuffix));
-    tell(channel->_status.name + " opened for " + channel->_status.client);
+    printServiceLine(channel->_status.name + " opened for " + channel->_status.client);
     return channel;
 }
 
@@ -115,17 +115,16 @@ LogChannel::~LogChannel()
 std::optional<Bytes> LogChannel::handleRequest(std::int32_t id, ByteView body)
 {
     if (id != Protocol::LogChannelId) {
-        tell(_status.name + ": a request of unknown id " + std::to_string(id));
+        printServiceLine(_status.name + ": a request of unknown id " + std::to_string(id));
         return errorAnswer("unknown message id");
     }
     const auto request = parsePropertyList(body);
     if (request && request->dictionary() && request->dictionary()->contains(Protocol::GetTechnologyKey)) {
-        return serialised(
-            Dictionary::make({{std::string(Protocol::GetTechnologyKey), technologyConstant(_source.technology())}}));
+        return serialised(Dictionary::make({{Protocol::GetTechnologyKey, technologyConstant(_source.technology())}}));
     }
     auto subscription = request ? Subscription::fromStartCommand(*request) : std::nullopt;
     if (!subscription) {
-        tell(_status.name + ": a request that cannot be understood");
+        printServiceLine(_status.name + ": a request that cannot be understood");
         return errorAnswer("the request cannot be understood");
     }
     startStreaming(std::move(*subscription));
@@ -136,7 +135,7 @@ void LogChannel::startStreaming(Subscription subscription)
 {
     const std::string client = _status.client;
     _status = {_status.name, client, subscription.description(), true, false, Clock::installed().now(), 0, 0, 0, 0};
-    tell(_status.name + ": streaming " + _status.wish + " to " + client);
+    printServiceLine(_status.name + ": streaming " + _status.wish + " to " + client);
     _stream.reset();
     _subscription = std::move(subscription);
     _stream = _source.start(*this);
@@ -151,7 +150,7 @@ bool LogChannel::deliver(ByteView message)
     const SendStatus status = _client->sendRequest(Protocol::LogChannelId, message, std::chrono::nanoseconds::zero(),
         std::chrono::nanoseconds::zero(), ReplyMode::None, nullptr);
     if (status == SendStatus::TransportError)
-        tell(_status.name + ": a message of " + std::to_string(message.size()) + " bytes cannot be sent");
+        printServiceLine(_status.name + ": a message of " + std::to_string(message.size()) + " bytes cannot be sent");
     _status.isFull = status == SendStatus::SendTimeout;
     if (status == SendStatus::Success)
         ++_status.sent;
@@ -171,14 +170,12 @@ ChannelStatus LogChannel::status() const
 /// The client is gone. Its end may be noticed in the middle of a delivery, so it is dealt with from the queue.
 void LogChannel::end()
 {
-    _runLoop.async([this, alive = std::weak_ptr(_alive)] {
-        if (alive.expired())
-            return;
-        tell(_status.name + " closed: " + _status.client + " is gone, after " + std::to_string(_status.sent)
+    _runLoop.async(_lifetime.guard([this] {
+        printServiceLine(_status.name + " closed: " + _status.client + " is gone, after " + std::to_string(_status.sent)
             + " messages");
         const auto onEnd = std::move(_onEnd);
         onEnd(); // destroys this channel
-    });
+    }));
 }
 
 } // namespace spectrel

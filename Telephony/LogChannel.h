@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Platform/Clock.h"
+#include "Platform/Lifetime.h"
 #include "Platform/MessagePort.h"
 #include "Platform/RunLoop.h"
 #include "Telephony/LogSource.h"
@@ -78,7 +79,7 @@ private:
     LogSource& _source;
     ChannelStatus _status; // but for what the stream knows
     std::function<void()> _onEnd;
-    std::shared_ptr<bool> _alive;
+    Lifetime _lifetime;
     std::shared_ptr<LocalMessagePort> _requests;
     std::shared_ptr<RemoteMessagePort> _client;
     std::optional<Subscription> _subscription;

@@ -4,7 +4,7 @@
 
 namespace spectrel {
 
-void tell(const std::string& line)
+void printServiceLine(const std::string& line)
 {
     std::fprintf(stderr, "spectrel-telephonyd: %s\n", line.c_str());
 }

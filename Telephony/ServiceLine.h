@@ -5,6 +5,6 @@
 namespace spectrel {
 
 /// "spectrel-telephonyd: LINE" on standard error.
-void tell(const std::string& line);
+void printServiceLine(const std::string& line);
 
 } // namespace spectrel

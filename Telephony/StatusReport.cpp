@@ -90,15 +90,15 @@ bool StatusReport::hasNews() const
 RegularReport::RegularReport(RunLoop& runLoop, StatusReport& report, std::chrono::milliseconds interval)
     : _timer(runLoop.repeat(interval, [&report] {
         if (report.hasNews())
-            tellStatus(report);
+            printStatus(report);
     }))
 {
 }
 
-void tellStatus(StatusReport& report)
+void printStatus(StatusReport& report)
 {
     for (const std::string& line : report.lines())
-        tell(line);
+        printServiceLine(line);
 }
 
 } // namespace spectrel

@@ -24,7 +24,7 @@ public:
     std::vector<std::string> lines();
     /// The first of them alone; rates of `lines` are not touched.
     std::string headline() const;
-    /// Whether a report would tell something new: anything was sent, or the channels are others.
+    /// Whether a report would show something new: anything was sent, or the channels are others.
     bool hasNews() const;
 
 private:
@@ -49,7 +49,7 @@ private:
     std::unique_ptr<Timer> _timer;
 };
 
-/// Tells the whole report on standard error.
-void tellStatus(StatusReport& report);
+/// Prints the whole report on standard error.
+void printStatus(StatusReport& report);
 
 } // namespace spectrel

@@ -15,9 +15,9 @@ using Protocol::ChannelError;
 Bytes answer(ChannelError error, const std::string& portName = {})
 {
     const auto text = serialisePropertyList(Dictionary::make({
-        {std::string(Protocol::DomainKey), Value::integer(error == ChannelError::None ? 0 : 1)},
-        {std::string(Protocol::ErrorKey), Value::integer(static_cast<std::int32_t>(error))},
-        {std::string(Protocol::PortNameKey), portName},
+        {Protocol::DomainKey, Value::integer(error == ChannelError::None ? 0 : 1)},
+        {Protocol::ErrorKey, Value::integer(static_cast<std::int32_t>(error))},
+        {Protocol::PortNameKey, portName},
     }));
     return {text->begin(), text->end()};
 }
@@ -56,12 +56,12 @@ bool TelephonyService::start()
 void TelephonyService::endChannels()
 {
     if (!_channels.empty())
-        tell("ending " + std::to_string(_channels.size()) + " channel(s): their baseband has changed");
+        printServiceLine("ending " + std::to_string(_channels.size()) + " channel(s): their baseband has changed");
     _channels.clear();
-    tellChange();
+    reportChange();
 }
 
-void TelephonyService::tellChange()
+void TelephonyService::reportChange()
 {
     if (_changeHandler)
         _changeHandler();
@@ -85,18 +85,18 @@ Bytes TelephonyService::handleRequest(std::int32_t id, ByteView body)
         return answer(ChannelError::MalformedRequest);
     if (!_source.isReady())
         return answer(ChannelError::NotReady);
-    if (_channels.size() >= MostChannels)
+    if (_channels.size() >= MaxChannels)
         return answer(ChannelError::TooManyChannels);
-    const unsigned number = ++_lastChannel;
+    const unsigned number = ++_latestNumber;
     auto channel = LogChannel::open(_runLoop, _ports, _source, number, *clientPort, [this, number] {
         _channels.erase(number);
-        tellChange();
+        reportChange();
     });
     if (!channel)
         return answer(ChannelError::NoSuchPort);
     const std::string name = channel->portName();
     _channels.emplace(number, std::move(channel));
-    tellChange();
+    reportChange();
     return answer(ChannelError::None, name);
 }
 

@@ -18,7 +18,7 @@ namespace spectrel {
 /// The telephony service: opens log channels, several at once, each with its own client.
 class TelephonyService {
 public:
-    static constexpr std::size_t MostChannels = 64;
+    static constexpr std::size_t MaxChannels = 64;
 
     TelephonyService(RunLoop& runLoop, MessagePorts& ports, LogSource& source);
     ~TelephonyService();
@@ -41,14 +41,14 @@ public:
 private:
     Bytes handleRequest(std::int32_t id, ByteView body);
     void endChannels();
-    void tellChange();
+    void reportChange();
 
     RunLoop& _runLoop;
     MessagePorts& _ports;
     LogSource& _source;
     std::shared_ptr<LocalMessagePort> _port;
     std::map<unsigned, std::unique_ptr<LogChannel>> _channels;
-    unsigned _lastChannel = 0;
+    unsigned _latestNumber = 0;
     std::function<void()> _changeHandler;
 };
 

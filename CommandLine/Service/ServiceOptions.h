@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Records/Recording.h"
-#include "Telephony/Simulator/Radio.h"
+#include "Telephony/Simulator/Journey.h"
 #include "Telephony/Sources/ReplaySource.h"
 
 #include <chrono>
@@ -27,13 +27,13 @@ struct ServiceOptions {
     ReplayOptions replay;
     std::string relay; // the stream's address
     std::optional<std::string> modem; // which one; empty: any
-    std::optional<Technology> technology; // where a recording or a stream does not tell
+    std::optional<Technology> technology; // where a recording or a stream does not name it
     int readyDescriptor = -1;
     std::optional<std::chrono::milliseconds> statusInterval;
 };
 
 /// Reads the command line. An exit status when the program is done with that: after --help, --version or wrong usage,
-/// each told on the stream where it belongs.
+/// each printed on the stream where it belongs.
 std::optional<int> readServiceOptions(int argc, char** argv, ServiceOptions& options);
 
 } // namespace spectrel

@@ -13,9 +13,9 @@
 #include "Telephony/Modem/ModemSource.h"
 #include "Telephony/ServiceLine.h"
 #include "Telephony/Simulator/SimulatedRecording.h"
-#include "Telephony/Simulator/SimulatorSource.h"
 #include "Telephony/Sources/RelaySource.h"
 #include "Telephony/Sources/ReplaySource.h"
+#include "Telephony/Sources/SimulatorSource.h"
 #include "Telephony/StatusReport.h"
 #include "Telephony/TelephonyService.h"
 
@@ -31,7 +31,7 @@ constexpr int ExitFailed = 1;
 
 int fail(const std::string& line)
 {
-    tell(line);
+    printServiceLine(line);
     return ExitFailed;
 }
 
@@ -82,13 +82,13 @@ bool adoptSocket(ServiceManager& manager, SocketMessagePorts& ports, std::string
     return socket ? ports.adopt(TelephonyProtocol::ServicePort, std::move(socket), reason) : reason.empty();
 }
 
-bool tellReady(int descriptor)
+bool writeReady(int descriptor)
 {
     if (descriptor < 0)
         return true;
-    const bool isTold = ::write(descriptor, "ready\n", 6) == 6;
+    const bool isWritten = ::write(descriptor, "ready\n", 6) == 6;
     ::close(descriptor);
-    return isTold;
+    return isWritten;
 }
 
 /// Keeps the service manager's status line true.
@@ -101,15 +101,15 @@ public:
     {
         if (!manager.isListening())
             return;
-        service.setChangeHandler([this] { tellManager(); });
-        _timer = runLoop.repeat(Interval, [this] { tellManager(); });
+        service.setChangeHandler([this] { notifyManager(); });
+        _timer = runLoop.repeat(Interval, [this] { notifyManager(); });
     }
-    void tellManager(const std::string& before = "")
+    void notifyManager(const std::string& before = "")
     {
         const std::string headline = _report.headline();
-        if (!before.empty() || headline != _told)
+        if (!before.empty() || headline != _headline)
             _manager.notify(before + "STATUS=" + headline + "\n");
-        _told = headline;
+        _headline = headline;
     }
 
 private:
@@ -117,7 +117,7 @@ private:
     const ServiceManager& _manager;
     const StatusReport& _report;
     std::unique_ptr<Timer> _timer;
-    std::string _told;
+    std::string _headline;
 };
 
 int serve(ServiceOptions& options)
@@ -141,15 +141,15 @@ int serve(ServiceOptions& options)
             "cannot take the telephony service's port in " + Places::portDirectory() + ": another service runs there");
     StatusReport report(clock, service, *source);
     const TerminationSignals terminationSignals(
-        [&](int signal) { signal == SIGUSR1 ? tellStatus(report) : runLoop.quit(); }, {SIGUSR1});
+        [&](int signal) { signal == SIGUSR1 ? printStatus(report) : runLoop.quit(); }, {SIGUSR1});
     std::optional<RegularReport> regularReport;
     if (options.statusInterval)
         regularReport.emplace(runLoop, report, *options.statusInterval);
     ManagerStatus managerStatus(runLoop, manager, service, report);
-    tell("serving in " + Places::portDirectory() + ": " + source->status());
-    if (!tellReady(options.readyDescriptor))
+    printServiceLine("serving in " + Places::portDirectory() + ": " + source->status());
+    if (!writeReady(options.readyDescriptor))
         return fail("--ready-fd: the descriptor cannot be written");
-    managerStatus.tellManager("READY=1\n");
+    managerStatus.notifyManager("READY=1\n");
     const int status = runLoop.run();
     manager.notify("STOPPING=1\n");
     service.setChangeHandler({});

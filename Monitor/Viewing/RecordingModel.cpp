@@ -24,7 +24,6 @@ RecordingModel::RecordingModel(
     , _clock(clock)
     , _track(std::move(track))
     , _report(std::move(report))
-    , _alive(std::make_shared<bool>(true))
 {
     _session.emplace(false);
     _session->useTechnology(_track.technology());
@@ -161,13 +160,11 @@ void RecordingModel::work()
     _observer.playbackDidChange();
     if (std::exchange(_isWorkQueued, true))
         return;
-    _runLoop.async([this, alive = std::weak_ptr(_alive)] {
-        if (alive.expired())
-            return;
+    _runLoop.async(_lifetime.guard([this] {
         _isWorkQueued = false;
         if (_isSeeking)
             work();
-    });
+    }));
 }
 
 void RecordingModel::applyNext()

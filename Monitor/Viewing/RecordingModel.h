@@ -5,6 +5,7 @@
 #include "Monitor/Viewing/OfflineSession.h"
 #include "Monitor/Viewing/RecordingTrack.h"
 #include "Monitor/Viewing/ViewedClock.h"
+#include "Platform/Lifetime.h"
 #include "Platform/RunLoop.h"
 
 #include <chrono>
@@ -113,7 +114,7 @@ private:
     ViewedClock& _clock;
     RecordingTrack _track;
     Report _report;
-    std::shared_ptr<bool> _alive; // jobs on the queue hold it weakly: they end with the model
+    Lifetime _lifetime; // of jobs on the queue
 
     std::optional<OfflineSession> _session;
     NodeRef _nodes;

@@ -85,7 +85,6 @@ Value displayOfSnapshot(const Dictionary& snapshot)
 SnapshotModel::SnapshotModel(RunLoop& runLoop, SpectrelModelObserver& observer, const Dictionary& snapshot)
     : _runLoop(runLoop)
     , _observer(observer)
-    , _alive(std::make_shared<bool>(true))
     , _nodes(SpectrelModelNode::makeTreeFromObject(displayOfSnapshot(snapshot), _nodesByPath))
 {
 }
@@ -95,10 +94,7 @@ void SnapshotModel::restartMonitor()
     if (std::exchange(_isStarted, true))
         return;
     _observer.sessionDidChange();
-    _runLoop.async([this, alive = std::weak_ptr(_alive)] {
-        if (!alive.expired())
-            _observer.updateViewControllerFromModel();
-    });
+    _runLoop.async(_lifetime.guard([this] { _observer.updateViewControllerFromModel(); }));
 }
 
 } // namespace spectrel

@@ -2,9 +2,9 @@
 
 #include "Monitor/MonitorModel.h"
 #include "Monitor/SpectrelModel.h"
+#include "Platform/Lifetime.h"
 #include "Platform/RunLoop.h"
 
-#include <memory>
 #include <string>
 #include <string_view>
 
@@ -42,7 +42,7 @@ public:
 private:
     RunLoop& _runLoop;
     SpectrelModelObserver& _observer;
-    std::shared_ptr<bool> _alive; // jobs on the queue hold it weakly: they end with the model
+    Lifetime _lifetime; // of jobs on the queue
     PathIndex _nodesByPath;
     NodeRef _nodes;
     bool _isStarted = false;

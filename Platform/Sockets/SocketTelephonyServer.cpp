@@ -42,8 +42,7 @@ public:
 
     LogChannelResult RKServerConnectionNetworkMonitorCreateLogChannel(std::string_view localPortName) override
     {
-        const auto request =
-            serialisePropertyList(Dictionary::make({{std::string(Protocol::CreateLogChannelKey), localPortName}}));
+        const auto request = serialisePropertyList(Dictionary::make({{Protocol::CreateLogChannelKey, localPortName}}));
         if (!request)
             return failure(static_cast<std::int32_t>(SendStatus::TransportError));
         const ByteView body(reinterpret_cast<const std::uint8_t*>(request->data()), request->size());

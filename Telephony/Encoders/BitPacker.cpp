@@ -16,10 +16,10 @@ BitPacker& BitPacker::field(unsigned count, std::uint32_t value)
     return *this;
 }
 
-std::uint32_t levelSteps(double level, double lowest, double stepsPerUnit, unsigned count)
+std::uint32_t levelSteps(double level, double min, double stepsPerUnit, unsigned count)
 {
-    const double greatest = std::exp2(count) - 1;
-    return static_cast<std::uint32_t>(std::clamp(std::round((level - lowest) * stepsPerUnit), 0.0, greatest));
+    const double max = std::exp2(count) - 1;
+    return static_cast<std::uint32_t>(std::clamp(std::round((level - min) * stepsPerUnit), 0.0, max));
 }
 
 } // namespace spectrel

@@ -27,8 +27,8 @@ private:
     unsigned _used = 0; // bits of the last byte; 0: it is full, or there is none
 };
 
-/// A level as a field counts it: whole steps of 1/stepsPerUnit above the lowest, as near as the field's `count` bits
-/// can tell.
-std::uint32_t levelSteps(double level, double lowest, double stepsPerUnit, unsigned count);
+/// A level as a field counts it: whole steps of 1/stepsPerUnit above `min`, as near as the field's `count` bits
+/// can hold.
+std::uint32_t levelSteps(double level, double min, double stepsPerUnit, unsigned count);
 
 } // namespace spectrel

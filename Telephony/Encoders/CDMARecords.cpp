@@ -1,7 +1,6 @@
 #include "Telephony/Encoders/CDMARecords.h"
 
 #include "Telephony/Encoders/RecordWriter.h"
-#include "Telephony/Simulator/CDMA/CDMAWorld.h"
 
 #include <algorithm>
 #include <cmath>
@@ -13,7 +12,7 @@ namespace spectrel {
 
 namespace {
 
-using Activity = CDMAWorld::Activity;
+using Activity = CDMAActivity;
 
 constexpr std::uint8_t BandClass = 1; // 1.8 to 2.0 GHz
 constexpr std::uint16_t OneXChannel = 425;
@@ -43,14 +42,14 @@ Bytes recordWithSubpackets(std::uint32_t code, Moment time, std::span<const Subp
     return record.take();
 }
 
-std::uint8_t oneXDeviceState(const CDMAWorld& world)
+std::uint8_t oneXDeviceState(const CDMAReport& report)
 {
     constexpr std::uint8_t Paging = 6;
     constexpr std::uint8_t Sleep = 7;
     constexpr std::uint8_t Traffic = 8;
-    if (world.activity() == Activity::Voice)
+    if (report.activity == Activity::Voice)
         return Traffic;
-    return world.isAwake() ? Paging : Sleep;
+    return report.isAwake ? Paging : Sleep;
 }
 
 /// The receiver's gain control: 0 is -63.248 dBm, a step is 0.334 dB.
@@ -59,21 +58,21 @@ std::uint8_t gainOf(double power)
     return static_cast<std::uint8_t>(std::clamp<long>(std::lround((power + 63.248) / 0.334), -128, 127));
 }
 
-Bytes rfContent(const CDMAWorld& world)
+Bytes rfContent(const CDMAReport& report)
 {
     Bytes content {BandClass, BandClass};
     append16(content, OneXChannel);
     append16(content, OneXChannel);
-    content.push_back(gainOf(world.received()));
-    content.push_back(gainOf(world.receivedBySecond()));
-    append16(content, static_cast<std::uint16_t>(std::lround(world.transmitted() * 10)));
+    content.push_back(gainOf(report.received));
+    content.push_back(gainOf(report.receivedBySecond));
+    append16(content, static_cast<std::uint16_t>(std::lround(report.transmitted * 10)));
     return content;
 }
 
 /// Head: chips summed coherently (16 bits), non-coherent sums, scale, number of pilots, of paths, PN of the reference.
 /// A pilot: PN, ten bytes, four bytes a path, two bytes of energy a path (the first is the combined one); all filled
 /// to a multiple of four.
-Bytes activeSetContent(const CDMAWorld& world)
+Bytes activeSetContent(const CDMAReport& report)
 {
     constexpr std::uint16_t Chips = 512;
     constexpr std::uint8_t Sums = 2;
@@ -81,7 +80,7 @@ Bytes activeSetContent(const CDMAWorld& world)
     constexpr std::size_t Paths = 2;
     constexpr double PilotShare = 0.2; // of a sector's power
     constexpr double EnergyOfOne = 9.0 * Chips * Chips * Sums / (1 << (2 * Scale - 3)); // of Ec/Io 0 dB, without noise
-    const auto pilots = world.activePilots();
+    const auto& pilots = report.activePilots;
     Bytes content;
     append16(content, Chips);
     for (const std::size_t value : {std::size_t(Sums), std::size_t(Scale), pilots.size(), Paths})
@@ -109,12 +108,12 @@ FingerList freeFingers()
 }
 
 /// Two fingers on the serving pilot, one on each further; the others are free.
-FingerList fingers(const CDMAWorld& world)
+FingerList fingers(const CDMAReport& report)
 {
     FingerList assigned;
-    const auto pilots = world.activePilots();
-    assigned.emplace_back(pilots.front().pn, 0.8 * world.servingSignal());
-    assigned.emplace_back(pilots.front().pn, 0.2 * world.servingSignal());
+    const auto& pilots = report.activePilots;
+    assigned.emplace_back(pilots.front().pn, 0.8 * report.servingSignal);
+    assigned.emplace_back(pilots.front().pn, 0.2 * report.servingSignal);
     for (std::size_t pilot = 1; pilot < pilots.size(); ++pilot)
         assigned.emplace_back(pilots[pilot].pn, pilots[pilot].share / (1 - pilots[pilot].share));
     assigned.resize(Fingers, {UnassignedPN, 0});
@@ -142,9 +141,9 @@ std::uint8_t evdoDeviceState(Activity activity)
     return 0;
 }
 
-bool hasEVDO(const CDMAWorld& world)
+bool hasEVDO(const CDMAReport& report)
 {
-    return world.activity() != Activity::Voice;
+    return report.activity != Activity::Voice;
 }
 
 std::uint8_t wholePower(double power)
@@ -154,10 +153,10 @@ std::uint8_t wholePower(double power)
 
 } // namespace
 
-Bytes cdmaSystemInformationRecord(const CDMAWorld& world, Moment time)
+Bytes cdmaSystemInformationRecord(const CDMAReport& report, Moment time)
 {
     constexpr std::uint32_t OneXSystem = 2;
-    const CDMASector& sector = world.serving();
+    const CDMASystem& sector = report.serving;
     return RecordWriter(0x134F, time)
         .u8(2) // version
         .zeros(28) // how the system was chosen
@@ -167,65 +166,65 @@ Bytes cdmaSystemInformationRecord(const CDMAWorld& world, Moment time)
         .u16(sector.networkId)
         .zeros(77) // country, channel and time
         .u8(sector.packetZone)
-        .u8(6) // least protocol revision
+        .u8(6) // minimum protocol revision
         .u8(6) // protocol revision in use: IS-2000 release 0
         .zeros(50) // services
         .u16(sector.baseId)
         .take();
 }
 
-Bytes cdmaSearcherRecord(const CDMAWorld& world, Moment time)
+Bytes cdmaSearcherRecord(const CDMAReport& report, Moment time)
 {
     Bytes fingerContent {static_cast<std::uint8_t>(Fingers), 0, 0, 0};
-    for (const auto& [pn, ratio] : fingers(world)) {
+    for (const auto& [pn, ratio] : fingers(report)) {
         append16(fingerContent, pn);
         append16(fingerContent, energyOf(ratio));
     }
     const Subpacket subpackets[] = {
-        {1, {oneXDeviceState(world), 0, 0, 0}},
-        {2, rfContent(world)},
-        {3, activeSetContent(world)},
+        {1, {oneXDeviceState(report), 0, 0, 0}},
+        {2, rfContent(report)},
+        {3, activeSetContent(report)},
         {4, fingerContent},
     };
     return recordWithSubpackets(0x119C, time, subpackets);
 }
 
-Bytes cdmaFrameRecord(const CDMAWorld& world, Moment time)
+Bytes cdmaFrameRecord(const CDMAReport& report, Moment time)
 {
-    if (world.activity() != Activity::Voice)
+    if (report.activity != Activity::Voice)
         return {};
     constexpr std::size_t Frame = 20; // bytes about rates and power control before the frame's flag
     Bytes demodulation(Frame);
-    demodulation.push_back(world.isFrameBad() ? 1 : 0);
+    demodulation.push_back(report.isFrameBad ? 1 : 0);
     demodulation.insert(demodulation.end(), 3, 0);
     const Subpacket subpackets[] = {{10, Bytes(12)}, {11, demodulation}}; // first the common channels'
     return recordWithSubpackets(0x119D, time, subpackets);
 }
 
-Bytes evdoAirLinkRecord(const CDMAWorld& world, Moment time)
+Bytes evdoAirLinkRecord(const CDMAReport& report, Moment time)
 {
     constexpr std::uint16_t Channel = 325;
     constexpr std::uint8_t SessionOpen = 4;
     constexpr std::uint32_t UATI = 0x0A4C17; // low 24 bits of the terminal's address
     return RecordWriter(0x1183, time)
         .u16(BandClass << 11 | Channel)
-        .u8(wholePower(world.received()))
-        .u8(wholePower(world.receivedBySecond()))
-        .u8(wholePower(world.transmitted()))
-        .u16(hasEVDO(world) ? world.serving().pn : UnassignedPN)
+        .u8(wholePower(report.received))
+        .u8(wholePower(report.receivedBySecond))
+        .u8(wholePower(report.transmitted))
+        .u16(hasEVDO(report) ? report.serving.pn : UnassignedPN)
         .zeros(16) // rates asked for and granted
-        .u8(evdoDeviceState(world.activity()))
+        .u8(evdoDeviceState(report.activity))
         .u8(SessionOpen)
         .u16(UATI)
         .u8(UATI >> 16)
-        .u8(world.serving().isHome ? 21 : 22) // color code of the subnet
+        .u8(report.serving.isHome ? 21 : 22) // color code of the subnet
         .zeros(8) // hybrid operation
         .take();
 }
 
-Bytes evdoPilotsRecord(const CDMAWorld& world, Moment time)
+Bytes evdoPilotsRecord(const CDMAReport& report, Moment time)
 {
-    const auto pilots = hasEVDO(world) ? world.activePilots() : std::vector<CDMAPilot>();
+    const auto pilots = hasEVDO(report) ? report.activePilots : std::vector<CDMAPilot>();
     RecordWriter record(0x12B6, time);
     record.u8(2).u8(0).u8(static_cast<std::uint8_t>(pilots.size())).zeros(9); // search windows
     for (const CDMAPilot& pilot : pilots)
@@ -233,42 +232,42 @@ Bytes evdoPilotsRecord(const CDMAWorld& world, Moment time)
     return record.take();
 }
 
-Bytes evdoFingersRecord(const CDMAWorld& world, Moment time)
+Bytes evdoFingersRecord(const CDMAReport& report, Moment time)
 {
     RecordWriter record(0x108A, time);
     record.zeros(9).u8(Fingers);
-    for (const auto& [pn, ratio] : hasEVDO(world) ? fingers(world) : freeFingers())
+    for (const auto& [pn, ratio] : hasEVDO(report) ? fingers(report) : freeFingers())
         record.u16(pn).zeros(4).u16(energyOf(ratio)).zeros(6); // path and lock states
     return record.take();
 }
 
-Bytes evdoForwardCountersRecord(const CDMAWorld& world, Moment time)
+Bytes evdoForwardCountersRecord(const CDMAReport& report, Moment time)
 {
-    if (!hasEVDO(world))
+    if (!hasEVDO(report))
         return {};
-    const EVDOCounters& counters = world.countersAtSecond();
+    const EVDOCounts& counts = report.counts;
     RecordWriter record(0x1192, time);
-    record.u32(world.second());
+    record.u32(report.second);
     for (std::size_t format = 0; format < ForwardFormats.size(); ++format) {
         const std::uint8_t drc = ForwardFormats[format].drc;
-        record.u32(counters.forward()[format]);
+        record.u32(counts.forward[format]);
         if (format + 1 == ForwardFormats.size() || ForwardFormats[format + 1].drc != drc)
-            record.u32(counters.forwardLost()[drc]); // closes its rate
+            record.u32(counts.forwardLost[drc]); // closes its rate
     }
     return record.take();
 }
 
-Bytes evdoReverseCountersRecord(const CDMAWorld& world, Moment time)
+Bytes evdoReverseCountersRecord(const CDMAReport& report, Moment time)
 {
-    if (!hasEVDO(world))
+    if (!hasEVDO(report))
         return {};
-    const EVDOCounters& counters = world.countersAtSecond();
+    const EVDOCounts& counts = report.counts;
     RecordWriter record(0x127E, time);
-    record.u8(1).u32(world.second()); // version first
-    for (std::size_t interlace = 0; interlace < EVDOCounters::Interlaces; ++interlace) {
-        for (std::size_t mode = 0; mode < EVDOCounters::Modes; ++mode) {
+    record.u8(1).u32(report.second); // version first
+    for (std::size_t interlace = 0; interlace < EVDOCounts::Interlaces; ++interlace) {
+        for (std::size_t mode = 0; mode < EVDOCounts::Modes; ++mode) {
             for (std::size_t payload = 0; payload < ReversePayloads.size(); ++payload) {
-                const ReversePackets& packets = counters.reverse(interlace, mode, payload);
+                const ReversePackets& packets = counts.reverse[interlace][mode][payload];
                 for (const std::uint32_t arrived : packets.arrived)
                     record.u32(arrived);
                 record.u32(packets.lost).u32(0); // none was given up before its last subpacket

@@ -7,7 +7,7 @@
 
 namespace spectrel {
 
-/// As many of a list as an 8-bit count can tell, the first 255.
+/// As many of a list as an 8-bit count can hold, the first 255.
 template <typename Element> std::span<const Element> counted(std::span<const Element> list)
 {
     return list.first(std::min<std::size_t>(list.size(), 255));

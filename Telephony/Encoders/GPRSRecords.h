@@ -4,7 +4,7 @@
 #include "Telephony/Reports/GSMUMTSReports.h"
 #include "Values/Bytes.h"
 
-/// Records of the serving GSM cell's GPRS parameters; each tells some of them.
+/// Records of the serving GSM cell's GPRS parameters; each carries some of them.
 namespace spectrel {
 
 /// 0x51F4, 15 bytes: where system information 13 stands.

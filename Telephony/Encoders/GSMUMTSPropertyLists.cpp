@@ -2,7 +2,7 @@
 
 #include "Records/TelephonyConstants.h"
 #include "Telephony/Encoders/PropertyListRecords.h"
-#include "Telephony/Simulator/GSMUMTS/GSMUMTSWorld.h"
+#include "Telephony/Reports/GSMUMTSCellInformation.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
 
@@ -76,34 +76,30 @@ DictionaryRef gsmNeighbour(const GSMCell& cell, bool isMeasured)
 
 } // namespace
 
-Bytes gsmumtsSIMFilesRecord(const MobilityManagement& mobility, Moment time)
+Bytes gsmumtsSIMFilesRecord(const Place& location, const Place& routing, Moment time)
 {
-    const Place& routing = mobility.knownRouting();
-    return simFilesRecord(
-        time, {mobility.knownLocation().locationArea, routing.locationArea, routing.routingArea, "UTRAN preferred"});
+    return simFilesRecord(time, {location.locationArea, routing.locationArea, routing.routingArea, "UTRAN preferred"});
 }
 
-Bytes gsmumtsCellInformationRecord(const GSMUMTSWorld& world, Moment time)
+Bytes gsmumtsCellInformationRecord(const GSMUMTSCellInformation& information, Moment time)
 {
     auto cells = List::make();
-    if (world.now().umtsCell)
-        cells->append(servingUMTSCell(*world.now().umtsCell));
-    if (world.now().gsmCell)
-        cells->append(servingGSMCell(*world.now().gsmCell));
-    if (world.system() != RadioSystem::None) {
-        for (const RankedUMTSCell& cell : world.umts().ranking())
-            cells->append(umtsNeighbour(cell));
-        for (const GSMCell* cell : world.gsm().neighbours())
-            cells->append(gsmNeighbour(*cell, world.measuresGSM()));
-    }
+    if (information.servingUMTS)
+        cells->append(servingUMTSCell(*information.servingUMTS));
+    if (information.servingGSM)
+        cells->append(servingGSMCell(*information.servingGSM));
+    for (const RankedUMTSCell& cell : information.umtsNeighbours)
+        cells->append(umtsNeighbour(cell));
+    for (const GSMCell* cell : information.gsmNeighbours)
+        cells->append(gsmNeighbour(*cell, information.measuresGSM));
     return propertyListRecord(0xFF0001, cells, time);
 }
 
-Bytes packetContextsRecord(const GSMUMTSWorld& world, Moment time)
+Bytes packetContextsRecord(const std::optional<PacketTransfer>& session, Moment time)
 {
-    if (!world.now().hasSession)
+    if (!session)
         return propertyListRecord(0xFF0002, List::make(), time);
-    return packetContextRecord(world.bytesReceived(), world.bytesSent(), time);
+    return packetContextRecord(session->bytesReceived, session->bytesSent, time);
 }
 
 } // namespace spectrel

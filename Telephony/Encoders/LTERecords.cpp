@@ -16,7 +16,7 @@ constexpr double LowestRSRQ = -30; // dB, in idle mode
 constexpr double LowestFilteredRSRQ = -20; // dB, in connected mode
 constexpr std::uint32_t PowerNotPresent = 64;
 constexpr std::uint32_t SearchNotPresent = 32;
-constexpr std::size_t LargestCount = 255;
+constexpr std::size_t MaxCount = 255;
 
 std::uint32_t filteredRSRP(const LTELevels& levels)
 {
@@ -28,12 +28,12 @@ std::uint32_t filteredRSRQ(const LTELevels& levels)
     return levelSteps(levels.rsrq, LowestFilteredRSRQ, 8, 16);
 }
 
-std::uint32_t leastLevelSteps(int dBm)
+std::uint32_t qRxLevMinSteps(int dBm)
 {
     return levelSteps(dBm, LowestPower, 0.5, 6);
 }
 
-std::uint32_t receiveLevelSteps(int decibels)
+std::uint32_t srxlevSteps(int decibels)
 {
     return levelSteps(decibels, -30, 1, 7);
 }
@@ -57,12 +57,12 @@ BitPacker servingFields(const LTEServingReport& report)
     fields.field(7, levelSteps(report.measured.rsrq, LowestRSRQ, 4, 7));
     fields.field(7, levelSteps(report.average.rsrq, LowestRSRQ, 4, 7));
     fields.field(9, levelSteps(report.measured.rssi, LowestPower, 2, 9));
-    fields.field(6, leastLevelSteps(report.leastLevel));
-    fields.field(7, report.greatestPower ? powerSteps(*report.greatestPower, 7) : PowerNotPresent);
-    fields.field(6, powerSteps(report.phonePower, 6)).gap(4);
-    fields.field(7, receiveLevelSteps(report.receiveLevel));
+    fields.field(6, qRxLevMinSteps(report.qRxLevMin));
+    fields.field(7, report.pMax ? powerSteps(*report.pMax, 7) : PowerNotPresent);
+    fields.field(6, powerSteps(report.maxUETransmitPower, 6)).gap(4);
+    fields.field(7, srxlevSteps(report.srxlev));
     fields.field(6, report.cyclesBelowZero);
-    fields.field(6, searchSteps(report.intraSearch)).field(6, searchSteps(report.nonIntraSearch));
+    fields.field(6, searchSteps(report.sIntraSearch)).field(6, searchSteps(report.sNonIntraSearch));
     fields.field(1, report.areRulesUpdated ? 1 : 0).field(4, report.rules).gap(2);
     return fields;
 }
@@ -76,7 +76,7 @@ BitPacker neighbourFields(const LTEIdleNeighbour& neighbour)
     fields.field(9, levelSteps(neighbour.average.rsrp, LowestPower, 2, 9));
     fields.field(7, levelSteps(neighbour.measured.rsrq, LowestRSRQ, 4, 7));
     fields.field(7, levelSteps(neighbour.average.rsrq, LowestRSRQ, 4, 7));
-    fields.field(7, receiveLevelSteps(neighbour.receiveLevel)).gap(2);
+    fields.field(7, srxlevSteps(neighbour.srxlev)).gap(2);
     fields.field(16, neighbour.frequencyOffset).gap(16);
     for (const LTEFrameTiming& antenna : neighbour.antennas)
         fields.field(11, antenna.frames).field(19, antenna.samples).gap(2);
@@ -140,8 +140,8 @@ Bytes lteAntennasRecord(const LTECell& cell, Moment time)
 
 Bytes lteConnectedModeRecord(const LTEConnectedReport& report, Moment time)
 {
-    const std::size_t measured = std::min(report.measured.size(), LargestCount);
-    const std::size_t detected = std::min(report.detected.size(), LargestCount);
+    const std::size_t measured = std::min(report.measured.size(), MaxCount);
+    const std::size_t detected = std::min(report.detected.size(), MaxCount);
     RecordWriter record(0xB179, time);
     record.u8(3).zeros(3); // version
     record.u16(report.channel).u16(report.physicalCellId).u16(report.subframe);
@@ -170,14 +170,14 @@ Bytes lteServingMeasurementRecord(const LTEServingReport& report, Moment time)
 
 Bytes lteNeighbourMeasurementRecord(const LTENeighbourReport& report, Moment time)
 {
-    constexpr std::size_t LargestNeighbourCount = 32;
-    const std::size_t count = std::min(report.neighbours.size(), LargestNeighbourCount);
+    constexpr std::size_t MaxNeighbours = 32;
+    const std::size_t count = std::min(report.neighbours.size(), MaxNeighbours);
     if (count == 0)
         return {};
     RecordWriter record(0xB180, time);
     record.u8(1).zeros(3).u16(report.channel); // version 1
     const BitPacker head = BitPacker()
-                               .field(6, leastLevelSteps(report.leastLevel))
+                               .field(6, qRxLevMinSteps(report.qRxLevMin))
                                .field(5, static_cast<std::uint32_t>(count - 1)) // the last one's index
                                .gap(5);
     record.bytes(head.bytes());
@@ -189,7 +189,7 @@ Bytes lteNeighbourMeasurementRecord(const LTENeighbourReport& report, Moment tim
 Bytes lteReselectionRecord(const ReselectionReport& report, Moment time)
 {
     constexpr std::size_t Stride = 4;
-    const std::size_t count = std::min(report.candidates.size(), LargestCount);
+    const std::size_t count = std::min(report.candidates.size(), MaxCount);
     Bytes candidates;
     for (std::size_t index = 0; index < count; ++index) {
         const Bytes bytes = candidateBytes(report.candidates[index]);

@@ -2,7 +2,7 @@
 
 #include "Records/TelephonyConstants.h"
 #include "Telephony/Encoders/RecordWriter.h"
-#include "Telephony/Simulator/LTE/LTEWorld.h"
+#include "Telephony/Reports/LTECell.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
 #include "Values/PropertyList/PropertyList.h"
@@ -13,8 +13,6 @@
 namespace spectrel {
 
 namespace {
-
-constexpr std::size_t NeighboursTold = 4;
 
 DictionaryRef cellDictionary(const LTECell& cell, std::string_view type)
 {
@@ -69,10 +67,10 @@ Bytes simFilesRecord(Moment time, const SIMFiles& files)
         time);
 }
 
-Bytes lteCellInformationRecord(const LTEWorld& world, Moment time)
+Bytes lteCellInformationRecord(const LTECell& serving, std::span<const LTECell* const> neighbours, Moment time)
 {
-    auto cells = List::make({cellDictionary(world.servingCell(), kRKCellMonitorCellTypeServing)});
-    for (const LTECell* neighbour : world.neighbours(NeighboursTold))
+    auto cells = List::make({cellDictionary(serving, kRKCellMonitorCellTypeServing)});
+    for (const LTECell* neighbour : neighbours)
         cells->append(cellDictionary(*neighbour, kRKCellMonitorCellTypeNeighbor));
     return propertyListRecord(0xFF0001, cells, time);
 }

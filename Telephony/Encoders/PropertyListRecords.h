@@ -5,11 +5,12 @@
 #include "Values/Value.h"
 
 #include <cstdint>
+#include <span>
 #include <string_view>
 
 namespace spectrel {
 
-class LTEWorld;
+struct LTECell;
 
 /// A record of the extra stream whose payload is the property list, in its XML form.
 Bytes propertyListRecord(std::uint32_t code, const Value& payload, Moment time);
@@ -25,8 +26,8 @@ struct SIMFiles {
 /// 0xFF0000: the SIM's elementary files. A test card's: MCC 001, MNC 01.
 Bytes simFilesRecord(Moment time, const SIMFiles& files = {});
 
-/// 0xFF0001: the serving cell and its strongest neighbours.
-Bytes lteCellInformationRecord(const LTEWorld& world, Moment time);
+/// 0xFF0001: the serving cell and its neighbours.
+Bytes lteCellInformationRecord(const LTECell& serving, std::span<const LTECell* const> neighbours, Moment time);
 
 /// 0xFF0002: the one context of a phone before LTE, with what it has transferred.
 Bytes packetContextRecord(std::uint64_t bytesReceived, std::uint64_t bytesSent, Moment time);

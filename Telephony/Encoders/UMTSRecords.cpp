@@ -20,7 +20,7 @@ std::uint32_t rounded(double value)
     return static_cast<std::uint32_t>(std::lround(value));
 }
 
-/// Eleven words, of which the long and the short average and the last value are told.
+/// Eleven words, of which the long and the short average and the last value are written.
 void writeEnergy(RecordWriter& record, const UMTSSetCell& cell)
 {
     const std::uint32_t energy = rounded(std::pow(10, cell.ecno / 10) * FullScaleEnergy);

@@ -4,7 +4,6 @@
 #include "Telephony/Encoders/BitPacker.h"
 #include "Telephony/Encoders/PropertyListRecords.h"
 #include "Telephony/Encoders/RecordWriter.h"
-#include "Telephony/Simulator/UTRAN/UTRANWorld.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
 
@@ -14,7 +13,6 @@ namespace spectrel {
 
 namespace {
 
-constexpr std::size_t NeighboursTold = 4;
 constexpr double BSICReadable = -95; // dBm: of weaker GSM cells the colours are not known
 
 /// RSCP in the 92 levels of a report, 0 being below -115 dBm (3GPP TS 25.123, 9.1.1.1.3).
@@ -26,7 +24,7 @@ std::uint32_t rscpLevel(double dBm)
 BitPacker neighbourFields(const UTRANNeighbour& cell)
 {
     BitPacker fields;
-    fields.field(14, cell.channel).field(7, cell.parameter).field(8, rscpLevel(cell.rscp));
+    fields.field(14, cell.channel).field(7, cell.cellParameterId).field(8, rscpLevel(cell.rscp));
     fields.field(2, static_cast<std::uint32_t>(cell.set)).field(1, cell.isJointlyDetected ? 1 : 0);
     return fields;
 }
@@ -41,7 +39,7 @@ DictionaryRef cellDictionary(const UTRANCell& cell, std::string_view type)
     dictionary->set(kRKCellMonitorLAC, Value::integer(cell.locationArea));
     dictionary->set(kRKCellMonitorCellId, Value::integer(cell.identity));
     dictionary->set(kRKCellMonitorBandInfo, Value::integer(34)); // 2010 to 2025 MHz
-    dictionary->set(kRKCellMonitorSCN, Value::integer(cell.parameter));
+    dictionary->set(kRKCellMonitorSCN, Value::integer(cell.cellParameterId));
     dictionary->set(kRKCellMonitorUARFCN, Value::integer(cell.channel));
     return dictionary;
 }
@@ -69,9 +67,9 @@ Bytes utranServingCellRecord(const UTRANCell& cell, bool isInService, Moment tim
 
 Bytes utranNeighbourRecord(std::span<const UTRANNeighbour> cells, Moment time)
 {
-    constexpr std::size_t LargestCount = 127;
+    constexpr std::size_t MaxCount = 127;
     constexpr std::size_t EntrySize = 16;
-    cells = cells.first(std::min(cells.size(), LargestCount));
+    cells = cells.first(std::min(cells.size(), MaxCount));
     RecordWriter record(0xD00A, time);
     record.zeros(3).u8(static_cast<std::uint32_t>(cells.size() << 1)).zeros(151);
     for (const UTRANNeighbour& cell : cells) {
@@ -83,8 +81,8 @@ Bytes utranNeighbourRecord(std::span<const UTRANNeighbour> cells, Moment time)
 
 Bytes utranGSMNeighbourRecord(std::span<const GSMNeighbour> cells, Moment time)
 {
-    constexpr std::size_t LargestCount = 255;
-    cells = cells.first(std::min(cells.size(), LargestCount));
+    constexpr std::size_t MaxCount = 255;
+    cells = cells.first(std::min(cells.size(), MaxCount));
     RecordWriter record(0xD00E, time);
     record.zeros(3).u8(static_cast<std::uint32_t>(cells.size()));
     for (const GSMNeighbour& cell : cells) {
@@ -98,10 +96,10 @@ Bytes utranGSMNeighbourRecord(std::span<const GSMNeighbour> cells, Moment time)
 
 Bytes utranTransportChannelRecord(const TransportReport& report, Moment time)
 {
-    constexpr std::size_t LargestChannelCount = 63;
-    constexpr std::size_t LargestCompositeCount = 15;
-    const std::size_t channels = std::min(report.channels.size(), LargestChannelCount);
-    const std::size_t composites = std::min(report.composites.size(), LargestCompositeCount);
+    constexpr std::size_t MaxChannels = 63;
+    constexpr std::size_t MaxComposites = 15;
+    const std::size_t channels = std::min(report.channels.size(), MaxChannels);
+    const std::size_t composites = std::min(report.composites.size(), MaxComposites);
     const BitPacker counts = BitPacker()
                                  .gap(6)
                                  .field(6, static_cast<std::uint32_t>(channels))
@@ -123,12 +121,12 @@ Bytes utranSIMFilesRecord(const UTRANCell& cell, Moment time)
     return simFilesRecord(time, {cell.locationArea, cell.locationArea, 1, "UTRAN preferred"});
 }
 
-Bytes utranCellInformationRecord(const UTRANWorld& world, Moment time)
+Bytes utranCellInformationRecord(const UTRANCell& serving, std::span<const UTRANCell* const> others, Moment time)
 {
-    auto cells = List::make({cellDictionary(world.servingCell(), kRKCellMonitorCellTypeServing)});
-    const auto others = world.otherCells();
-    for (std::size_t index = 0; index < std::min(others.size(), NeighboursTold); ++index)
-        cells->append(cellDictionary(*others[index], kRKCellMonitorCellTypeNeighbor));
+    constexpr std::size_t MaxNeighbours = 4;
+    auto cells = List::make({cellDictionary(serving, kRKCellMonitorCellTypeServing)});
+    for (const UTRANCell* cell : others.first(std::min(others.size(), MaxNeighbours)))
+        cells->append(cellDictionary(*cell, kRKCellMonitorCellTypeNeighbor));
     return propertyListRecord(0xFF0001, cells, time);
 }
 

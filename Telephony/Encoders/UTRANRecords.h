@@ -8,8 +8,6 @@
 
 namespace spectrel {
 
-class UTRANWorld;
-
 /// 0xD0E0, radio resource control, 15 bytes. Without a cell in service the mode is marked as not valid.
 Bytes utranRRCRecord(RRCMode mode, bool isInService, Moment time);
 
@@ -29,7 +27,7 @@ Bytes utranTransportChannelRecord(const TransportReport& report, Moment time);
 /// 0xFF0000: the SIM's files, which know the serving cell's location area.
 Bytes utranSIMFilesRecord(const UTRANCell& cell, Moment time);
 
-/// 0xFF0001: the serving cell and its strongest neighbours.
-Bytes utranCellInformationRecord(const UTRANWorld& world, Moment time);
+/// 0xFF0001: the serving cell and the first four of the others, which come strongest first.
+Bytes utranCellInformationRecord(const UTRANCell& serving, std::span<const UTRANCell* const> others, Moment time);
 
 } // namespace spectrel

@@ -15,7 +15,7 @@ bool isDigits(std::string_view text)
     return std::all_of(text.begin(), text.end(), [](char character) { return character >= '0' && character <= '9'; });
 }
 
-/// Zero is how modems tell what they do not know.
+/// Zero is how modems report what they do not know.
 std::optional<std::uint32_t> known(std::string_view text)
 {
     const auto number = hexadecimal(text);

@@ -10,10 +10,10 @@
 
 namespace spectrel {
 
-/// The kinds of cell that a cell-information record can tell.
+/// The kinds of cell that a cell-information record can hold.
 enum class CellKind : std::uint8_t { GSM, UMTS, LTE };
 
-/// One cell as a modem tells it; what it does not tell is absent.
+/// One cell as a modem reports it; what it does not report is absent.
 struct CellFacts {
     CellKind kind = CellKind::GSM;
     bool isServing = false;
@@ -21,7 +21,8 @@ struct CellFacts {
     std::optional<std::uint32_t> areaCode; // location area; tracking area for LTE
     std::optional<std::uint32_t> cellId;
     std::optional<std::uint32_t> channel; // ARFCN, UARFCN or E-ARFCN of the downlink
-    std::optional<std::uint32_t> codeOnAir; // UMTS primary scrambling code (0 to 511), LTE physical cell id (0 to 503)
+    std::optional<std::uint32_t> psc; // UMTS, primary scrambling code, 0 to 511
+    std::optional<std::uint32_t> physicalCellId; // LTE, 0 to 503
     std::optional<std::uint32_t> rxLevel; // GSM, 0 to 63 (3GPP TS 45.008, 8.1.4)
     std::optional<double> power; // dBm: UMTS RSCP, LTE RSRP
     std::optional<double> quality; // dB: UMTS Ec/Io, LTE RSRQ
@@ -47,7 +48,7 @@ struct LocationFacts {
     std::optional<std::uint32_t> cellId;
 };
 
-/// The SIM, as far as modems tell it; an empty text is not known. The IMSI is left where it is: nothing shows it.
+/// The SIM, as far as modems report it; an empty text is not known. The IMSI is left where it is: nothing shows it.
 struct SimFacts {
     std::string iccid;
     std::string operatorId; // digits: the home network
@@ -74,7 +75,7 @@ struct BearerFacts {
     friend bool operator==(const BearerFacts&, const BearerFacts&) = default;
 };
 
-/// One modem as its service tells it now.
+/// One modem as its service reports it now.
 struct ModemFacts {
     std::string id; // the service's own name for it: an object path
     std::string model;
@@ -90,13 +91,13 @@ struct ModemFacts {
     std::vector<BearerFacts> bearers;
 };
 
-/// A hexadecimal number without prefix, as modems tell areas and cells ("8BE3"); none when it is anything else.
+/// A hexadecimal number without prefix, as modems report areas and cells ("8BE3"); none when it is anything else.
 std::optional<std::uint32_t> hexadecimal(std::string_view text);
 
 /// "MCC,MNC,LAC,CI[,TAC]", the last three hexadecimal, a zero for what is not known; none when it is anything else.
 std::optional<LocationFacts> parseLocation(std::string_view text);
 
-/// The serving cell, as far as the place of registration tells it; none when nothing is known of it.
+/// The serving cell, as far as the place of registration names it; none when nothing is known of it.
 std::optional<CellFacts> registeredCell(const ModemFacts& modem, const std::optional<LocationFacts>& location);
 
 /// Five or six digits: MCC and MNC.

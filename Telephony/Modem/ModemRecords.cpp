@@ -16,10 +16,10 @@ namespace spectrel {
 namespace {
 
 constexpr std::string_view NotKnown = "-";
-constexpr std::int32_t NotMeasured = 32767; // how a cell monitor tells a power or ratio that it has not
+constexpr std::int32_t NotMeasured = 32767; // how a cell monitor marks a power or ratio that it has not measured
 constexpr double WeakestLevel = -111; // dBm, the lower end of RXLEV 0; each level is 1 dB (3GPP TS 45.008, 8.1.4)
-constexpr std::size_t LongestRecord = 65536; // type byte and the 65535 bytes that an item length can tell
-constexpr double LargestMeasurement = 1000; // beyond it there is no dBm or dB
+constexpr std::size_t MaxRecordSize = 65536; // type byte and the 65535 bytes that an item length can count
+constexpr double MaxMeasurement = 1000; // beyond it there is no dBm or dB
 
 std::string joined(const std::vector<std::string>& parts)
 {
@@ -42,7 +42,7 @@ void setNumber(Dictionary& cell, std::string_view key, const std::optional<std::
 
 std::optional<std::int32_t> rounded(const std::optional<double>& measured)
 {
-    if (!measured || !(std::abs(*measured) < LargestMeasurement))
+    if (!measured || !(std::abs(*measured) < MaxMeasurement))
         return std::nullopt;
     return static_cast<std::int32_t>(std::lround(*measured));
 }
@@ -87,7 +87,7 @@ void setUMTS(Dictionary& dictionary, const CellFacts& cell, const SignalFacts& s
 {
     setNumber(dictionary, kRKCellMonitorLAC, cell.areaCode);
     setNumber(dictionary, kRKCellMonitorUARFCN, cell.channel);
-    setNumber(dictionary, kRKCellMonitorSCN, cell.codeOnAir);
+    setNumber(dictionary, kRKCellMonitorSCN, cell.psc);
     setMeasuredOrNot(dictionary, kRKCellMonitorRSCP, firstOf(signal.rscp, cell.power));
     setMeasuredOrNot(dictionary, kRKCellMonitorECN0, firstOf(signal.ecio, cell.quality));
     setMeasured(dictionary, kRKCellMonitorRSSI, signal.rssi);
@@ -96,7 +96,7 @@ void setUMTS(Dictionary& dictionary, const CellFacts& cell, const SignalFacts& s
 void setLTE(Dictionary& dictionary, const CellFacts& cell, const SignalFacts& signal)
 {
     setNumber(dictionary, kRKCellMonitorTAC, cell.areaCode);
-    setNumber(dictionary, kRKCellMonitorPID, cell.codeOnAir);
+    setNumber(dictionary, kRKCellMonitorPID, cell.physicalCellId);
     setNumber(dictionary, kRKCellMonitorBandInfo, cell.channel ? lteBand(*cell.channel) : std::nullopt);
     setNumber(dictionary, kRKCellMonitorUARFCN, cell.channel);
     setMeasured(dictionary, kRKCellMonitorRSRP, firstOf(signal.rsrp, cell.power));
@@ -140,24 +140,24 @@ DictionaryRef cellDictionary(const CellFacts& cell, const SignalFacts& signal)
 DictionaryRef contextDictionary(const BearerFacts& bearer)
 {
     auto dictionary = Dictionary::make();
-    const auto tell = [&dictionary](std::string_view key, std::string text) {
+    const auto write = [&dictionary](std::string_view key, std::string text) {
         if (!text.empty())
             dictionary->set(key, std::move(text));
     };
     const auto counted = [](const std::optional<std::uint64_t>& number) {
         return number ? std::to_string(*number) : std::string();
     };
-    tell("Context ID", bearer.id);
-    tell("APN", bearer.apn);
-    tell("Type", bearer.type);
-    tell("Interface", bearer.interface);
-    tell("Address", bearer.address);
-    tell("IPv6 Address", bearer.ipv6Address);
-    tell("Gateway", bearer.gateway);
-    tell("DNS", joined(bearer.dns));
-    tell("State", bearer.state);
-    tell("Bytes Received", counted(bearer.bytesReceived));
-    tell("Bytes Sent", counted(bearer.bytesSent));
+    write("Context ID", bearer.id);
+    write("APN", bearer.apn);
+    write("Type", bearer.type);
+    write("Interface", bearer.interface);
+    write("Address", bearer.address);
+    write("IPv6 Address", bearer.ipv6Address);
+    write("Gateway", bearer.gateway);
+    write("DNS", joined(bearer.dns));
+    write("State", bearer.state);
+    write("Bytes Received", counted(bearer.bytesReceived));
+    write("Bytes Sent", counted(bearer.bytesSent));
     return dictionary;
 }
 
@@ -169,7 +169,7 @@ Bytes listRecord(std::uint32_t code, std::vector<DictionaryRef> elements, Moment
         for (const DictionaryRef& element : elements)
             list->append(element);
         Bytes record = propertyListRecord(code, list, time);
-        if (record.size() <= LongestRecord || elements.empty())
+        if (record.size() <= MaxRecordSize || elements.empty())
             return record;
         elements.pop_back();
     }
@@ -192,18 +192,18 @@ Bytes modemSimRecord(const std::optional<SimFacts>& sim, Moment time)
 
 Bytes modemCellsRecord(const std::vector<CellFacts>& cells, const SignalFacts& signal, Moment time)
 {
-    std::vector<DictionaryRef> told;
-    for (std::size_t place = 0; place < std::min(cells.size(), MostModemElements); ++place)
-        told.push_back(cellDictionary(cells[place], signal));
-    return listRecord(0xFF0001, std::move(told), time);
+    std::vector<DictionaryRef> values;
+    for (std::size_t place = 0; place < std::min(cells.size(), MaxModemElements); ++place)
+        values.push_back(cellDictionary(cells[place], signal));
+    return listRecord(0xFF0001, std::move(values), time);
 }
 
 Bytes modemContextsRecord(const std::vector<BearerFacts>& bearers, Moment time)
 {
-    std::vector<DictionaryRef> told;
-    for (std::size_t place = 0; place < std::min(bearers.size(), MostModemElements); ++place)
-        told.push_back(contextDictionary(bearers[place]));
-    return listRecord(0xFF0002, std::move(told), time);
+    std::vector<DictionaryRef> values;
+    for (std::size_t place = 0; place < std::min(bearers.size(), MaxModemElements); ++place)
+        values.push_back(contextDictionary(bearers[place]));
+    return listRecord(0xFF0002, std::move(values), time);
 }
 
 } // namespace spectrel

@@ -9,11 +9,11 @@
 
 namespace spectrel {
 
-/// The most cells, or contexts, that a record tells; fewer when they would not fit into its 16-bit length.
-inline constexpr std::size_t MostModemElements = 48;
+/// A record holds no more cells, or contexts, than this; fewer when they would not fit into its 16-bit length.
+inline constexpr std::size_t MaxModemElements = 48;
 
-/// 0xFF0000: the SIM's files, those of them that modems tell. Each is in every record, a dash for what is not known, so
-/// that nothing of a SIM that was taken out stays on the screen.
+/// 0xFF0000: the SIM's files, those of them that modems report. Each is in every record, a dash for what is not known,
+/// so that nothing of a SIM that was taken out stays on the screen.
 Bytes modemSimRecord(const std::optional<SimFacts>& sim, Moment time);
 
 /// 0xFF0001: the cells, in their order, one dictionary each; the serving one with what the modem measures of it.

@@ -16,7 +16,7 @@ const std::string HowToPermit = "to permit it, have spectrel-modem.conf and spec
 
 } // namespace
 
-/// One channel's share. A record tells a state: for a client that is busy, only the newest of each kind waits.
+/// One channel's share. A record holds a state: for a client that is busy, only the newest of each kind waits.
 class ModemSource::Stream final : public LogStream {
 public:
     Stream(ModemSource& source, MessageSink& sink)
@@ -48,15 +48,6 @@ private:
     MessageSink& _sink;
     std::array<std::optional<Bytes>, Kinds> _waiting;
 };
-
-/// An action that is dropped once the listening that it belongs to has ended.
-template <typename Action> auto ModemSource::whileListening(Action action)
-{
-    return [listening = std::weak_ptr(_listening), action = std::move(action)](auto&&... arguments) {
-        if (!listening.expired())
-            action(std::forward<decltype(arguments)>(arguments)...);
-    };
-}
 
 ModemSource::ModemSource(RunLoop& runLoop, const Clock& clock, std::unique_ptr<ModemService> service, std::string wish)
     : _runLoop(runLoop)
@@ -107,10 +98,10 @@ void ModemSource::lookAround()
         takeModem(*chosen);
     else if (chosen)
         update(*chosen);
-    tellPresence();
+    printPresence();
 }
 
-void ModemSource::tellPresence()
+void ModemSource::printPresence()
 {
     std::string presence;
     if (_modem)
@@ -121,21 +112,21 @@ void ModemSource::tellPresence()
     else
         presence = _wish.empty() ? "no modem; waiting for one" : "no modem '" + _wish + "'; waiting for it";
     if (presence != std::exchange(_presence, presence))
-        tell(presence);
+        printServiceLine(presence);
 }
 
 void ModemSource::leaveModem()
 {
-    tell(modemName(*_modem) + " is no longer used");
+    printServiceLine(modemName(*_modem) + " is no longer used");
     endListening();
     _modem.reset();
-    endChannels(); // so that the programs tell that nothing is heard any more
+    endChannels(); // so that the programs show that nothing is heard any more
 }
 
 void ModemSource::takeModem(const ModemFacts& modem)
 {
     _modem = modem;
-    _isShortcomingTold = false;
+    _isShortcomingPrinted = false;
     send(Sim);
     send(Contexts);
     beginListening();
@@ -170,10 +161,10 @@ void ModemSource::forgetCells()
 /// Channels live with one modem and one technology: a change ends them, and their clients begin anew.
 void ModemSource::endChannels()
 {
-    _runLoop.async([this, alive = std::weak_ptr(_alive)] {
-        if (!alive.expired() && _basebandHandler)
+    _runLoop.async(_lifetime.guard([this] {
+        if (_basebandHandler)
             _basebandHandler();
-    });
+    }));
 }
 
 void ModemSource::followTechnology()
@@ -181,7 +172,7 @@ void ModemSource::followTechnology()
     if (!_modem->technology || *_modem->technology == _technology)
         return;
     _technology = *_modem->technology;
-    tell("the technology is now " + std::string(technologyName(_technology)));
+    printServiceLine("the technology is now " + std::string(technologyName(_technology)));
     endChannels();
 }
 
@@ -189,7 +180,7 @@ void ModemSource::beginListening()
 {
     if (_listening || !_modem || _streams.empty())
         return;
-    _listening = std::make_shared<bool>(true);
+    _listening.emplace();
     tryEverything();
     _cellTimer = _runLoop.repeat(CellInterval, [this] { askForCells(); });
     askForCells();
@@ -222,12 +213,12 @@ void ModemSource::raiseSignalRate()
     if (_previousSignalRate || !rate || (*rate > 0 && *rate <= SignalRate))
         return;
     _previousSignalRate = rate;
-    _service->setSignalRate(_modem->id, SignalRate, whileListening([this](ModemOutcome outcome) {
+    _service->setSignalRate(_modem->id, SignalRate, _listening->guard([this](ModemOutcome outcome) {
         if (outcome == ModemOutcome::Done)
             return;
         _previousSignalRate.reset();
         if (outcome == ModemOutcome::Denied)
-            tellOnce(_isSignalDenialTold,
+            printOnce(_isSignalDenialPrinted,
                 "this user may not set how often the modem measures (Signal.Setup): signal values are shown only where "
                 "another program has set it; "
                     + HowToPermit);
@@ -250,7 +241,7 @@ void ModemSource::askForCells()
     if (!_canListCells)
         return askForLocation();
     _isAsking = true;
-    _service->listCells(_modem->id, whileListening([this](ModemOutcome outcome, std::vector<CellFacts> cells) {
+    _service->listCells(_modem->id, _listening->guard([this](ModemOutcome outcome, std::vector<CellFacts> cells) {
         takeCells(outcome, std::move(cells));
     }));
 }
@@ -261,12 +252,12 @@ void ModemSource::takeCells(ModemOutcome outcome, std::vector<CellFacts> cells)
     _cells = std::move(cells);
     _canListCells = outcome == ModemOutcome::Done || outcome == ModemOutcome::Failed;
     if (outcome == ModemOutcome::Denied)
-        tellOnce(_isDenialTold,
+        printOnce(_isDenialPrinted,
             "this user may not list the modem's cells (GetCellInfo): only the serving cell is shown, from location and "
             "signal; "
                 + HowToPermit);
     if (outcome == ModemOutcome::Unsupported)
-        tellOnce(_isShortcomingTold,
+        printOnce(_isShortcomingPrinted,
             modemName(*_modem) + " cannot list its cells: only the serving cell is shown, from location and signal");
     if (_cells.empty())
         return askForLocation();
@@ -279,7 +270,7 @@ void ModemSource::askForLocation()
     if (!_canLocate)
         return takeLocation(ModemOutcome::Failed, std::nullopt);
     _isAsking = true;
-    _service->locate(_modem->id, whileListening([this](ModemOutcome outcome, std::optional<LocationFacts> location) {
+    _service->locate(_modem->id, _listening->guard([this](ModemOutcome outcome, std::optional<LocationFacts> location) {
         takeLocation(outcome, std::move(location));
     }));
 }
@@ -292,7 +283,7 @@ void ModemSource::takeLocation(ModemOutcome outcome, std::optional<LocationFacts
     if (outcome == ModemOutcome::Unsupported || outcome == ModemOutcome::Denied)
         _canLocate = false;
     if (outcome == ModemOutcome::Denied)
-        tellOnce(_isLocationDenialTold,
+        printOnce(_isLocationDenialPrinted,
             "this user may not ask where the modem is registered (GetLocation): the serving cell has its network only; "
                 + HowToPermit);
     send(Cells);
@@ -321,10 +312,10 @@ void ModemSource::send(Kind kind)
         stream->send(kind, made);
 }
 
-void ModemSource::tellOnce(bool& isTold, const std::string& line)
+void ModemSource::printOnce(bool& isPrinted, const std::string& line)
 {
-    if (!std::exchange(isTold, true))
-        tell(line);
+    if (!std::exchange(isPrinted, true))
+        printServiceLine(line);
 }
 
 } // namespace spectrel

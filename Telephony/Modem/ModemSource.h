@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Platform/Clock.h"
+#include "Platform/Lifetime.h"
 #include "Platform/RunLoop.h"
 #include "Telephony/LogSource.h"
 #include "Telephony/Modem/ModemService.h"
@@ -15,7 +16,7 @@
 
 namespace spectrel {
 
-/// A real modem: what its service tells of it becomes the records of cell information, SIM files and packet data
+/// A real modem: what its service reports of it becomes the records of cell information, SIM files and packet data
 /// contexts. Asks nothing of the modem while nobody listens.
 ///
 /// The technology is that of the modem's access technology; while that is not known, the last known one, at first GSM.
@@ -40,7 +41,7 @@ private:
     class Stream;
 
     void lookAround();
-    void tellPresence();
+    void printPresence();
     void leaveModem();
     void takeModem(const ModemFacts& modem);
     void update(const ModemFacts& modem);
@@ -60,27 +61,26 @@ private:
 
     Bytes record(Kind kind) const;
     void send(Kind kind);
-    void tellOnce(bool& isTold, const std::string& line);
+    void printOnce(bool& isPrinted, const std::string& line);
     void remove(Stream& stream);
-    template <typename Action> auto whileListening(Action action);
 
     RunLoop& _runLoop;
     const Clock& _clock;
     std::unique_ptr<ModemService> _service;
     std::string _wish;
     std::function<void()> _basebandHandler;
-    std::shared_ptr<bool> _alive = std::make_shared<bool>(true);
+    Lifetime _lifetime;
 
     Technology _technology = Technology::GSM;
     std::optional<ModemFacts> _modem; // the one in use
-    std::string _presence; // what was last told of modems there or not
-    bool _isDenialTold = false;
-    bool _isShortcomingTold = false;
-    bool _isLocationDenialTold = false;
-    bool _isSignalDenialTold = false;
+    std::string _presence; // the newest line about modems there or not
+    bool _isDenialPrinted = false;
+    bool _isShortcomingPrinted = false;
+    bool _isLocationDenialPrinted = false;
+    bool _isSignalDenialPrinted = false;
 
     std::vector<Stream*> _streams;
-    std::shared_ptr<bool> _listening; // to one modem, from the first channel or the modem's coming on
+    std::optional<Lifetime> _listening; // to one modem, from the first channel or the modem's coming on
     std::unique_ptr<Timer> _cellTimer;
     std::optional<std::uint32_t> _previousSignalRate; // to be put back
     bool _isAsking = false; // for cells or location, and not answered yet

@@ -7,7 +7,7 @@
 #include <optional>
 #include <vector>
 
-/// What a GSM/UMTS phone tells about itself, in natural units; the encoders write it as log records.
+/// What a GSM/UMTS phone reports about itself, in natural units; the encoders write it as log records.
 namespace spectrel {
 
 // Mobility
@@ -52,6 +52,20 @@ struct NetworkReport {
     friend bool operator==(const NetworkReport&, const NetworkReport&) = default;
 };
 
+/// Where a phone is, as its network counts places.
+struct Place {
+    RadioSystem system = RadioSystem::None;
+    std::uint16_t locationArea = 0xFFFE;
+    std::uint8_t routingArea = 0xFF;
+    friend bool operator==(const Place&, const Place&) = default;
+};
+
+/// What a packet data session has transferred.
+struct PacketTransfer {
+    std::uint64_t bytesReceived = 0;
+    std::uint64_t bytesSent = 0;
+};
+
 // UMTS
 
 /// The sets of 3GPP TS 25.331, 8.4.0.
@@ -79,7 +93,7 @@ struct RankedUMTSCell {
     double rankedRscp = 0; // dBm, averaged
     double ecno = 0; // dB
     double rank = 0; // R of 3GPP TS 25.304, 5.2.6.1.4
-    bool isMeasured = true; // heard for long enough to tell its level
+    bool isMeasured = true; // heard for long enough to know its level
 };
 
 struct RankedGSMCell {

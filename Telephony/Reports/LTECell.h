@@ -8,20 +8,20 @@
 namespace spectrel {
 
 /// What the cells of one carrier have in common, with what they broadcast for reselection (3GPP TS 36.304, 5.2.4;
-/// 36.331, SystemInformationBlockType3 and 5). Levels in dBm, thresholds in dB above the least level.
+/// 36.331, SystemInformationBlockType3 and 5). Levels in dBm, thresholds in dB above Qrxlevmin.
 struct LTELayer {
     std::uint8_t band;
     std::uint16_t downlinkChannel; // E-ARFCN
     std::uint8_t resourceBlocks;
     double power; // dBm a resource element
     std::uint8_t priority; // 0 to 7, the highest wins
-    int leastLevel; // Qrxlevmin, even
-    std::optional<int> greatestPower; // P-Max, dBm
-    std::optional<int> intraSearch; // even; without it neighbours are always measured
-    std::optional<int> nonIntraSearch; // even
-    int highThreshold; // to move up to this layer
-    int lowThreshold; // to move down to it
-    int servingLowThreshold; // below it the phone moves down from here
+    int qRxLevMin; // dBm, even
+    std::optional<int> pMax; // dBm
+    std::optional<int> sIntraSearch; // even; without it neighbours are always measured
+    std::optional<int> sNonIntraSearch; // even
+    int threshHigh; // to move up to this layer
+    int threshLow; // to move down to it
+    int threshServingLow; // below it the phone moves down from here
 };
 
 /// Levels of one measurement. They agree: RSRQ = 10 lg N + RSRP - RSSI, N being the carrier's resource blocks.
@@ -58,9 +58,9 @@ struct LTECell {
     LTELevels average; // filtered over the last measurements
 
     /// Srxlev, dB (3GPP TS 36.304, 5.2.3.2). The phone may send as strong as any layer allows: no compensation.
-    int receiveLevel() const
+    int srxlev() const
     {
-        return static_cast<int>(std::floor(average.rsrp)) - layer->leastLevel;
+        return static_cast<int>(std::floor(average.rsrp)) - layer->qRxLevMin;
     }
 };
 

@@ -6,7 +6,7 @@
 #include <optional>
 #include <vector>
 
-/// What an LTE phone finds out, for the records to tell. Levels in dBm and dB, channels as E-ARFCN.
+/// What an LTE phone finds out, for the records. Levels in dBm and dB, channels as E-ARFCN.
 namespace spectrel {
 
 /// A measured neighbour in a connection.
@@ -32,13 +32,13 @@ struct LTEServingReport {
     std::uint8_t priority = 0;
     LTELevels measured;
     LTELevels average;
-    int leastLevel = -140; // Qrxlevmin
-    std::optional<int> greatestPower; // P-Max
-    int phonePower = 0; // dBm, the most that the phone itself sends
-    int receiveLevel = 0; // Srxlev
+    int qRxLevMin = -140; // dBm
+    std::optional<int> pMax; // dBm
+    int maxUETransmitPower = 0; // dBm, the phone's own limit
+    int srxlev = 0; // dB
     unsigned cyclesBelowZero = 0; // how many in a row Srxlev was below 0
-    std::optional<int> intraSearch;
-    std::optional<int> nonIntraSearch;
+    std::optional<int> sIntraSearch;
+    std::optional<int> sNonIntraSearch;
     bool areRulesUpdated = false;
     std::uint8_t rules = 0; // LTEMeasurementRule
 };
@@ -60,7 +60,7 @@ struct LTEIdleNeighbour {
     std::uint16_t physicalCellId = 0;
     LTELevels measured;
     LTELevels average;
-    int receiveLevel = 0; // Srxlev
+    int srxlev = 0; // dB
     std::uint16_t frequencyOffset = 0; // Hz
     LTEFrameTiming antennas[2];
 };
@@ -68,7 +68,7 @@ struct LTEIdleNeighbour {
 /// One carrier's neighbours as idle mode measures them.
 struct LTENeighbourReport {
     std::uint16_t channel = 0;
-    int leastLevel = -140; // Qrxlevmin
+    int qRxLevMin = -140; // dBm
     std::vector<LTEIdleNeighbour> neighbours; // at least one, at most 32
 };
 

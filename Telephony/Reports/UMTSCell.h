@@ -29,8 +29,8 @@ struct UMTSCell {
 
 /// What cell selection asks of a cell (3GPP TS 25.304, 5.2.3.1.2), as the simulated network broadcasts it.
 namespace UMTSThresholds {
-constexpr double MinimumEcno = -18; // dB, Qqualmin
-constexpr double MinimumRscp = -115; // dBm, Qrxlevmin
+constexpr double QQualMin = -18; // dB
+constexpr double QRxLevMin = -115; // dBm
 constexpr double SearchGSMBelow = -14; // dB of Ec/No: Qqualmin + SsearchRAT
 constexpr double Hysteresis = 2; // dB, Qhyst1s
 constexpr double GSMOffset = 7; // dB, Qoffset1 of GSM neighbours

@@ -10,7 +10,7 @@ struct UTRANCell {
     std::uint16_t locationArea = 0;
     std::uint8_t registrationArea = 0; // URA
     std::uint16_t channel = 0; // UARFCN: 5 * MHz (3GPP TS 25.102, 5.4.4)
-    std::uint8_t parameter = 0; // 0 to 127: names its scrambling code (3GPP TS 25.223, table 6)
+    std::uint8_t cellParameterId = 0; // 0 to 127: its scrambling code's number (3GPP TS 25.223, table 6)
     double position = 0; // metres along the road
     double offset = 0; // metres beside it
     double rscp = -130; // dBm, of its common control channel, now
@@ -19,8 +19,8 @@ struct UTRANCell {
 /// What the network broadcasts for reselection (3GPP TS 25.304, 5.2.3 and 5.2.6), the same in every cell. It broadcasts
 /// no Sintrasearch: a phone measures the serving cell's channel always.
 namespace UTRANThresholds {
-constexpr double LeastRSCP = -103; // dBm, Qrxlevmin
-constexpr double SearchBelow = 50; // dB of Srxlev, Sintersearch
+constexpr double QRxLevMin = -103; // dBm
+constexpr double SInterSearch = 50; // dB of Srxlev
 constexpr double Hysteresis = 4; // dB, Qhyst1s
 } // namespace UTRANThresholds
 

@@ -6,7 +6,7 @@
 #include <cstdint>
 #include <vector>
 
-/// What a UTRAN phone finds out, for the records to tell.
+/// What a UTRAN phone finds out, for the records.
 namespace spectrel {
 
 /// As the record numbers them.
@@ -17,7 +17,7 @@ enum class UTRANCellSet : std::uint8_t { Active, Monitored, Detected };
 
 struct UTRANNeighbour {
     std::uint16_t channel = 0; // UARFCN
-    std::uint8_t parameter = 0; // 0 to 127
+    std::uint8_t cellParameterId = 0; // 0 to 127
     double rscp = -130; // dBm
     UTRANCellSet set = UTRANCellSet::Monitored;
     bool isJointlyDetected = false; // its users' signals are detected together with the own one

@@ -2,7 +2,7 @@
 
 #include "Platform/Clock.h"
 #include "Records/Recording.h"
-#include "Telephony/Simulator/Radio.h"
+#include "Telephony/Simulator/Journey.h"
 #include "Values/Bytes.h"
 
 #include <chrono>

@@ -1,6 +1,8 @@
 #pragma once
 
-#include "Telephony/Simulator/Radio.h"
+#include "Telephony/Simulator/Dice.h"
+#include "Telephony/Simulator/Journey.h"
+#include "Telephony/Simulator/Propagation.h"
 
 #include <chrono>
 #include <cstddef>

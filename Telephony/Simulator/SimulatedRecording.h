@@ -12,7 +12,7 @@ namespace spectrel {
 constexpr Moment SimulatedRecordingStart {std::chrono::seconds(1767254400)};
 
 /// Writes as much of the baseband's life into a capture file as `duration` says, without waiting. False when the file
-/// cannot be written, with `reason` telling why (without its name).
+/// cannot be written, with `reason` saying why (without its name).
 bool writeSimulatedRecording(
     Baseband& baseband, const std::string& path, std::chrono::milliseconds duration, std::string& reason);
 

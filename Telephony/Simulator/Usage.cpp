@@ -5,7 +5,7 @@ namespace spectrel {
 Habit::Habit(Span pauses, Span times, Span first, Dice& dice)
     : _pauses(pauses)
     , _times(times)
-    , _left(dice.between(first.shortest, first.longest))
+    , _left(dice.between(first.min, first.max))
 {
 }
 
@@ -16,7 +16,7 @@ void Habit::advance(std::chrono::milliseconds step, Dice& dice)
         return;
     _isOn = !_isOn;
     const Span& span = _isOn ? _times : _pauses;
-    _left = dice.between(span.shortest, span.longest);
+    _left = dice.between(span.min, span.max);
 }
 
 Usage::Usage(Dice& dice)

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Telephony/Simulator/Radio.h"
+#include "Telephony/Simulator/Dice.h"
 
 #include <chrono>
 
@@ -9,10 +9,10 @@ namespace spectrel {
 /// Something that its user does now and then.
 class Habit {
 public:
-    /// Seconds, shortest and longest.
+    /// In seconds.
     struct Span {
-        double shortest;
-        double longest;
+        double min;
+        double max;
     };
 
     /// `first`: until it begins for the first time.

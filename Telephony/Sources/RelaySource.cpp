@@ -65,10 +65,7 @@ std::unique_ptr<LogStream> RelaySource::start(MessageSink& sink)
     auto stream = std::make_unique<Stream>(*this, sink);
     _streams.push_back(stream.get());
     // From the queue: the channel does not have its stream yet.
-    _runLoop.async([this, alive = std::weak_ptr(_alive)] {
-        if (!alive.expired())
-            pump();
-    });
+    _runLoop.async(_lifetime.guard([this] { pump(); }));
     return stream;
 }
 
@@ -80,7 +77,7 @@ void RelaySource::remove(Stream& stream)
 void RelaySource::writerCame()
 {
     if (_input->takesFurtherWriters())
-        tell(_input->name() + ": a writer has come");
+        printServiceLine(_input->name() + ": a writer has come");
     _stream = makeRecordingStream(_givenTechnology);
 }
 
@@ -141,7 +138,7 @@ bool RelaySource::take(StreamStep step, const RecordedMessage& message)
         return true;
     case StreamStep::Skipped: {
         const SkippedBytes& skipped = _stream->skipped();
-        tell(_input->name() + ": skipped " + std::to_string(skipped.length) + " bytes at byte "
+        printServiceLine(_input->name() + ": skipped " + std::to_string(skipped.length) + " bytes at byte "
             + std::to_string(skipped.offset) + " of the stream: " + skipped.reason);
         _skippedBytes += skipped.length;
         ++_skippedPlaces;
@@ -158,23 +155,21 @@ void RelaySource::begin()
 {
     const auto before = std::exchange(_technology, _stream->technology());
     if (before != _technology || _streams.empty())
-        tell(_input->name() + ": a stream of technology " + std::string(technologyName(*_technology)));
+        printServiceLine(_input->name() + ": a stream of technology " + std::string(technologyName(*_technology)));
     if (!before || before == _technology || !_basebandHandler)
         return;
     _isChanging = true;
-    _runLoop.async([this, alive = std::weak_ptr(_alive)] {
-        if (alive.expired())
-            return;
+    _runLoop.async(_lifetime.guard([this] {
         _isChanging = false;
         if (_basebandHandler)
             _basebandHandler(); // ends the channels, and with them their streams
         pump();
-    });
+    }));
 }
 
 void RelaySource::refuse()
 {
-    tell(_input->name() + ": the stream is refused: " + _stream->reason());
+    printServiceLine(_input->name() + ": the stream is refused: " + _stream->reason());
     _stream.reset();
     if (!_ending)
         _input->dropWriter();
@@ -185,7 +180,7 @@ void RelaySource::refuse()
 
 void RelaySource::finishWriter()
 {
-    tell(_input->name() + ": the writer has ended" + (_ending->empty() ? "" : " (" + *_ending + ")")
+    printServiceLine(_input->name() + ": the writer has ended" + (_ending->empty() ? "" : " (" + *_ending + ")")
         + (_input->takesFurtherWriters() ? "; waiting for the next one" : "; the stream is over"));
     _stream.reset();
     _ending.reset();
@@ -197,15 +192,13 @@ void RelaySource::settleSoon()
 {
     if (!_stream || std::exchange(_isSettling, true))
         return;
-    _runLoop.after(SettlingTime, [this, alive = std::weak_ptr(_alive)] {
-        if (alive.expired())
-            return;
+    _runLoop.after(SettlingTime, _lifetime.guard([this] {
         _isSettling = false;
         if (!_stream)
             return;
         _stream->settle();
         pump();
-    });
+    }));
 }
 
 std::string RelaySource::status() const

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Platform/Lifetime.h"
 #include "Platform/RunLoop.h"
 #include "Platform/StreamInput.h"
 #include "Records/Recording.h"
@@ -26,8 +27,8 @@ public:
     /// What the stream's end decides on a message is decided when nothing has come for so long.
     static constexpr std::chrono::milliseconds SettlingTime {100};
 
-    /// `technology`: where the stream does not tell it. `onFailure` is called, from the queue, when the only stream
-    /// that the input will ever carry cannot be used; the reason has been told.
+    /// `technology`: where the stream does not name it. `onFailure` is called, from the queue, when the only stream
+    /// that the input will ever carry cannot be used; the reason has been printed.
     RelaySource(RunLoop& runLoop, std::unique_ptr<StreamInput> input, std::optional<Technology> technology,
         std::function<void()> onFailure);
     ~RelaySource() override;
@@ -36,7 +37,7 @@ public:
     {
         return _technology.value_or(Technology::LTE);
     }
-    /// The stream's first bytes tell the technology.
+    /// The stream's first bytes name the technology.
     bool isReady() const override
     {
         return _technology.has_value();
@@ -69,7 +70,7 @@ private:
     std::optional<Technology> _givenTechnology;
     std::function<void()> _onFailure;
     std::function<void()> _basebandHandler;
-    std::shared_ptr<bool> _alive = std::make_shared<bool>(true);
+    Lifetime _lifetime;
 
     std::optional<Technology> _technology; // of the latest stream
     std::unique_ptr<RecordingStream> _stream; // of the current writer, until all it wrote is relayed

@@ -29,13 +29,13 @@ public:
     {
         _fits = take(character) && _fits;
     }
-    /// A number of exactly so many digits, at most `largest`.
-    int number(std::size_t digits, int largest)
+    /// A number of exactly so many digits, at most `max`.
+    int number(std::size_t digits, int max)
     {
         int value = 0;
         const std::string_view text = _text.substr(0, digits);
         const auto end = std::from_chars(text.data(), text.data() + text.size(), value);
-        _fits = _fits && text.size() == digits && end.ptr == text.data() + digits && value >= 0 && value <= largest;
+        _fits = _fits && text.size() == digits && end.ptr == text.data() + digits && value >= 0 && value <= max;
         _text.remove_prefix(text.size());
         return value;
     }

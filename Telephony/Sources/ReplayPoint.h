@@ -9,7 +9,7 @@
 
 namespace spectrel {
 
-/// A place on a recording's time line, as a user tells it.
+/// A place on a recording's time line, as a user writes it.
 class ReplayPoint {
 public:
     /// So long after the recording's first message.

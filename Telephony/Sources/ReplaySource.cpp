@@ -1,5 +1,6 @@
 #include "Telephony/Sources/ReplaySource.h"
 
+#include "Platform/Lifetime.h"
 #include "Telephony/ServiceLine.h"
 
 #include <cmath>
@@ -14,7 +15,7 @@ constexpr int MessagesPerTurn = 64;
 /// Messages passed over in one turn.
 constexpr int PassedPerTurn = 20'000;
 /// Of the time between two files, what is waited for.
-constexpr std::chrono::seconds LongestGap {10};
+constexpr std::chrono::seconds MaxGap {10};
 
 } // namespace
 
@@ -26,7 +27,6 @@ public:
         , _clock(clock)
         , _options(options)
         , _sink(sink)
-        , _alive(std::make_shared<bool>(true))
     {
         later(std::chrono::nanoseconds::zero());
     }
@@ -67,10 +67,7 @@ private:
 
     void later(std::chrono::nanoseconds delay)
     {
-        const auto job = [this, alive = std::weak_ptr(_alive)] {
-            if (!alive.expired())
-                play();
-        };
+        const auto job = _lifetime.guard([this] { play(); });
         if (delay > std::chrono::nanoseconds::zero())
             _runLoop.after(delay, job);
         else
@@ -82,12 +79,12 @@ private:
     {
         if (_options.speed <= 0)
             return {};
-        const bool isAfterGap = _isFirstOfFile && _message->time - _last > LongestGap;
-        if (!_origin || _message->time < _last || isAfterGap) {
+        const bool isAfterGap = _isFirstOfFile && _message->time - _previous > MaxGap;
+        if (!_origin || _message->time < _previous || isAfterGap) {
             _origin = _message->time;
             _startedAt = _clock.now();
         }
-        _last = _message->time;
+        _previous = _message->time;
         _isFirstOfFile = false;
         const auto recorded = static_cast<double>((_message->time - *_origin).count());
         const std::chrono::microseconds place(std::llround(recorded / _options.speed));
@@ -126,7 +123,7 @@ private:
     bool openNext()
     {
         if (_reader && !_reader->damage().empty())
-            tell(_options.files[_file - 1] + ": " + _reader->damage());
+            printServiceLine(_options.files[_file - 1] + ": " + _reader->damage());
         _reader.reset();
         while (!_reader) {
             if (_file == _options.files.size() && !rewind())
@@ -134,7 +131,7 @@ private:
             std::string reason;
             _reader = openRecording(_options.files[_file++], reason);
             if (!_reader)
-                tell(_options.files[_file - 1] + ": " + reason);
+                printServiceLine(_options.files[_file - 1] + ": " + reason);
         }
         _isFirstOfFile = true;
         return true;
@@ -145,8 +142,8 @@ private:
         const bool hasPlayed = std::exchange(_hasPlayed, false);
         _isEmpty = _isEmpty && !hasPlayed;
         if (!_options.loop || !hasPlayed) {
-            tell(_isEmpty && _range ? "the replay has ended: no message lies between --from and --to"
-                                    : "the replay has ended");
+            printServiceLine(_isEmpty && _range ? "the replay has ended: no message lies between --from and --to"
+                                                : "the replay has ended");
             return false;
         }
         _file = 0;
@@ -158,14 +155,14 @@ private:
     const Clock& _clock;
     const ReplayOptions& _options;
     MessageSink& _sink;
-    std::shared_ptr<bool> _alive;
+    Lifetime _lifetime;
     std::unique_ptr<RecordingReader> _reader;
     std::size_t _file = 0; // the next one to open
     std::optional<RecordedMessage> _message; // read, not delivered yet
     std::optional<std::pair<Moment, Moment>> _range; // of the messages to play; known from the first message on
     std::optional<Moment> _origin;
     Moment _startedAt {};
-    Moment _last {}; // the latest message's time
+    Moment _previous {}; // that of the message before
     bool _isFirstOfFile = false;
     bool _isEmpty = true; // nothing was played so far
     bool _isStopped = false; // the client had no room
@@ -190,17 +187,17 @@ std::unique_ptr<ReplaySource> ReplaySource::open(
             reason = file + ": " + reason;
             return nullptr;
         }
-        const auto told = reader->technology() ? reader->technology() : options.technology;
-        if (!told) {
+        const auto named = reader->technology() ? reader->technology() : options.technology;
+        if (!named) {
             reason = file + ": does not tell its technology; name it with --technology";
             return nullptr;
         }
-        if (technology && technology != told) {
-            reason = file + ": is of technology " + std::string(technologyName(*told)) + ", the first file of "
+        if (technology && technology != named) {
+            reason = file + ": is of technology " + std::string(technologyName(*named)) + ", the first file of "
                 + std::string(technologyName(*technology));
             return nullptr;
         }
-        technology = told;
+        technology = named;
     }
     if (!technology) {
         reason = "no file to replay";

@@ -18,7 +18,7 @@ struct ReplayOptions {
     std::vector<std::string> files; // one after the other
     double speed = 1; // times as fast as recorded; 0: as fast as the client takes them
     bool loop = false;
-    std::optional<Technology> technology; // where a file does not tell
+    std::optional<Technology> technology; // where a file does not name one
     std::optional<ReplayPoint> from {}; // messages before it are passed over
     std::optional<ReplayPoint> to {}; // and those after it
 };
@@ -30,7 +30,7 @@ struct ReplayOptions {
 /// it goes on at once.
 class ReplaySource final : public LogSource {
 public:
-    /// Null when a file cannot be read, does not tell its technology, or tells another one than the first; `reason`
+    /// Null when a file cannot be read, names no technology, or another one than the first; `reason`
     /// names the file.
     static std::unique_ptr<ReplaySource> open(
         RunLoop& runLoop, const Clock& clock, ReplayOptions options, std::string& reason);

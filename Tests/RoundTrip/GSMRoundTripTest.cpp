@@ -174,7 +174,7 @@ TEST_F(GSMRoundTripTest, CellInformationShowsTheServingCellAndItsNeighbours)
 {
     for (std::uint32_t seed = 1; seed <= 2; ++seed) {
         drive(seed, 8, [&](const GSMUMTSWorld& world) {
-            deliver(gsmumtsCellInformationRecord(world, Now));
+            deliver(gsmumtsCellInformationRecord(world.cellInformation(), Now));
             if (const GSMCell* cell = world.now().gsmCell) {
                 EXPECT_EQ(shown("GSM Serving Cell", "Cell ID"), std::to_string(cell->identity));
                 EXPECT_EQ(shown("GSM Serving Cell", "ARFCN"), std::to_string(cell->arfcn));

@@ -65,13 +65,13 @@ TEST_F(LTERoundTripTest, ServingMeasurement)
         EXPECT_NEAR(number(Serving, "Measured RSRQ"), report.measured.rsrq, 0.13);
         EXPECT_NEAR(number(Serving, "Average RSRQ"), report.average.rsrq, 0.13);
         EXPECT_NEAR(number(Serving, "Measured RSSI"), report.measured.rssi, 0.26);
-        EXPECT_EQ(number(Serving, "Qrxlevmin"), report.leastLevel);
-        EXPECT_EQ(text(Serving, "P_Max"), optional(report.greatestPower, " dBm"));
-        EXPECT_EQ(number(Serving, "Max UE Tx Power"), report.phonePower);
-        EXPECT_EQ(number(Serving, "Srxlev"), report.receiveLevel);
+        EXPECT_EQ(number(Serving, "Qrxlevmin"), report.qRxLevMin);
+        EXPECT_EQ(text(Serving, "P_Max"), optional(report.pMax, " dBm"));
+        EXPECT_EQ(number(Serving, "Max UE Tx Power"), report.maxUETransmitPower);
+        EXPECT_EQ(number(Serving, "Srxlev"), report.srxlev);
         EXPECT_EQ(number(Serving, "Num of Consecutive DRX Cycles of S < 0"), report.cyclesBelowZero);
-        EXPECT_EQ(text(Serving, "S Intra Search"), optional(report.intraSearch, " dB"));
-        EXPECT_EQ(text(Serving, "S Non Intra Search"), optional(report.nonIntraSearch, " dBm"));
+        EXPECT_EQ(text(Serving, "S Intra Search"), optional(report.sIntraSearch, " dB"));
+        EXPECT_EQ(text(Serving, "S Non Intra Search"), optional(report.sNonIntraSearch, " dBm"));
         EXPECT_EQ(text(Serving, "Measurement Rules Updated"), report.areRulesUpdated ? "True" : "False");
         EXPECT_EQ(number(Serving, "Measurement Rules"), report.rules);
     });
@@ -98,7 +98,7 @@ TEST_F(LTERoundTripTest, IdleNeighbours)
             return;
         deliver(lteNeighbourMeasurementRecord(report, Time));
         EXPECT_EQ(number("Neighbor Measurements", "E-ARFCN"), report.channel);
-        EXPECT_EQ(number("Neighbor Measurements", "Qrxlevmin"), report.leastLevel);
+        EXPECT_EQ(number("Neighbor Measurements", "Qrxlevmin"), report.qRxLevMin);
         const List& cells = list("Neighbor Cells List");
         ASSERT_EQ(cells.count(), report.neighbours.size());
         for (std::size_t index = 0; index < cells.count(); ++index, ++shown) {
@@ -110,7 +110,7 @@ TEST_F(LTERoundTripTest, IdleNeighbours)
             EXPECT_NEAR(numberOf(cell, "Average RSRP"), truth.average.rsrp, 0.26);
             EXPECT_NEAR(numberOf(cell, "Measured RSRQ"), truth.measured.rsrq, 0.13);
             EXPECT_NEAR(numberOf(cell, "Average RSRQ"), truth.average.rsrq, 0.13);
-            EXPECT_EQ(numberOf(cell, "Srxlev"), std::max(truth.receiveLevel, -30));
+            EXPECT_EQ(numberOf(cell, "Srxlev"), std::max(truth.srxlev, -30));
             EXPECT_EQ(numberOf(cell, "Frequency Offset"), truth.frequencyOffset);
             EXPECT_EQ(numberOf(cell, "Ant 0 Frame Offset"), truth.antennas[0].frames);
             EXPECT_EQ(numberOf(cell, "Ant 0 Sample Offset"), truth.antennas[0].samples);

@@ -112,7 +112,7 @@ TEST_F(MobilityRoundTripTest, CardShowsTheTestNetworkAndTheKnownAreas)
 {
     char area[8];
     drive(1, 8, [&](const GSMUMTSWorld& world) {
-        deliver(gsmumtsSIMFilesRecord(world.mobility(), Now));
+        deliver(gsmumtsSIMFilesRecord(world.mobility().knownLocation(), world.mobility().knownRouting(), Now));
         std::snprintf(area, sizeof area, "%04X", world.mobility().knownLocation().locationArea);
         EXPECT_EQ(shown("SIM Info", "EF-LOCI"), "00F110 " + std::string(area) + " FE");
         std::snprintf(area, sizeof area, "%04X", world.mobility().knownRouting().locationArea);
@@ -125,7 +125,7 @@ TEST_F(MobilityRoundTripTest, CardShowsTheTestNetworkAndTheKnownAreas)
 TEST_F(MobilityRoundTripTest, ContextsShowWhatTheyHaveTransferred)
 {
     drive(1, 8, [&](const GSMUMTSWorld& world) {
-        deliver(packetContextsRecord(world, Now));
+        deliver(packetContextsRecord(world.session(), Now));
         ASSERT_EQ(list("PDP Context Info").count(), world.now().hasSession ? 1u : 0u);
         if (world.now().hasSession) {
             EXPECT_EQ(text(entry("PDP Context Info", 0), "Bytes Received"), std::to_string(world.bytesReceived()));

@@ -61,15 +61,15 @@ TEST_F(UMTSRoundTripTest, RankedNeighboursShowTheirLevels)
     });
 }
 
-TEST_F(UMTSRoundTripTest, RankedGSMNeighboursShowTheirLevelsWhereNoUMTSCellIsTold)
+TEST_F(UMTSRoundTripTest, RankedGSMNeighboursShowTheirLevelsWhereNoUMTSCellIsReported)
 {
-    std::size_t told = 0;
+    std::size_t reported = 0;
     for (std::uint32_t seed = 1; seed <= 6; ++seed) {
         drive(seed, 6, [&](const GSMUMTSWorld& world) {
             const RankingReport ranking = world.ranking();
             deliver(rankingRecord(ranking, Now));
             ASSERT_EQ(list("GSM Set").count(), ranking.gsm.size());
-            for (std::size_t index = 0; index < ranking.gsm.size() && ranking.umts.empty(); ++index, ++told) {
+            for (std::size_t index = 0; index < ranking.gsm.size() && ranking.umts.empty(); ++index, ++reported) {
                 const RankedGSMCell& cell = ranking.gsm[index];
                 const Dictionary& shownCell = entry("GSM Set", index);
                 EXPECT_EQ(text(shownCell, "ARFCN"), std::to_string(cell.arfcn));
@@ -79,7 +79,7 @@ TEST_F(UMTSRoundTripTest, RankedGSMNeighboursShowTheirLevelsWhereNoUMTSCellIsTol
             }
         });
     }
-    EXPECT_GT(told, 0u);
+    EXPECT_GT(reported, 0u);
 }
 
 TEST_F(UMTSRoundTripTest, GSMNeighboursBehindUMTSCellsShowTheBytesOfThose)
@@ -181,7 +181,7 @@ TEST_F(UMTSRoundTripTest, HSDPAShowsBothCarriersProcesses)
 TEST_F(UMTSRoundTripTest, CellInformationShowsTheServingCellAndItsNeighbours)
 {
     drive(1, 8, [&](const GSMUMTSWorld& world) {
-        deliver(gsmumtsCellInformationRecord(world, Now));
+        deliver(gsmumtsCellInformationRecord(world.cellInformation(), Now));
         if (const UMTSCell* cell = world.now().umtsCell) {
             EXPECT_EQ(shown("UMTS RR Info", "Cell ID"), std::to_string(cell->identity));
             EXPECT_EQ(shown("UMTS RR Info", "UARFCN"), std::to_string(cell->downlinkChannel));

@@ -45,10 +45,10 @@ TEST_F(UTRANRoundTripTest, ServingCellFromBothRecords)
 {
     drive(1, [this](const UTRANWorld& world) {
         const UTRANCell& cell = world.servingCell();
-        deliver(utranCellInformationRecord(world, Time));
+        deliver(utranCellInformationRecord(world.servingCell(), world.otherCells(), Time));
         EXPECT_EQ(number("Serving Cell Info", "Cell ID"), cell.identity);
         EXPECT_EQ(number("Serving Cell Info", "Local Area Code"), cell.locationArea);
-        EXPECT_EQ(number("Serving Cell Info", "Cell Scrambling Code"), cell.parameter);
+        EXPECT_EQ(number("Serving Cell Info", "Cell Scrambling Code"), cell.cellParameterId);
         EXPECT_EQ(number("Serving Cell Info", "Uplink UARFCN"), cell.channel);
         deliver(utranServingCellRecord(cell, true, Time));
         EXPECT_EQ(number("Serving Cell Info", "Cell ID"), cell.identity);
@@ -69,7 +69,7 @@ TEST_F(UTRANRoundTripTest, Neighbours)
         for (std::size_t index = 0; index < cells.count(); ++index) {
             const Dictionary& cell = *cells[index].dictionary();
             EXPECT_EQ(numberOf(cell, "UARFCN"), truth[index].channel);
-            EXPECT_EQ(numberOf(cell, "Cell ID"), truth[index].parameter);
+            EXPECT_EQ(numberOf(cell, "Cell ID"), truth[index].cellParameterId);
             EXPECT_NEAR(numberOf(cell, "Filter RSCP") * 256 - 116, truth[index].rscp, 1.01);
             EXPECT_EQ(textOf(cell, "Status"), sets[static_cast<int>(truth[index].set)]);
             EXPECT_EQ(textOf(cell, "inJDCS"), truth[index].isJointlyDetected ? "TRUE" : "FALSE");

@@ -2,13 +2,11 @@
 
 #include "Platform/TelephonyProtocol.h"
 #include "Records/TelephonyConstants.h"
-#include "Telephony/Simulator/SimulatorSource.h"
 #include "Telephony/StatusReport.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/FakeMessagePorts.h"
 #include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Fakes/RecordBuilder.h"
-#include "Tests/Telephony/Collector.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
 #include "Values/PropertyList/PropertyList.h"
@@ -20,7 +18,9 @@ namespace spectrel {
 namespace {
 
 using namespace std::chrono_literals;
+using TelephonyProtocol::ChannelError;
 using testing::ElementsAre;
+namespace Protocol = TelephonyProtocol;
 
 /// Hands its messages over at once and remembers who listens.
 class ListSource final : public LogSource {
@@ -92,18 +92,29 @@ protected:
         const auto value = reply ? parsePropertyList(*reply) : std::nullopt;
         return value.value_or(Value());
     }
+    Value askService(const Value& request, std::int32_t id = Protocol::CreateLogChannelId)
+    {
+        return ask(std::string(Protocol::ServicePort), id, request);
+    }
+    Value askForChannel(const Value& client = "client")
+    {
+        return askService(Dictionary::make({{Protocol::CreateLogChannelKey, client}}));
+    }
+    static ChannelError errorOf(const Value& reply)
+    {
+        return static_cast<ChannelError>((*reply.dictionary())[Protocol::ErrorKey].int32().value_or(-1));
+    }
     std::string openChannel(const std::string& client = "client")
     {
-        const Value reply = ask("org.spectrel.Telephony", 1, Dictionary::make({{"CreateLogChannel", client}}));
-        return *(*reply.dictionary())["PortName"].string();
+        return *(*askForChannel(client).dictionary())[Protocol::PortNameKey].string();
     }
     void start(const std::string& channel, ListRef ordinary, ListRef extra)
     {
-        auto command = Dictionary::make({{"SetState", "Streaming"}});
-        command->set("SetZephyrLogCodes", ordinary);
-        command->set("SetRkExtraCodes", extra);
+        auto command = Dictionary::make({{Protocol::SetStateKey, Protocol::StreamingState}});
+        command->set(Protocol::OrdinaryCodesKey, ordinary);
+        command->set(Protocol::ExtraCodesKey, extra);
         ports.sent.clear();
-        EXPECT_TRUE(ask(channel, 0, command).isAbsent()) << "a start command is not answered";
+        EXPECT_TRUE(ask(channel, Protocol::LogChannelId, command).isAbsent()) << "a start command is not answered";
     }
     static ListRef codes(std::initializer_list<int> numbers)
     {
@@ -121,7 +132,7 @@ protected:
 
 TEST_F(TelephonyServiceTest, ChannelIsOpenedWithAPortOfItsOwn)
 {
-    EXPECT_EQ(displayText(ask("org.spectrel.Telephony", 1, Dictionary::make({{"CreateLogChannel", "client"}}))),
+    EXPECT_EQ(displayText(askForChannel()),
         "{\"Domain\": int 0, \"Error\": int 0, \"PortName\": \"org.spectrel.Telephony.LogChannel.1\"}");
     EXPECT_NE(openChannel("other"), openChannel("third"));
     EXPECT_EQ(service.channels(), 3u);
@@ -129,37 +140,33 @@ TEST_F(TelephonyServiceTest, ChannelIsOpenedWithAPortOfItsOwn)
 
 TEST_F(TelephonyServiceTest, MalformedWishGetsAnErrorAndNoChannel)
 {
-    const Value wishes[] = {Dictionary::make(), Dictionary::make({{"CreateLogChannel", ""}}),
-        Dictionary::make({{"CreateLogChannel", Value::integer(1)}}), List::make()};
-    for (const Value& wish : wishes)
-        EXPECT_EQ((*ask("org.spectrel.Telephony", 1, wish).dictionary())["Error"].int32(), 22) << displayText(wish);
-    EXPECT_EQ((*ask("org.spectrel.Telephony", 9, wishes[0]).dictionary())["Error"].int32(), 22);
+    for (const Value& client : {Value(""), Value::integer(1)})
+        EXPECT_EQ(errorOf(askForChannel(client)), ChannelError::MalformedRequest) << displayText(client);
+    for (const Value& request : {Value(Dictionary::make()), Value(List::make())})
+        EXPECT_EQ(errorOf(askService(request)), ChannelError::MalformedRequest) << displayText(request);
+    EXPECT_EQ(errorOf(askService(Dictionary::make(), 9)), ChannelError::MalformedRequest);
     const Bytes garbage {1, 2};
-    EXPECT_TRUE(ports.request("org.spectrel.Telephony", 1, garbage));
+    EXPECT_TRUE(ports.request(std::string(Protocol::ServicePort), Protocol::CreateLogChannelId, garbage));
     EXPECT_EQ(service.channels(), 0u);
 }
 
 TEST_F(TelephonyServiceTest, ClientWithoutAPortGetsAnError)
 {
     ports.refuseRemote = true;
-    EXPECT_EQ(
-        (*ask("org.spectrel.Telephony", 1, Dictionary::make({{"CreateLogChannel", "gone"}})).dictionary())["Error"]
-            .int32(),
-        2);
+    EXPECT_EQ(errorOf(askForChannel("gone")), ChannelError::NoSuchPort);
 }
 
 TEST_F(TelephonyServiceTest, ChannelsAreBounded)
 {
-    for (std::size_t count = 0; count < TelephonyService::MostChannels; ++count)
+    for (std::size_t count = 0; count < TelephonyService::MaxChannels; ++count)
         openChannel();
-    EXPECT_EQ((*ask("org.spectrel.Telephony", 1, Dictionary::make({{"CreateLogChannel", "one"}})).dictionary())["Error"]
-                  .int32(),
-        24);
+    EXPECT_EQ(errorOf(askForChannel()), ChannelError::TooManyChannels);
 }
 
 TEST_F(TelephonyServiceTest, TechnologyIsTheSources)
 {
-    EXPECT_EQ(displayText(ask(openChannel(), 0, Dictionary::make({{"GetTechnology", "GetTechnology"}}))),
+    EXPECT_EQ(displayText(ask(openChannel(), Protocol::LogChannelId,
+                  Dictionary::make({{Protocol::GetTechnologyKey, Protocol::GetTechnologyKey}}))),
         "{\"GetTechnology\": \"kRKLogChannelTechnology_Zephyr_GSM\"}");
 }
 
@@ -168,7 +175,7 @@ TEST_F(TelephonyServiceTest, OnlyTheRequestedCodesAreStreamed)
     const std::string channel = openChannel();
     start(channel, codes({0xB0C2}), codes({1}));
     ASSERT_EQ(ports.sent.size(), 2u);
-    EXPECT_EQ(ports.sent[0].id, 0);
+    EXPECT_EQ(ports.sent[0].id, Protocol::LogChannelId);
     EXPECT_EQ(ports.sent[0].body[4], '\xB0');
     EXPECT_EQ(ports.sent[1].body[0], '\xFF');
     start(channel, codes({}), codes({}));
@@ -187,13 +194,16 @@ TEST_F(TelephonyServiceTest, StartWithoutAnyCodeListStreamsEverything)
 TEST_F(TelephonyServiceTest, MalformedRequestsGetAnErrorAnswer)
 {
     const std::string channel = openChannel();
-    const Value requests[] = {Dictionary::make({{"SetState", "Idle"}}), List::make(), "Streaming",
-        Dictionary::make({{"SetState", "Streaming"}, {"SetZephyrLogCodes", "all"}}),
-        Dictionary::make({{"SetState", "Streaming"}, {"SetZephyrLogCodes", codes({65536})}}),
-        Dictionary::make({{"SetState", "Streaming"}, {"SetRkExtraCodes", codes({-1})}})};
+    const Value requests[] = {Dictionary::make({{Protocol::SetStateKey, "Idle"}}), List::make(),
+        Protocol::StreamingState,
+        Dictionary::make({{Protocol::SetStateKey, Protocol::StreamingState}, {Protocol::OrdinaryCodesKey, "all"}}),
+        Dictionary::make(
+            {{Protocol::SetStateKey, Protocol::StreamingState}, {Protocol::OrdinaryCodesKey, codes({65536})}}),
+        Dictionary::make({{Protocol::SetStateKey, Protocol::StreamingState}, {Protocol::ExtraCodesKey, codes({-1})}})};
     for (const Value& request : requests)
-        EXPECT_TRUE((*ask(channel, 0, request).dictionary())["Error"].string()) << displayText(request);
-    EXPECT_TRUE((*ask(channel, 7, requests[0]).dictionary())["Error"].string());
+        EXPECT_TRUE((*ask(channel, Protocol::LogChannelId, request).dictionary())[Protocol::ErrorKey].string())
+            << displayText(request);
+    EXPECT_TRUE((*ask(channel, 7, requests[0]).dictionary())[Protocol::ErrorKey].string());
     EXPECT_EQ(source.streams, 0);
 }
 
@@ -225,14 +235,13 @@ TEST_F(TelephonyServiceTest, FullClientStopsTheStreamUntilThereIsRoom)
 TEST_F(TelephonyServiceTest, SourceThatIsNotReadyHasNoChannels)
 {
     source.ready = false;
-    const Value wish = Dictionary::make({{"CreateLogChannel", "client"}});
-    EXPECT_EQ((*ask("org.spectrel.Telephony", 1, wish).dictionary())["Error"].int32(), 11);
+    EXPECT_EQ(errorOf(askForChannel()), ChannelError::NotReady);
     EXPECT_EQ(service.channels(), 0u);
     source.ready = true;
-    EXPECT_EQ((*ask("org.spectrel.Telephony", 1, wish).dictionary())["Error"].int32(), 0);
+    EXPECT_EQ(errorOf(askForChannel()), ChannelError::None);
 }
 
-TEST_F(TelephonyServiceTest, StatusTellsWhatIsStreamedToWhom)
+TEST_F(TelephonyServiceTest, StatusShowsWhatIsStreamedToWhom)
 {
     StatusReport report(loop, service, source);
     EXPECT_THAT(report.lines(), ElementsAre("a list; 0 clients"));
@@ -276,63 +285,6 @@ TEST_F(TelephonyServiceTest, SecondServiceIsRefused)
 {
     TelephonyService second(loop, ports, source);
     EXPECT_FALSE(second.start());
-}
-
-class SimulatorSourceTest : public testing::Test {
-protected:
-    FakeRunLoop loop;
-    SimulatorSource source {loop, loop, makeBaseband(Technology::LTE, Scene::Drive, 1), 1};
-    Collector collector;
-};
-
-TEST_F(SimulatorSourceTest, NewChannelGetsTheSlowRecordsAtOnce)
-{
-    const auto stream = source.start(collector);
-    EXPECT_EQ(collector.count(0xFF, 0), 1u);
-    EXPECT_EQ(collector.count(0xFF, 1), 1u);
-    EXPECT_EQ(collector.count(0xFF, 2), 1u);
-}
-
-TEST_F(SimulatorSourceTest, RecordsComeSteadily)
-{
-    const auto stream = source.start(collector);
-    collector.messages.clear();
-    loop.advance(60s);
-    EXPECT_EQ(collector.count(0x01, 0xC2), 150u);
-    EXPECT_EQ(collector.count(0x01, 0xC1), 75u);
-    EXPECT_EQ(collector.count(0xFF, 1), 12u);
-    EXPECT_EQ(collector.count(0xFF, 0), 2u);
-}
-
-TEST_F(SimulatorSourceTest, ItMovesOnlyWhileSomebodyListens)
-{
-    EXPECT_EQ(loop.timers(), 0u);
-    auto stream = source.start(collector);
-    EXPECT_EQ(loop.timers(), 1u);
-    stream.reset();
-    EXPECT_EQ(loop.timers(), 0u);
-}
-
-TEST_F(SimulatorSourceTest, TwoChannelsSeeTheSamePhone)
-{
-    Collector other;
-    const auto first = source.start(collector);
-    const auto second = source.start(other);
-    loop.advance(30s);
-    EXPECT_EQ(collector.messages, other.messages);
-}
-
-TEST_F(SimulatorSourceTest, BusyClientLosesNothingOnceItTakesAgain)
-{
-    Collector other;
-    const auto first = source.start(collector);
-    const auto second = source.start(other);
-    other.isFull = true;
-    loop.advance(10s);
-    EXPECT_LT(other.messages.size(), collector.messages.size());
-    other.isFull = false;
-    second->resume();
-    EXPECT_EQ(collector.messages, other.messages);
 }
 
 } // namespace

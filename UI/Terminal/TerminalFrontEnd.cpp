@@ -116,7 +116,6 @@ private:
 
 TerminalFrontEnd::TerminalFrontEnd(RunLoop& runLoop)
     : _runLoop(runLoop)
-    , _alive(std::make_shared<bool>(true))
     , _screens(std::make_unique<Screens>(*this))
 {
 }
@@ -164,13 +163,11 @@ void TerminalFrontEnd::needsDisplay()
 {
     if (std::exchange(_isDrawingQueued, true))
         return;
-    _runLoop.async([this, alive = std::weak_ptr(_alive)] {
-        if (alive.expired())
-            return;
+    _runLoop.async(_lifetime.guard([this] {
         _isDrawingQueued = false;
         if (_session)
             _session->draw();
-    });
+    }));
 }
 
 } // namespace spectrel

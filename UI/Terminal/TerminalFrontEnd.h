@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Platform/Lifetime.h"
 #include "Platform/RunLoop.h"
 #include "UI/ScreenToolkit.h"
 
@@ -50,7 +51,7 @@ private:
     void needsDisplay();
 
     RunLoop& _runLoop;
-    std::shared_ptr<bool> _alive; // drawing jobs on the queue hold it weakly
+    Lifetime _lifetime; // of drawing jobs on the queue
     bool _isDrawingQueued = false;
     class Screens;
     std::unique_ptr<Screens> _screens;

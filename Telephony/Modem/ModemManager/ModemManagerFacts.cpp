@@ -7,14 +7,14 @@ namespace spectrel::ModemManager {
 
 namespace {
 
-constexpr qsizetype LongestText = 256;
+constexpr qsizetype MaxTextLength = 256;
 
 // MMModemState
 constexpr int StateEnabled = 6;
 constexpr int StateRegistered = 8;
 
 // MMModemAccessTechnology
-constexpr std::uint32_t AnyTechnology = 0xFFFFFFFF; // how some modems tell that they do not know
+constexpr std::uint32_t AnyTechnology = 0xFFFFFFFF; // how some modems report that they do not know
 constexpr std::uint32_t TechnologiesOfLTE = 1u << 14 | 1u << 16 | 1u << 17; // LTE, its machine-type forms
 constexpr std::uint32_t Technology5G = 1u << 15;
 constexpr std::uint32_t TechnologiesOfUMTS = 1u << 5 | 1u << 6 | 1u << 7 | 1u << 8 | 1u << 9; // UMTS to HSPA+
@@ -96,34 +96,34 @@ SignalFacts signalFacts(const QVariantMap& properties, std::optional<CellKind> k
         real(measured, "rsrq"), real(measured, "snr")};
 }
 
-std::optional<CellFacts> cellFactsOf(const QVariantMap& told)
+std::optional<CellFacts> cellFactsOf(const QVariantMap& map)
 {
     CellFacts cell;
-    cell.isServing = told.value(QStringLiteral("serving")).toBool();
-    cell.operatorId = text(told, "operator-id");
-    cell.cellId = hexadecimalText(told, "ci");
-    switch (number(told, "cell-type").value_or(0)) {
+    cell.isServing = map.value(QStringLiteral("serving")).toBool();
+    cell.operatorId = text(map, "operator-id");
+    cell.cellId = hexadecimalText(map, "ci");
+    switch (number(map, "cell-type").value_or(0)) {
     case CellOfGSM:
         cell.kind = CellKind::GSM;
-        cell.areaCode = hexadecimalText(told, "lac");
-        cell.channel = number(told, "arfcn");
-        cell.rxLevel = number(told, "rx-level");
+        cell.areaCode = hexadecimalText(map, "lac");
+        cell.channel = number(map, "arfcn");
+        cell.rxLevel = number(map, "rx-level");
         return cell;
     case CellOfUMTS:
         cell.kind = CellKind::UMTS;
-        cell.areaCode = hexadecimalText(told, "lac");
-        cell.channel = number(told, "uarfcn");
-        cell.codeOnAir = number(told, "psc");
-        cell.power = real(told, "rscp");
-        cell.quality = real(told, "ecio");
+        cell.areaCode = hexadecimalText(map, "lac");
+        cell.channel = number(map, "uarfcn");
+        cell.psc = number(map, "psc");
+        cell.power = real(map, "rscp");
+        cell.quality = real(map, "ecio");
         return cell;
     case CellOfLTE:
         cell.kind = CellKind::LTE;
-        cell.areaCode = hexadecimalText(told, "tac");
-        cell.channel = number(told, "earfcn");
-        cell.codeOnAir = hexadecimalText(told, "physical-ci");
-        cell.power = real(told, "rsrp");
-        cell.quality = real(told, "rsrq");
+        cell.areaCode = hexadecimalText(map, "tac");
+        cell.channel = number(map, "earfcn");
+        cell.physicalCellId = hexadecimalText(map, "physical-ci");
+        cell.power = real(map, "rsrp");
+        cell.quality = real(map, "rsrq");
         return cell;
     default:
         return std::nullopt;
@@ -160,7 +160,7 @@ std::string contextId(const QString& path, const QVariantMap& bearer)
 
 std::string printable(const QString& text)
 {
-    QString shown = text.left(LongestText);
+    QString shown = text.left(MaxTextLength);
     for (QChar& character : shown) {
         if (!character.isPrint())
             character = QLatin1Char('?');
@@ -242,13 +242,13 @@ QStringList bearerPaths(const Interfaces& modem)
     const QString initial = objectPath(modem.value(Modem3gppInterface).value(QStringLiteral("InitialEpsBearer")));
     if (!initial.isEmpty())
         paths << initial;
-    const QVariant told = modem.value(ModemInterface).value(QStringLiteral("Bearers"));
+    const QVariant listed = modem.value(ModemInterface).value(QStringLiteral("Bearers"));
     QList<QDBusObjectPath> bearers;
-    if (told.metaType() == QMetaType::fromType<QList<QDBusObjectPath>>())
-        bearers = told.value<QList<QDBusObjectPath>>();
-    else if (told.metaType() == QMetaType::fromType<QDBusArgument>()
-        && told.value<QDBusArgument>().currentSignature() == QLatin1String("ao"))
-        bearers = qdbus_cast<QList<QDBusObjectPath>>(told.value<QDBusArgument>());
+    if (listed.metaType() == QMetaType::fromType<QList<QDBusObjectPath>>())
+        bearers = listed.value<QList<QDBusObjectPath>>();
+    else if (listed.metaType() == QMetaType::fromType<QDBusArgument>()
+        && listed.value<QDBusArgument>().currentSignature() == QLatin1String("ao"))
+        bearers = qdbus_cast<QList<QDBusObjectPath>>(listed.value<QDBusArgument>());
     for (const QDBusObjectPath& bearer : bearers) {
         if (!paths.contains(bearer.path()))
             paths << bearer.path();
@@ -259,8 +259,8 @@ QStringList bearerPaths(const Interfaces& modem)
 std::vector<CellFacts> cellFacts(const QList<QVariantMap>& cells)
 {
     std::vector<CellFacts> facts;
-    for (const QVariantMap& told : cells) {
-        if (auto cell = cellFactsOf(told))
+    for (const QVariantMap& map : cells) {
+        if (auto cell = cellFactsOf(map))
             facts.push_back(std::move(*cell));
     }
     return facts;

@@ -34,7 +34,7 @@ QString simPath(const Interfaces& modem);
 /// Its bearers' paths, the initial one of LTE first.
 QStringList bearerPaths(const Interfaces& modem);
 
-/// The answer of GetCellInfo. Cells of kinds that no record tells (CDMA2000, TD-SCDMA, 5G) are left out.
+/// The answer of GetCellInfo. Cells of kinds that no record has (CDMA2000, TD-SCDMA, 5G) are left out.
 std::vector<CellFacts> cellFacts(const QList<QVariantMap>& cells);
 
 /// A text of at most 256 characters; what cannot be printed, and so might not fit into a property list, becomes "?".

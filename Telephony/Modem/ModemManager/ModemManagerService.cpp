@@ -152,7 +152,7 @@ bool ModemManagerService::isComplete() const
 
 void ModemManagerService::busLost()
 {
-    tell("the system bus is gone; looking for it every 5 seconds");
+    printServiceLine("the system bus is gone; looking for it every 5 seconds");
     _watcher.reset();
     QDBusConnection::disconnectFromBus(ConnectionName);
     forgetAll();
@@ -187,7 +187,7 @@ void ModemManagerService::takeObjects(const QDBusMessage& answer)
     _isFirstAnswerThere = true;
     _isRunning = objects.has_value();
     if (answer.type() == QDBusMessage::ErrorMessage && QDBusError(answer).type() != QDBusError::ServiceUnknown)
-        tell("ModemManager does not answer: " + printable(answer.errorMessage()));
+        printServiceLine("ModemManager does not answer: " + printable(answer.errorMessage()));
     if (objects) {
         for (auto object = objects->begin(); object != objects->end(); ++object)
             adopt(object.key().path(), object.value());
@@ -292,7 +292,7 @@ void ModemManagerService::forgetAll()
     changed();
 }
 
-/// Tells once for all changes of one turn of the event loop.
+/// Reports once all changes of one turn of the event loop.
 void ModemManagerService::changed()
 {
     if (std::exchange(_isChangeDue, true))

@@ -22,7 +22,7 @@ class ModemManagerService final : public QObject, public ModemService {
     Q_OBJECT
 
 public:
-    /// Null when there is no system bus; `reason` tells why. ModemManager itself may come later. Waits a moment for its
+    /// Null when there is no system bus; `reason` says why. ModemManager itself may come later. Waits a moment for its
     /// first answer, turning the event loop, so that the technology is known before anybody asks for it.
     static std::unique_ptr<ModemManagerService> open(std::string& reason);
     ~ModemManagerService() override;

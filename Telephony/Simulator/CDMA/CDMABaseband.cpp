@@ -10,15 +10,20 @@ namespace {
 
 using namespace std::chrono_literals;
 
+template <auto Encode> Bytes reported(const CDMAWorld& world, Moment time)
+{
+    return Encode(world.report(), time);
+}
+
 constexpr std::array<Cadence<CDMAWorld>, 8> Cadences {{
-    {5s, true, cdmaSystemInformationRecord},
-    {1s, true, evdoAirLinkRecord},
-    {1s, false, cdmaSearcherRecord},
-    {100ms, false, cdmaFrameRecord},
-    {1s, false, evdoPilotsRecord},
-    {1s, false, evdoFingersRecord},
-    {1s, false, evdoForwardCountersRecord},
-    {2s, false, evdoReverseCountersRecord},
+    {5s, true, reported<cdmaSystemInformationRecord>},
+    {1s, true, reported<evdoAirLinkRecord>},
+    {1s, false, reported<cdmaSearcherRecord>},
+    {100ms, false, reported<cdmaFrameRecord>},
+    {1s, false, reported<evdoPilotsRecord>},
+    {1s, false, reported<evdoFingersRecord>},
+    {1s, false, reported<evdoForwardCountersRecord>},
+    {2s, false, reported<evdoReverseCountersRecord>},
 }};
 
 } // namespace

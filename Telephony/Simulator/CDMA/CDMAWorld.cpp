@@ -20,7 +20,7 @@ constexpr double Hysteresis = 2; // by which a pilot must be better to serve: 3 
 constexpr double AddShare = 0.2; // T_ADD, -14 dB of a pilot that is a fifth of its sector's power
 constexpr double DropShare = 0.126; // T_DROP, -16 dB
 constexpr std::chrono::milliseconds DropTime = 4s; // T_TDROP
-constexpr std::size_t LargestActiveSet = 6;
+constexpr std::size_t MaxActiveSet = 6;
 
 /// What the phone does, and until when in each round.
 struct Phase {
@@ -51,12 +51,12 @@ double inDecibels(double ratio)
 CDMASector sectorOf(std::size_t site)
 {
     CDMASector sector;
-    sector.pn = static_cast<std::uint16_t>(4 * ((11 + site * 37) % 128)); // neighbours far apart, PN_INC 4
-    sector.isHome = site < Sites / 2;
-    sector.systemId = sector.isHome ? 16420 : 16422;
-    sector.networkId = static_cast<std::uint16_t>(1 + site / 4);
-    sector.baseId = static_cast<std::uint16_t>(1601 + 16 * site);
-    sector.packetZone = sector.isHome ? 7 : 8;
+    sector.system.pn = static_cast<std::uint16_t>(4 * ((11 + site * 37) % 128)); // neighbours far apart, PN_INC 4
+    sector.system.isHome = site < Sites / 2;
+    sector.system.systemId = sector.system.isHome ? 16420 : 16422;
+    sector.system.networkId = static_cast<std::uint16_t>(1 + site / 4);
+    sector.system.baseId = static_cast<std::uint16_t>(1601 + 16 * site);
+    sector.system.packetZone = sector.system.isHome ? 7 : 8;
     return sector;
 }
 
@@ -83,13 +83,13 @@ void CDMAWorld::advance(std::chrono::milliseconds step)
     reselect();
     maintainActiveSet(step);
     // The weaker the pilots, the less power control can hold the one broken frame in a hundred.
-    const double active = inDecibels(shareOf(serving()));
+    const double active = inDecibels(shareOf(servingSector()));
     _isFrameBad = _dice.between(0, 1) < 0.01 + std::max(0.0, -4 - active) * 0.02;
     if (activity() == Activity::Data)
-        _counters.advance(step, inDecibels(servingSignal()), transmitted(), _dice);
+        _traffic.advance(step, inDecibels(servingSignal()), transmitted(), _dice);
     if (_elapsed % 1s == 0s) {
         _second = static_cast<std::uint32_t>(_elapsed / 1s);
-        _atSecond = _counters;
+        _countsAtSecond = _traffic.counts();
     }
 }
 
@@ -117,7 +117,7 @@ void CDMAWorld::maintainActiveSet(std::chrono::milliseconds step)
         const double share = shareOf(sector);
         sector.weakFor = share < DropShare ? sector.weakFor + step : 0ms;
         const bool isDropped = sector.isActive && sector.weakFor >= DropTime;
-        const bool isAdded = !sector.isActive && share > AddShare && size < LargestActiveSet;
+        const bool isAdded = !sector.isActive && share > AddShare && size < MaxActiveSet;
         if (isDropped || isAdded) {
             sector.isActive = isAdded;
             size += isAdded ? 1 : -1;
@@ -138,14 +138,14 @@ bool CDMAWorld::isAwake() const
 
 std::vector<CDMAPilot> CDMAWorld::activePilots() const
 {
-    std::vector<CDMAPilot> pilots {{serving().pn, shareOf(serving())}};
+    std::vector<CDMAPilot> pilots {{serving().pn, shareOf(servingSector())}};
     if (activity() == Activity::Idle)
         return pilots;
     for (const CDMASector& sector : _sectors) {
-        if (sector.isActive && sector.pn != serving().pn)
-            pilots.push_back({sector.pn, shareOf(sector)});
+        if (sector.isActive && sector.system.pn != serving().pn)
+            pilots.push_back({sector.system.pn, shareOf(sector)});
     }
-    pilots.resize(std::min(pilots.size(), LargestActiveSet), pilots.front());
+    pilots.resize(std::min(pilots.size(), MaxActiveSet), pilots.front());
     return pilots;
 }
 
@@ -168,7 +168,13 @@ double CDMAWorld::transmitted() const
 double CDMAWorld::servingSignal() const
 {
     constexpr double OwnNoise = 0.02; // of the pilot's power, by filters and echoes: 17 dB at best
-    return serving().power / (_total - (1 - OwnNoise) * serving().power);
+    return servingSector().power / (_total - (1 - OwnNoise) * servingSector().power);
+}
+
+CDMAReport CDMAWorld::report() const
+{
+    return {activity(), isAwake(), serving(), activePilots(), received(), receivedBySecond(), transmitted(),
+        servingSignal(), isFrameBad(), second(), countsAtSecond()};
 }
 
 } // namespace spectrel

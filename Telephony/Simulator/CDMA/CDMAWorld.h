@@ -1,8 +1,11 @@
 #pragma once
 
-#include "Telephony/Simulator/CDMA/EVDOCounters.h"
+#include "Telephony/Reports/CDMAReport.h"
+#include "Telephony/Simulator/CDMA/EVDOTraffic.h"
+#include "Telephony/Simulator/Dice.h"
+#include "Telephony/Simulator/Journey.h"
 #include "Telephony/Simulator/MastRoad.h"
-#include "Telephony/Simulator/Radio.h"
+#include "Telephony/Simulator/Propagation.h"
 
 #include <chrono>
 #include <cstdint>
@@ -10,23 +13,12 @@
 
 namespace spectrel {
 
-/// One sector of a CDMA2000 site, on its 1x and its EV-DO carrier.
+/// One sector of a site as the phone could hear it.
 struct CDMASector {
-    std::uint16_t pn = 0; // offset of its pilot in units of 64 chips, 0 to 511
-    std::uint16_t systemId = 0;
-    std::uint16_t networkId = 0;
-    std::uint16_t baseId = 0;
-    std::uint8_t packetZone = 0;
-    bool isHome = true;
+    CDMASystem system;
     double power = 0; // mW, as heard now
     bool isActive = false; // in the set of pilots that a call or session holds on to
     std::chrono::milliseconds weakFor {0};
-};
-
-/// A pilot as the phone hears it.
-struct CDMAPilot {
-    std::uint16_t pn;
-    double share; // of all the power received on the carrier, linear
 };
 
 /// A phone that can do one thing at a time: 1x while it talks, EV-DO while it has data to move.
@@ -34,7 +26,7 @@ struct CDMAPilot {
 /// The same seed gives the same drive. It goes through idle times, a data session and a voice call every two minutes.
 class CDMAWorld {
 public:
-    enum class Activity : std::uint8_t { Idle, DataSetup, Data, Voice };
+    using Activity = CDMAActivity;
 
     CDMAWorld(Scene scene, std::uint32_t seed);
 
@@ -43,9 +35,9 @@ public:
     Activity activity() const;
     /// Whether an idle phone listens to its paging channel just now, or sleeps.
     bool isAwake() const;
-    const CDMASector& serving() const
+    const CDMASystem& serving() const
     {
-        return _sectors[_serving];
+        return servingSector().system;
     }
     /// The pilots of the active set, the serving one first, the others in their order along the road; idle there is but
     /// one.
@@ -64,20 +56,26 @@ public:
         return _isFrameBad;
     }
 
-    /// Seconds since the beginning, and the session's counters as they stood then: both move once a second.
+    /// Seconds since the beginning, and the session's counts as they stood then: both move once a second.
     std::uint32_t second() const
     {
         return _second;
     }
-    const EVDOCounters& countersAtSecond() const
+    const EVDOCounts& countsAtSecond() const
     {
-        return _atSecond;
+        return _countsAtSecond;
     }
+    /// All of it, for the records.
+    CDMAReport report() const;
 
 private:
     void measure();
     void reselect();
     void maintainActiveSet(std::chrono::milliseconds step);
+    const CDMASector& servingSector() const
+    {
+        return _sectors[_serving];
+    }
     double shareOf(const CDMASector& sector) const
     {
         return sector.power / _total;
@@ -91,8 +89,8 @@ private:
     std::size_t _serving = 0;
     std::chrono::milliseconds _elapsed {0};
     bool _isFrameBad = false;
-    EVDOCounters _counters;
-    EVDOCounters _atSecond;
+    EVDOTraffic _traffic;
+    EVDOCounts _countsAtSecond;
     std::uint32_t _second = 0;
 };
 

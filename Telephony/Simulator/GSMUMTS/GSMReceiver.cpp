@@ -10,7 +10,7 @@ namespace {
 using namespace std::chrono_literals;
 
 constexpr double Audible = -108; // dBm
-constexpr std::size_t NeighboursTold = 6;
+constexpr std::size_t MaxNeighbours = 6;
 constexpr auto IdentifyingTime = 4s; // until a neighbour's BSIC has been read
 constexpr auto SystemInformationTime = 1500ms;
 
@@ -215,7 +215,7 @@ std::vector<const GSMCell*> GSMReceiver::neighbours() const
             others.push_back(&cell);
     }
     std::ranges::sort(others, [](const GSMCell* a, const GSMCell* b) { return a->rssi > b->rssi; });
-    others.resize(std::min(others.size(), NeighboursTold));
+    others.resize(std::min(others.size(), MaxNeighbours));
     return others;
 }
 

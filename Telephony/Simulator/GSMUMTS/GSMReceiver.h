@@ -15,9 +15,9 @@ class GSMReceiver {
 public:
     explicit GSMReceiver(const GSMUMTSRoad& road);
 
-    /// Enters GSM on its strongest cell; the state tells how, and lasts about a second.
+    /// Enters GSM on its strongest cell; the state says how, and lasts about a second.
     void enter(RRState how);
-    /// Is about to leave for UMTS; the state tells how.
+    /// Is about to leave for UMTS; the state says how.
     void depart(RRState how);
     void leave();
     void advance(std::chrono::milliseconds step, const Demand& demand, Dice& dice);

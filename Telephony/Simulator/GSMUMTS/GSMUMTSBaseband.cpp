@@ -15,7 +15,7 @@ namespace {
 using namespace std::chrono_literals;
 using World = GSMUMTSWorld;
 
-template <auto Part, auto Encode> Bytes told(const World& world, Moment time)
+template <auto Part, auto Encode> Bytes reported(const World& world, Moment time)
 {
     return Encode(world.now().*Part, time);
 }
@@ -57,15 +57,15 @@ template <auto Encode> Bytes gprsOnceRead(const World& world, Moment time)
     return world.gsm().hasReadSystemInformation() ? gprs<Encode>(world, time) : Bytes();
 }
 
-constexpr auto mm = told<&Situation::mm, mmStateRecord>;
-constexpr auto gmm = told<&Situation::gmm, gmmStateRecord>;
-constexpr auto registration = told<&Situation::registration, registrationRecord>;
-constexpr auto network = told<&Situation::network, servingNetworkRecord>;
-constexpr auto rrc = told<&Situation::rrc, rrcStateRecord>;
-constexpr auto ciphering = told<&Situation::isCiphering, cipheringRecord>;
-constexpr auto rr = told<&Situation::rr, rrStateRecord>;
-constexpr auto dtx = told<&Situation::usesDTX, dtxRecord>;
-constexpr auto hopping = told<&Situation::hopping, mobileAllocationRecord>;
+constexpr auto mm = reported<&Situation::mm, mmStateRecord>;
+constexpr auto gmm = reported<&Situation::gmm, gmmStateRecord>;
+constexpr auto registration = reported<&Situation::registration, registrationRecord>;
+constexpr auto network = reported<&Situation::network, servingNetworkRecord>;
+constexpr auto rrc = reported<&Situation::rrc, rrcStateRecord>;
+constexpr auto ciphering = reported<&Situation::isCiphering, cipheringRecord>;
+constexpr auto rr = reported<&Situation::rr, rrStateRecord>;
+constexpr auto dtx = reported<&Situation::usesDTX, dtxRecord>;
+constexpr auto hopping = reported<&Situation::hopping, mobileAllocationRecord>;
 
 Bytes equivalents(const World& world, Moment time)
 {
@@ -139,7 +139,17 @@ Bytes hoppingInCalls(const World& world, Moment time)
 
 Bytes simFiles(const World& world, Moment time)
 {
-    return gsmumtsSIMFilesRecord(world.mobility(), time);
+    return gsmumtsSIMFilesRecord(world.now().knownLocation, world.now().knownRouting, time);
+}
+
+Bytes cellInformation(const World& world, Moment time)
+{
+    return gsmumtsCellInformationRecord(world.cellInformation(), time);
+}
+
+Bytes packetContexts(const World& world, Moment time)
+{
+    return packetContextsRecord(world.session(), time);
 }
 
 constexpr auto Cadences = std::to_array<Cadence<World>>({
@@ -155,7 +165,7 @@ constexpr auto Cadences = std::to_array<Cadence<World>>({
     {10s, true, network},
     {100ms, false, onChange<&Situation::network, network>},
     {30s, true, equivalents},
-    {100ms, false, onChange<&Situation::knownLocation, equivalents>}, // the update's answer tells them
+    {100ms, false, onChange<&Situation::knownLocation, equivalents>}, // the update's answer names them
 
     {10s, true, onUMTS<rrc>},
     {100ms, false, onChange<&Situation::rrc, rrc>},
@@ -195,11 +205,11 @@ constexpr auto Cadences = std::to_array<Cadence<World>>({
     {100ms, false, onChange<&Situation::gprs, onGSM<gprs<gprsAccessRecord>>>},
     {100ms, false, onChange<&Situation::gprs, onGSM<gprsOnceRead<gprsTimersRecord>>>},
 
-    {5s, true, gsmumtsCellInformationRecord},
-    {100ms, false, onChange<&Situation::umtsCell, gsmumtsCellInformationRecord>},
-    {100ms, false, onChange<&Situation::gsmCell, gsmumtsCellInformationRecord>},
-    {5s, true, packetContextsRecord},
-    {100ms, false, onChange<&Situation::hasSession, packetContextsRecord>},
+    {5s, true, cellInformation},
+    {100ms, false, onChange<&Situation::umtsCell, cellInformation>},
+    {100ms, false, onChange<&Situation::gsmCell, cellInformation>},
+    {5s, true, packetContexts},
+    {100ms, false, onChange<&Situation::hasSession, packetContexts>},
 });
 
 } // namespace

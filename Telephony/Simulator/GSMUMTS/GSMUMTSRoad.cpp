@@ -24,8 +24,6 @@ constexpr double BaseStationDistance = 800;
 constexpr double BaseStationPower = 30; // dBm
 constexpr double Advantage900 = 7; // dB of path loss less than at 2 GHz: 20 lg(2000 / 900)
 
-constexpr double AccessMinimum = -104; // dBm, RXLEV_ACCESS_MIN
-
 double watts(double dBm)
 {
     return std::pow(10, dBm / 10);
@@ -64,16 +62,6 @@ GPRSParameters gprsOfCell(std::size_t number, Dice& dice)
 }
 
 } // namespace
-
-double GSMCell::c1() const
-{
-    return rssi - AccessMinimum; // the phone reaches the power the cell allows, which leaves nothing to take off
-}
-
-std::uint8_t rxLevel(double rssi)
-{
-    return static_cast<std::uint8_t>(std::clamp(std::lround(rssi + 110), 0L, 63L));
-}
 
 GSMUMTSRoad::GSMUMTSRoad(Scene scene, Dice& dice)
     : _journey(scene, RoadLength, dice)

@@ -2,7 +2,9 @@
 
 #include "Telephony/Reports/GSMCell.h"
 #include "Telephony/Reports/UMTSCell.h"
-#include "Telephony/Simulator/Radio.h"
+#include "Telephony/Simulator/Dice.h"
+#include "Telephony/Simulator/Journey.h"
+#include "Telephony/Simulator/Propagation.h"
 
 #include <chrono>
 #include <vector>

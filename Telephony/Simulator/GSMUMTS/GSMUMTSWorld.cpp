@@ -112,7 +112,7 @@ bool GSMUMTSWorld::isUMTSTooWeak() const
     const UMTSCell& cell = _umts.servingCell();
     if (_umts.state() == RRCState::CellDCH)
         return cell.ecno < WeakEcno;
-    if (cell.ecno < UMTSThresholds::MinimumEcno || cell.rscp < UMTSThresholds::MinimumRscp)
+    if (cell.ecno < UMTSThresholds::QQualMin || cell.rscp < UMTSThresholds::QRxLevMin)
         return true;
     return measuresGSM() && _gsm.strongestCell().rssi - UMTSThresholds::GSMOffset > _umts.servingRank();
 }
@@ -191,6 +191,23 @@ void GSMUMTSWorld::transfer(std::chrono::milliseconds step)
         received = GPRSRate * seconds * std::clamp((_gsm.servingCell().rssi + 105) / 40, 0.1, 1.0);
     _received += received;
     _sent += received * 0.08;
+}
+
+GSMUMTSCellInformation GSMUMTSWorld::cellInformation() const
+{
+    GSMUMTSCellInformation information {_now.umtsCell, _now.gsmCell, {}, {}, measuresGSM()};
+    if (system() != RadioSystem::None) {
+        information.umtsNeighbours = _umts.ranking();
+        information.gsmNeighbours = _gsm.neighbours();
+    }
+    return information;
+}
+
+std::optional<PacketTransfer> GSMUMTSWorld::session() const
+{
+    if (!_now.hasSession)
+        return std::nullopt;
+    return PacketTransfer {bytesReceived(), static_cast<std::uint64_t>(_sent)};
 }
 
 NetworkReport GSMUMTSWorld::network() const

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "Telephony/Reports/GSMUMTSCellInformation.h"
+#include "Telephony/Reports/GSMUMTSReports.h"
 #include "Telephony/Simulator/GSMUMTS/GSMReceiver.h"
 #include "Telephony/Simulator/GSMUMTS/GSMUMTSRoad.h"
 #include "Telephony/Simulator/GSMUMTS/MobilityManagement.h"
@@ -83,14 +85,15 @@ public:
     bool measuresGSM() const;
     /// The networks that the serving one declares equivalent to itself.
     std::span<const PLMN> equivalentNetworks() const;
+    /// The serving cell and its neighbours on both systems.
+    GSMUMTSCellInformation cellInformation() const;
+    /// Of all packet data sessions.
     std::uint64_t bytesReceived() const
     {
         return static_cast<std::uint64_t>(_received);
     }
-    std::uint64_t bytesSent() const
-    {
-        return static_cast<std::uint64_t>(_sent);
-    }
+    /// None between sessions.
+    std::optional<PacketTransfer> session() const;
 
 private:
     Demand demand() const;

@@ -6,14 +6,6 @@
 
 namespace spectrel {
 
-/// Where a phone is, as its network counts places.
-struct Place {
-    RadioSystem system = RadioSystem::None;
-    std::uint16_t locationArea = 0xFFFE;
-    std::uint8_t routingArea = 0xFF;
-    friend bool operator==(const Place&, const Place&) = default;
-};
-
 /// A phone's mobility management, from power-on: location updates and calls, attach, routing area updates and service
 /// requests, as 3GPP TS 24.008, 4.4 and 4.7 run them in a network of mode II (the one after the other).
 class MobilityManagement {

@@ -10,8 +10,8 @@ namespace {
 using namespace std::chrono_literals;
 
 constexpr double Audible = -23; // dB of Ec/No
-constexpr std::size_t SetCellsTold = 7;
-constexpr std::size_t RankedTold = 4;
+constexpr std::size_t MaxSetCells = 7;
+constexpr std::size_t MaxRanked = 4;
 
 constexpr std::size_t ActiveSetSize = 3;
 constexpr double ReportingRange = 3; // dB below the strongest: event 1a
@@ -32,7 +32,7 @@ constexpr auto DedicatedPatience = 3s; // unused, until the network takes the ch
 constexpr auto SharedPatience = 5s;
 constexpr auto PagingPatience = 20s;
 constexpr auto ReleaseTime = 300ms;
-constexpr double FastPhone = 14; // metres a second: so fast a phone tells only its registration area
+constexpr double FastPhone = 14; // metres a second: so fast a phone reports only its registration area
 
 } // namespace
 
@@ -206,7 +206,7 @@ bool UMTSReceiver::isActive(std::size_t cell) const
     return std::ranges::find(_active, cell) != _active.end();
 }
 
-/// Whether the network tells the phone to look for it: it stands on the serving site or on the next one either way.
+/// Whether the network asks the phone to look for it: it stands on the serving site or on the next one either way.
 bool UMTSReceiver::isNeighbour(const UMTSCell& cell) const
 {
     const std::size_t sites = _cells.back().site + 1;
@@ -262,7 +262,7 @@ CellSetsReport UMTSReceiver::cellSets() const
     const auto stronger = [](const UMTSSetCell& a, const UMTSSetCell& b) { return a.ecno > b.ecno; };
     std::ranges::sort(report.cells, stronger);
     std::ranges::sort(others, stronger);
-    others.resize(std::min(others.size(), SetCellsTold - report.cells.size()));
+    others.resize(std::min(others.size(), MaxSetCells - report.cells.size()));
     report.cells.insert(report.cells.end(), others.begin(), others.end());
     return report;
 }
@@ -285,7 +285,7 @@ std::vector<RankedUMTSCell> UMTSReceiver::ranking() const
             {cell.downlinkChannel, cell.scramblingCode, cell.rscp, average, cell.ecno, average, isMeasured});
     }
     std::ranges::sort(ranked, [](const RankedUMTSCell& a, const RankedUMTSCell& b) { return a.rank > b.rank; });
-    ranked.resize(std::min(ranked.size(), RankedTold));
+    ranked.resize(std::min(ranked.size(), MaxRanked));
     return ranked;
 }
 

@@ -14,8 +14,8 @@ constexpr auto Window = 1s;
 constexpr std::uint16_t WindowFrames = 100; // radio frames in it
 constexpr std::size_t PowerSamples = 5;
 
-constexpr double LargestPower = 24; // dBm, power class 3 (3GPP TS 25.101, table 6.1)
-constexpr double SmallestPower = -50; // table 6.4
+constexpr double MaxPower = 24; // dBm, power class 3 (3GPP TS 25.101, table 6.1)
+constexpr double MinPower = -50; // table 6.4
 constexpr double PowerAtNodeB = -108; // dBm, which the power control aims at
 
 constexpr std::uint8_t SignallingChannel = 24; // transport channel identities
@@ -65,7 +65,7 @@ void UMTSTraffic::samplePower(const UMTSReceiver& umts, Dice& dice)
     const double control = dice.between(-1, 1);
     if (sends && gap > 0.1) { // every tenth sample falls into a measurement gap
         const double loss = umts.servingCell().power - umts.servingCell().rscp;
-        power = std::clamp(PowerAtNodeB + loss + control, SmallestPower, LargestPower);
+        power = std::clamp(PowerAtNodeB + loss + control, MinPower, MaxPower);
     }
     _powers.push_back(power);
     if (_powers.size() > PowerSamples)

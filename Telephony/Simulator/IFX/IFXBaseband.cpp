@@ -1,4 +1,4 @@
-#include "Telephony/Encoders/IFXReport.h"
+#include "Telephony/Encoders/IFXMessage.h"
 #include "Telephony/Simulator/Baseband.h"
 #include "Telephony/Simulator/IFX/IFXWorld.h"
 
@@ -11,7 +11,7 @@ namespace {
 using namespace std::chrono_literals;
 
 constexpr std::array<Cadence<IFXWorld>, 1> Cadences {{
-    {2s, true, ifxReport},
+    {2s, true, [](const IFXWorld& world, Moment time) { return ifxMessage(world.report(), time); }},
 }};
 
 } // namespace

@@ -13,6 +13,7 @@ constexpr double SiteDistance = 700; // metres
 constexpr double CellPower = 33; // dBm; the path loss at 900 MHz is some 10 dB below that of the formula
 constexpr double Hysteresis = 4; // dB by which a cell must be better
 constexpr double Sensitivity = -104; // dBm
+constexpr std::size_t MaxNeighbours = 6; // that a phone measures at once (3GPP TS 45.008, 7.1)
 
 constexpr std::chrono::milliseconds Round = 120s;
 constexpr std::chrono::milliseconds CallStart = 30s; // in each round
@@ -67,15 +68,15 @@ std::size_t IFXWorld::strongest() const
     return static_cast<std::size_t>(std::ranges::max_element(_cells, {}, &IFXCell::level) - _cells.begin());
 }
 
-std::vector<const IFXCell*> IFXWorld::neighbours(std::size_t atMost) const
+std::vector<IFXCell> IFXWorld::neighbours() const
 {
-    std::vector<const IFXCell*> others;
-    for (const IFXCell& cell : _cells) {
-        if (&cell != &serving() && cell.level > Sensitivity)
-            others.push_back(&cell);
+    std::vector<IFXCell> others;
+    for (std::size_t cell = 0; cell < _cells.size(); ++cell) {
+        if (cell != _serving && _cells[cell].level > Sensitivity)
+            others.push_back(_cells[cell]);
     }
     std::ranges::stable_sort(others, std::ranges::greater(), &IFXCell::level);
-    others.resize(std::min(others.size(), atMost));
+    others.resize(std::min(others.size(), MaxNeighbours));
     return others;
 }
 
@@ -93,6 +94,12 @@ std::chrono::seconds IFXWorld::talkingFor() const
 unsigned IFXWorld::timingAdvance() const
 {
     return static_cast<unsigned>(std::clamp(_road.distance(_serving) / 554, 0.0, 63.0));
+}
+
+IFXReport IFXWorld::report() const
+{
+    return {serving(), neighbours(), isTalking(), talkingFor(), quality(), timingAdvance(), cellsVisited(),
+        bytesReceived(), bytesSent()};
 }
 
 } // namespace spectrel

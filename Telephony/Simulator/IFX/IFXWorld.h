@@ -1,24 +1,15 @@
 #pragma once
 
+#include "Telephony/Reports/IFXReport.h"
+#include "Telephony/Simulator/Dice.h"
+#include "Telephony/Simulator/Journey.h"
 #include "Telephony/Simulator/MastRoad.h"
-#include "Telephony/Simulator/Radio.h"
 
 #include <chrono>
 #include <cstdint>
 #include <vector>
 
 namespace spectrel {
-
-/// One GSM 900 cell as the phone could measure it.
-struct IFXCell {
-    std::uint16_t channel = 0; // ARFCN, 1 to 124 (3GPP TS 45.005, clause 2)
-    std::uint8_t networkColour = 0; // NCC and BCC, 0 to 7
-    std::uint8_t stationColour = 0;
-    std::uint16_t locationArea = 0;
-    std::uint16_t identity = 0;
-    std::uint8_t routingArea = 0;
-    double level = 0; // dBm, as heard now
-};
 
 /// A GSM phone on a drive: which cell it is on, what else it hears, whether it talks, what it has transferred.
 ///
@@ -34,7 +25,7 @@ public:
         return _cells[_serving];
     }
     /// The strongest other cells that can be heard, strongest first.
-    std::vector<const IFXCell*> neighbours(std::size_t atMost) const;
+    std::vector<IFXCell> neighbours() const;
     bool isTalking() const;
     /// Seconds since the call began; 0 without one.
     std::chrono::seconds talkingFor() const;
@@ -58,6 +49,8 @@ public:
     {
         return static_cast<std::uint64_t>(_sent);
     }
+    /// All of it, for the message.
+    IFXReport report() const;
 
 private:
     void measure();

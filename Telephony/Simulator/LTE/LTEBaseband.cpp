@@ -31,9 +31,15 @@ Bytes reselection(const LTEWorld& world, Moment time)
     return world.isConnected() ? Bytes() : lteReselectionRecord(world.idleMode().candidate(), time);
 }
 
+Bytes cellInformation(const LTEWorld& world, Moment time)
+{
+    constexpr std::size_t Neighbours = 4;
+    return lteCellInformationRecord(world.servingCell(), world.neighbours(Neighbours), time);
+}
+
 constexpr std::array<Cadence<LTEWorld>, 9> Cadences {{
     {30s, true, [](const LTEWorld&, Moment time) { return simFilesRecord(time); }},
-    {5s, true, [](const LTEWorld& world, Moment time) { return lteCellInformationRecord(world, time); }},
+    {5s, true, cellInformation},
     {2s, true,
         [](const LTEWorld& world, Moment time) {
             return contextsRecord(world.bytesReceived(), world.bytesSent(), time);

@@ -6,10 +6,10 @@ namespace spectrel {
 
 namespace {
 
-constexpr int PhonePower = 23; // dBm, power class 3 (3GPP TS 36.101, table 6.2.2-1)
+constexpr int MaxUETransmitPower = 23; // dBm, power class 3 (3GPP TS 36.101, table 6.2.2-1)
 constexpr double Audible = -24; // dB of RSRQ
-constexpr unsigned LargestCycleCount = 63; // the record's field has six bits
-constexpr std::size_t NeighboursTold = 32;
+constexpr unsigned MaxCycleCount = 63; // the record's field has six bits
+constexpr std::size_t MaxNeighbours = 32;
 
 /// The second antenna's path is a little longer.
 constexpr std::uint32_t SecondAntennaDelay = 2; // samples
@@ -20,7 +20,7 @@ LTEIdleNeighbour neighbourReport(const LTECell& cell)
     report.physicalCellId = cell.physicalCellId;
     report.measured = cell.measured;
     report.average = cell.average;
-    report.receiveLevel = cell.receiveLevel();
+    report.srxlev = cell.srxlev();
     report.frequencyOffset = cell.frequencyOffset;
     report.antennas[0] = {cell.frameOffset, cell.sampleOffset};
     report.antennas[1] = {cell.frameOffset, cell.sampleOffset + SecondAntennaDelay};
@@ -61,29 +61,29 @@ void LTEIdleMode::judgeServing()
     using namespace LTEMeasurementRule;
     const LTECell& cell = servingCell();
     const LTELayer& layer = *cell.layer;
-    const int level = cell.receiveLevel();
+    const int level = cell.srxlev();
     std::uint8_t rules = 0;
-    if (!layer.intraSearch || level <= *layer.intraSearch)
+    if (!layer.sIntraSearch || level <= *layer.sIntraSearch)
         rules |= SameCarrier;
-    if (!layer.nonIntraSearch || level <= *layer.nonIntraSearch)
+    if (!layer.sNonIntraSearch || level <= *layer.sNonIntraSearch)
         rules |= LowerPriorities;
     if (std::ranges::any_of(LTERoad::layers(), [&](const LTELayer& other) { return other.priority > layer.priority; }))
         rules |= HigherPriorities;
 
-    const LTEServingReport last = _report;
+    const LTEServingReport previous = _report;
     _report.channel = cell.downlinkChannel;
     _report.physicalCellId = cell.physicalCellId;
     _report.priority = layer.priority;
     _report.measured = cell.measured;
     _report.average = cell.average;
-    _report.leastLevel = layer.leastLevel;
-    _report.greatestPower = layer.greatestPower;
-    _report.phonePower = PhonePower;
-    _report.receiveLevel = level;
-    _report.cyclesBelowZero = level < 0 ? std::min(last.cyclesBelowZero + 1, LargestCycleCount) : 0;
-    _report.intraSearch = layer.intraSearch;
-    _report.nonIntraSearch = layer.nonIntraSearch;
-    _report.areRulesUpdated = rules != last.rules;
+    _report.qRxLevMin = layer.qRxLevMin;
+    _report.pMax = layer.pMax;
+    _report.maxUETransmitPower = MaxUETransmitPower;
+    _report.srxlev = level;
+    _report.cyclesBelowZero = level < 0 ? std::min(previous.cyclesBelowZero + 1, MaxCycleCount) : 0;
+    _report.sIntraSearch = layer.sIntraSearch;
+    _report.sNonIntraSearch = layer.sNonIntraSearch;
+    _report.areRulesUpdated = rules != previous.rules;
     _report.rules = rules;
 }
 
@@ -111,20 +111,19 @@ bool LTEIdleMode::isCandidate(const LTECell& cell) const
     const LTELayer& from = *servingCell().layer;
     const LTELayer& to = *cell.layer;
     if (to.priority > from.priority)
-        return cell.receiveLevel() > to.highThreshold;
+        return cell.srxlev() > to.threshHigh;
     if (&to == &from)
-        return cell.receiveLevel() > 0 && cell.average.rsrp > servingCell().average.rsrp + Hysteresis;
-    return servingCell().receiveLevel() < from.servingLowThreshold && cell.receiveLevel() > to.lowThreshold;
+        return cell.srxlev() > 0 && cell.average.rsrp > servingCell().average.rsrp + Hysteresis;
+    return servingCell().srxlev() < from.threshServingLow && cell.srxlev() > to.threshLow;
 }
 
 bool LTEIdleMode::isCandidate(const OtherCell& cell) const
 {
-    constexpr int LowThreshold = 6; // dB
-    return servingCell().receiveLevel() < servingCell().layer->servingLowThreshold
-        && cell.receiveLevel() > LowThreshold;
+    constexpr int ThreshLow = 6; // dB
+    return servingCell().srxlev() < servingCell().layer->threshServingLow && cell.srxlev() > ThreshLow;
 }
 
-std::optional<std::size_t> LTEIdleMode::bestOf(std::chrono::milliseconds atLeast) const
+std::optional<std::size_t> LTEIdleMode::bestOf(std::chrono::milliseconds minTime) const
 {
     std::optional<std::size_t> best;
     const auto rank = [this](std::size_t index) {
@@ -132,7 +131,7 @@ std::optional<std::size_t> LTEIdleMode::bestOf(std::chrono::milliseconds atLeast
         return std::pair(cell.layer->priority, cell.average.rsrp);
     };
     for (std::size_t index = 0; index < _candidateFor.size(); ++index) {
-        if (_candidateFor[index] >= atLeast && (!best || rank(index) > rank(*best)))
+        if (_candidateFor[index] >= minTime && (!best || rank(index) > rank(*best)))
             best = index;
     }
     return best;
@@ -143,7 +142,7 @@ std::optional<std::size_t> LTEIdleMode::strongestSuitable() const
     std::optional<std::size_t> best;
     for (std::size_t index = 0; index < _road.cells().size(); ++index) {
         const LTECell& cell = _road.cells()[index];
-        if (cell.receiveLevel() > 0 && (!best || cell.average.rsrp > _road.cells()[*best].average.rsrp))
+        if (cell.srxlev() > 0 && (!best || cell.average.rsrp > _road.cells()[*best].average.rsrp))
             best = index;
     }
     return best;
@@ -170,13 +169,13 @@ LTENeighbourReport LTEIdleMode::neighbours() const
     if (carriers.empty())
         return {};
     const LTELayer& carrier = *carriers[_turn % carriers.size()];
-    LTENeighbourReport report {carrier.downlinkChannel, carrier.leastLevel, {}};
+    LTENeighbourReport report {carrier.downlinkChannel, carrier.qRxLevMin, {}};
     for (const LTECell& cell : _road.cells()) {
         if (cell.layer == &carrier && &cell != &servingCell() && cell.average.rsrq > Audible)
             report.neighbours.push_back(neighbourReport(cell));
     }
     std::ranges::sort(report.neighbours, [](const auto& a, const auto& b) { return a.average.rsrp > b.average.rsrp; });
-    report.neighbours.resize(std::min(report.neighbours.size(), NeighboursTold));
+    report.neighbours.resize(std::min(report.neighbours.size(), MaxNeighbours));
     return report;
 }
 

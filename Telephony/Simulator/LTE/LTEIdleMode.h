@@ -18,7 +18,7 @@ namespace spectrel {
 /// - it is on the same carrier and stronger than the serving cell by the hysteresis;
 /// - it has a lower priority, the serving cell's Srxlev is below its low threshold and the candidate's exceeds its own.
 /// A candidate that stays one for the reselection time is moved to, the highest priority first. Cells of other radio
-/// technologies are told, but the phone stays with LTE.
+/// technologies are reported, but the phone stays with LTE.
 class LTEIdleMode {
 public:
     /// The paging cycle: near the usual 1.28 s, in whole steps of the simulation.
@@ -51,7 +51,7 @@ private:
     void judgeServing();
     void judgeOthers();
     std::vector<const LTELayer*> carriersToMeasure() const;
-    std::optional<std::size_t> bestOf(std::chrono::milliseconds atLeast) const;
+    std::optional<std::size_t> bestOf(std::chrono::milliseconds minTime) const;
     std::optional<std::size_t> strongestSuitable() const;
     const LTECell& servingCell() const
     {

@@ -2,7 +2,9 @@
 
 #include "Telephony/Reports/LTECell.h"
 #include "Telephony/Reports/LTEReports.h"
-#include "Telephony/Simulator/Radio.h"
+#include "Telephony/Simulator/Dice.h"
+#include "Telephony/Simulator/Journey.h"
+#include "Telephony/Simulator/Propagation.h"
 
 #include <chrono>
 #include <span>
@@ -15,12 +17,12 @@ struct OtherCell {
     ReselectionCandidate candidate;
     double position; // metres along the road
     double power; // dBm
-    int leastLevel; // dBm
+    int qRxLevMin; // dBm
     double level = -140; // dBm, now
 
-    int receiveLevel() const
+    int srxlev() const
     {
-        return static_cast<int>(level) - leastLevel;
+        return static_cast<int>(level) - qRxLevMin;
     }
 };
 

@@ -11,7 +11,7 @@ constexpr std::chrono::milliseconds TimeToTrigger {640}; // ... for this long (3
 constexpr double ConnectionLost = -127; // dBm of RSRP
 constexpr double Measurable = -19; // dB of RSRQ; of weaker cells the phone knows no more than that they are there
 constexpr double Audible = -25; // dB of RSRQ
-constexpr std::size_t MeasuredTold = 8;
+constexpr std::size_t MaxMeasured = 8;
 
 bool isStronger(const LTECell* a, const LTECell* b)
 {
@@ -106,7 +106,7 @@ LTEConnectedReport LTEWorld::connectedReport() const
     for (const LTECell* cell : neighbours(_road.cells().size())) {
         if (cell->layer != serving.layer || cell->average.rsrq < Audible)
             continue;
-        if (cell->average.rsrq >= Measurable && report.measured.size() < MeasuredTold)
+        if (cell->average.rsrq >= Measurable && report.measured.size() < MaxMeasured)
             report.measured.push_back({cell->physicalCellId, cell->average});
         else
             report.detected.push_back(cell->physicalCellId);
@@ -114,7 +114,7 @@ LTEConnectedReport LTEWorld::connectedReport() const
     return report;
 }
 
-std::vector<const LTECell*> LTEWorld::neighbours(std::size_t atMost) const
+std::vector<const LTECell*> LTEWorld::neighbours(std::size_t maxCount) const
 {
     std::vector<const LTECell*> others;
     for (const LTECell& cell : _road.cells()) {
@@ -122,7 +122,7 @@ std::vector<const LTECell*> LTEWorld::neighbours(std::size_t atMost) const
             others.push_back(&cell);
     }
     std::ranges::sort(others, isStronger);
-    others.resize(std::min(others.size(), atMost));
+    others.resize(std::min(others.size(), maxCount));
     return others;
 }
 

@@ -2,9 +2,10 @@
 
 #include "Telephony/Reports/LTECell.h"
 #include "Telephony/Reports/LTEReports.h"
+#include "Telephony/Simulator/Dice.h"
+#include "Telephony/Simulator/Journey.h"
 #include "Telephony/Simulator/LTE/LTEIdleMode.h"
 #include "Telephony/Simulator/LTE/LTERoad.h"
-#include "Telephony/Simulator/Radio.h"
 #include "Telephony/Simulator/Usage.h"
 
 #include <chrono>
@@ -15,7 +16,7 @@ namespace spectrel {
 
 /// A phone that is driven along a road past LTE sites: who serves it, what else it hears, what it has transferred.
 ///
-/// It is idle and connected by turns: idle it reselects cells as `LTEIdleMode` tells, connected the network hands it
+/// It is idle and connected by turns: idle it reselects cells as `LTEIdleMode` decides, connected the network hands it
 /// over to a cell that is stronger for a while. The same seed gives the same drive.
 class LTEWorld {
 public:
@@ -42,7 +43,7 @@ public:
     }
     LTEConnectedReport connectedReport() const;
     /// The strongest other cells, strongest first.
-    std::vector<const LTECell*> neighbours(std::size_t atMost) const;
+    std::vector<const LTECell*> neighbours(std::size_t maxCount) const;
     std::uint64_t bytesReceived() const
     {
         return static_cast<std::uint64_t>(_received);

@@ -26,7 +26,10 @@ Bytes noTransportChannels(const UTRANWorld& world, Moment time)
 
 constexpr std::array<Cadence<UTRANWorld>, 9> Cadences {{
     {30s, true, [](const UTRANWorld& world, Moment time) { return utranSIMFilesRecord(world.servingCell(), time); }},
-    {5s, true, [](const UTRANWorld& world, Moment time) { return utranCellInformationRecord(world, time); }},
+    {5s, true,
+        [](const UTRANWorld& world, Moment time) {
+            return utranCellInformationRecord(world.servingCell(), world.otherCells(), time);
+        }},
     {2s, true,
         [](const UTRANWorld& world, Moment time) {
             return packetContextRecord(world.bytesReceived(), world.bytesSent(), time);

@@ -27,8 +27,8 @@ constexpr double NamedDistance = 1000; // metres between a cell and the neighbou
 constexpr double Audible = -112; // dBm
 constexpr double Detectable = -100; // dBm, of a cell that is not named
 constexpr double JointDetectionRange = 15; // dB below the serving cell
-constexpr std::size_t NeighboursTold = 10;
-constexpr std::size_t GSMNeighboursTold = 6;
+constexpr std::size_t MaxNeighbours = 10;
+constexpr std::size_t MaxGSMNeighbours = 6;
 constexpr double GSMAudible = -108; // dBm
 
 double milliwatts(double dBm)
@@ -80,7 +80,7 @@ void UTRANWorld::buildRoad()
         cell.locationArea = static_cast<std::uint16_t>(position < RoadLength / 2 ? 4101 : 4102);
         cell.registrationArea = static_cast<std::uint8_t>(position < RoadLength / 2 ? 17 : 18);
         cell.channel = Channels[_dice.below(Channels.size())];
-        cell.parameter = static_cast<std::uint8_t>(_dice.below(128));
+        cell.cellParameterId = static_cast<std::uint8_t>(_dice.below(128));
         cell.position = position + _dice.between(-40, 40);
         cell.offset = _dice.between(30, 100);
         _cells.push_back(cell);
@@ -141,7 +141,7 @@ void UTRANWorld::reselect(std::chrono::milliseconds step)
 {
     const auto others = otherCells();
     const auto best = std::ranges::find_if(others, [this](const UTRANCell* cell) { return isMeasured(*cell); });
-    const bool isRankedAbove = best != others.end() && (*best)->rscp > UTRANThresholds::LeastRSCP
+    const bool isRankedAbove = best != others.end() && (*best)->rscp > UTRANThresholds::QRxLevMin
         && (*best)->rscp > servingCell().rscp + UTRANThresholds::Hysteresis;
     if (!isRankedAbove) {
         _candidateFor = 0ms;
@@ -175,7 +175,7 @@ bool UTRANWorld::isNamed(const UTRANCell& cell) const
 bool UTRANWorld::isMeasured(const UTRANCell& cell) const
 {
     return cell.channel == servingCell().channel || _connection.isOnDedicatedChannel()
-        || receiveLevel() <= UTRANThresholds::SearchBelow;
+        || srxlev() <= UTRANThresholds::SInterSearch;
 }
 
 bool UTRANWorld::isDetected(const UTRANCell& cell) const
@@ -185,32 +185,32 @@ bool UTRANWorld::isDetected(const UTRANCell& cell) const
 
 std::vector<UTRANNeighbour> UTRANWorld::neighbours() const
 {
-    std::vector<UTRANNeighbour> told;
-    const auto tell = [&](const UTRANCell& cell, UTRANCellSet set) {
+    std::vector<UTRANNeighbour> reported;
+    const auto report = [&](const UTRANCell& cell, UTRANCellSet set) {
         const bool isNear =
             cell.channel == servingCell().channel && cell.rscp > servingCell().rscp - JointDetectionRange;
-        told.push_back({cell.channel, cell.parameter, cell.rscp, set, isNear});
+        reported.push_back({cell.channel, cell.cellParameterId, cell.rscp, set, isNear});
     };
     if (_connection.isOnDedicatedChannel())
-        tell(servingCell(), UTRANCellSet::Active);
+        report(servingCell(), UTRANCellSet::Active);
     for (const UTRANCell* cell : otherCells()) {
-        if (told.size() == NeighboursTold)
+        if (reported.size() == MaxNeighbours)
             break;
         if (!isNamed(*cell) && isDetected(*cell))
-            tell(*cell, UTRANCellSet::Detected);
+            report(*cell, UTRANCellSet::Detected);
         else if (isNamed(*cell) && isMeasured(*cell) && cell->rscp > Audible)
-            tell(*cell, UTRANCellSet::Monitored);
+            report(*cell, UTRANCellSet::Monitored);
     }
-    return told;
+    return reported;
 }
 
 std::vector<GSMNeighbour> UTRANWorld::gsmNeighbours() const
 {
-    std::vector<GSMNeighbour> told = _gsmCells;
-    std::erase_if(told, [](const GSMNeighbour& cell) { return cell.rssi < GSMAudible; });
-    std::ranges::sort(told, [](const GSMNeighbour& a, const GSMNeighbour& b) { return a.rssi > b.rssi; });
-    told.resize(std::min(told.size(), GSMNeighboursTold));
-    return told;
+    std::vector<GSMNeighbour> reported = _gsmCells;
+    std::erase_if(reported, [](const GSMNeighbour& cell) { return cell.rssi < GSMAudible; });
+    std::ranges::sort(reported, [](const GSMNeighbour& a, const GSMNeighbour& b) { return a.rssi > b.rssi; });
+    reported.resize(std::min(reported.size(), MaxGSMNeighbours));
+    return reported;
 }
 
 /// Power control holds the target, as long as the serving cell is strong enough against the others on its channel and
@@ -222,8 +222,8 @@ void UTRANWorld::controlPower()
         if (cell->channel == servingCell().channel)
             interference += milliwatts(cell->rscp);
     }
-    const double atMost = servingCell().rscp - 10 * std::log10(interference);
-    _signalToInterference = std::min(TargetSignal, atMost) + _dice.between(-1.5, 1.5);
+    const double maxSignal = servingCell().rscp - 10 * std::log10(interference);
+    _signalToInterference = std::min(TargetSignal, maxSignal) + _dice.between(-1.5, 1.5);
 }
 
 TransportReport UTRANWorld::transportChannels() const

@@ -2,8 +2,10 @@
 
 #include "Telephony/Reports/UTRANCell.h"
 #include "Telephony/Reports/UTRANReports.h"
+#include "Telephony/Simulator/Dice.h"
+#include "Telephony/Simulator/Journey.h"
+#include "Telephony/Simulator/Propagation.h"
 #include "Telephony/Simulator/RRCConnection.h"
-#include "Telephony/Simulator/Radio.h"
 #include "Telephony/Simulator/Usage.h"
 
 #include <chrono>
@@ -24,14 +26,14 @@ public:
     {
         return _cells[_serving];
     }
-    /// Srxlev: how far the serving cell is above the least level, dB. At 0 or below the phone may only call for help.
-    double receiveLevel() const
+    /// Srxlev: how far the serving cell is above Qrxlevmin, dB. At 0 or below the phone may only call for help.
+    double srxlev() const
     {
-        return servingCell().rscp - UTRANThresholds::LeastRSCP;
+        return servingCell().rscp - UTRANThresholds::QRxLevMin;
     }
     bool isInService() const
     {
-        return receiveLevel() > 0;
+        return srxlev() > 0;
     }
     RRCMode mode() const
     {

@@ -29,7 +29,7 @@ TEST(LevelStepsTest, AreTheNearestWithinTheField)
     EXPECT_EQ(levelSteps(-139.88, -140, 4, 9), 0u);
     EXPECT_EQ(levelSteps(-139.87, -140, 4, 9), 1u);
     EXPECT_EQ(levelSteps(-150, -140, 4, 9), 0u) << "below the lowest";
-    EXPECT_EQ(levelSteps(0, -140, 4, 9), 511u) << "above what the field can tell";
+    EXPECT_EQ(levelSteps(0, -140, 4, 9), 511u) << "above what the field can hold";
     EXPECT_EQ(levelSteps(-96, -140, 0.5, 6), 22u);
 }
 

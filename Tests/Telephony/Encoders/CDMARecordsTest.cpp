@@ -96,18 +96,18 @@ std::string decimals(double number)
 TEST_F(CDMARecordsTest, LengthsAreThoseOfTheRecords)
 {
     CDMAWorld world(Scene::Drive, 1);
-    EXPECT_EQ(cdmaSystemInformationRecord(world, Time).size(), 186u);
-    EXPECT_EQ(evdoAirLinkRecord(world, Time).size(), 50u);
-    EXPECT_EQ(evdoForwardCountersRecord(world, Time).size(), 241u);
-    EXPECT_EQ(evdoReverseCountersRecord(world, Time).size(), 1750u);
-    EXPECT_EQ(evdoFingersRecord(world, Time).size(), 23u + 4 * 14);
-    EXPECT_EQ(evdoPilotsRecord(world, Time).size(), 25u + 12);
+    EXPECT_EQ(cdmaSystemInformationRecord(world.report(), Time).size(), 186u);
+    EXPECT_EQ(evdoAirLinkRecord(world.report(), Time).size(), 50u);
+    EXPECT_EQ(evdoForwardCountersRecord(world.report(), Time).size(), 241u);
+    EXPECT_EQ(evdoReverseCountersRecord(world.report(), Time).size(), 1750u);
+    EXPECT_EQ(evdoFingersRecord(world.report(), Time).size(), 23u + 4 * 14);
+    EXPECT_EQ(evdoPilotsRecord(world.report(), Time).size(), 25u + 12);
 }
 
 TEST_F(CDMARecordsTest, SubpacketsFollowEachOtherUpToTheRecordsEnd)
 {
     drive(50, [](const CDMAWorld& world) {
-        const Bytes record = cdmaSearcherRecord(world, Time);
+        const Bytes record = cdmaSearcherRecord(world.report(), Time);
         EXPECT_EQ(record[14], 4);
         std::size_t place = 17;
         for (std::uint8_t id = 1; id <= 4; ++id) {
@@ -122,7 +122,7 @@ TEST_F(CDMARecordsTest, SubpacketsFollowEachOtherUpToTheRecordsEnd)
 TEST_F(CDMARecordsTest, AirLinkIsShownAsItIs)
 {
     drive(10, [this](const CDMAWorld& world) {
-        deliver(evdoAirLinkRecord(world, Time));
+        deliver(evdoAirLinkRecord(world.report(), Time));
         EXPECT_EQ(text("kChannel"), "325");
         EXPECT_EQ(text("kBandClass"), "1.8 to 2.0GHz PCS band [1]");
         EXPECT_NEAR(number("kRxAGC0"), world.received(), 0.51);
@@ -146,7 +146,7 @@ TEST_F(CDMARecordsTest, AirLinkIsShownAsItIs)
 TEST_F(CDMARecordsTest, SearcherIsShownAsItIs)
 {
     drive(10, [this](const CDMAWorld& world) {
-        deliver(cdmaSearcherRecord(world, Time));
+        deliver(cdmaSearcherRecord(world.report(), Time));
         EXPECT_EQ(text("k1xRx0ChanNum"), "425");
         EXPECT_NEAR(number("k1xRxAGC0"), world.received(), 0.18);
         if (world.activity() == Activity::Voice) {
@@ -173,8 +173,8 @@ TEST_F(CDMARecordsTest, SearcherIsShownAsItIs)
 TEST_F(CDMARecordsTest, PilotsAndFingersAreShownAsTheyAre)
 {
     drive(10, [this](const CDMAWorld& world) {
-        deliver(evdoPilotsRecord(world, Time));
-        deliver(evdoFingersRecord(world, Time));
+        deliver(evdoPilotsRecord(world.report(), Time));
+        deliver(evdoFingersRecord(world.report(), Time));
         if (world.activity() == Activity::Voice) {
             EXPECT_EQ(text("kActiveSetPilots"), "(none)");
             EXPECT_EQ(text("kFingerC2I"), "(none)");
@@ -204,20 +204,20 @@ TEST_F(CDMARecordsTest, CountersAddUpToTheShownRates)
     drive(20, [&](const CDMAWorld& world) {
         if (world.activity() == Activity::Voice)
             return;
-        deliver(evdoForwardCountersRecord(world, Time));
-        deliver(evdoReverseCountersRecord(world, Time));
-        const EVDOCounters& counters = world.countersAtSecond();
+        deliver(evdoForwardCountersRecord(world.report(), Time));
+        deliver(evdoReverseCountersRecord(world.report(), Time));
+        const EVDOCounts& counts = world.countsAtSecond();
         if (secondBefore != 0) {
             const double span = 1024.0 * (world.second() - secondBefore);
             EXPECT_EQ(text("kFLDataRate"),
-                decimals(static_cast<double>(counters.forwardBits() - forwardBefore) / span) + " kbps");
+                decimals(static_cast<double>(counts.forwardBits - forwardBefore) / span) + " kbps");
             EXPECT_EQ(text("kRLDataRate"),
-                decimals(static_cast<double>(counters.reverseBits() - reverseBefore) / span) + " kbps");
+                decimals(static_cast<double>(counts.reverseBits - reverseBefore) / span) + " kbps");
             ++rates;
         }
         secondBefore = world.second();
-        forwardBefore = counters.forwardBits();
-        reverseBefore = counters.reverseBits();
+        forwardBefore = counts.forwardBits;
+        reverseBefore = counts.reverseBits;
     });
     EXPECT_GT(rates, 90);
 }
@@ -228,7 +228,7 @@ TEST_F(CDMARecordsTest, FramesAddUpToTheShownRate)
     drive(1, [&](const CDMAWorld& world) {
         if (world.activity() != Activity::Voice)
             return;
-        deliver(cdmaFrameRecord(world, Time));
+        deliver(cdmaFrameRecord(world.report(), Time));
         rate = (world.isFrameBad() ? 1.0F / 64 : 0) + 63.0F / 64 * rate;
         ASSERT_EQ(text("k1xTrafficFER"), decimals(100.0 * rate) + "%");
     });
@@ -238,7 +238,7 @@ TEST_F(CDMARecordsTest, FramesAddUpToTheShownRate)
 TEST_F(CDMARecordsTest, SystemInformationIsThatOfTheServingSector)
 {
     drive(50, [&](const CDMAWorld& world) {
-        deliver(cdmaSystemInformationRecord(world, Time));
+        deliver(cdmaSystemInformationRecord(world.report(), Time));
         EXPECT_EQ(text("kSystemId"), std::to_string(world.serving().systemId));
         EXPECT_EQ(text("kNetworkId"), std::to_string(world.serving().networkId));
         EXPECT_EQ(text("kBaseId"), std::to_string(world.serving().baseId));
@@ -252,9 +252,9 @@ TEST_F(CDMARecordsTest, OneCarrierCountsNothingWhileTheOtherHasTheRadio)
 {
     drive(10, [](const CDMAWorld& world) {
         const bool isTalking = world.activity() == Activity::Voice;
-        EXPECT_NE(cdmaFrameRecord(world, Time).empty(), isTalking);
+        EXPECT_NE(cdmaFrameRecord(world.report(), Time).empty(), isTalking);
         for (auto* record : {evdoForwardCountersRecord, evdoReverseCountersRecord})
-            EXPECT_EQ(record(world, Time).empty(), isTalking);
+            EXPECT_EQ(record(world.report(), Time).empty(), isTalking);
     });
 }
 

@@ -1,18 +1,12 @@
 #include "Telephony/Encoders/LTERecords.h"
 
 #include "Telephony/Reports/LTEReports.h"
+#include "Tests/Telephony/RecordBytes.h"
 
 #include <gtest/gtest.h>
 
 namespace spectrel {
 namespace {
-
-constexpr Moment Epoch1980 = std::chrono::sys_days(std::chrono::year(1980) / 1 / 6);
-
-Bytes payload(const Bytes& record)
-{
-    return {record.begin() + 13, record.end()};
-}
 
 /// `count` bits of a record from a bit of a byte on, the lower-addressed byte being the lower one.
 unsigned bitsOf(const Bytes& record, std::size_t byte, unsigned first, unsigned count)
@@ -31,16 +25,46 @@ LTEServingReport servingReport()
     report.priority = 5;
     report.measured = {-95.25, -60.5, -12.25};
     report.average = {-95.5, -60, -11.75};
-    report.leastLevel = -124;
-    report.greatestPower = 23;
-    report.phonePower = 20;
-    report.receiveLevel = -7;
+    report.qRxLevMin = -124;
+    report.pMax = 23;
+    report.maxUETransmitPower = 20;
+    report.srxlev = -7;
     report.cyclesBelowZero = 3;
-    report.intraSearch = 46;
-    report.nonIntraSearch = 26;
+    report.sIntraSearch = 46;
+    report.sNonIntraSearch = 26;
     report.areRulesUpdated = true;
     report.rules = 5;
     return report;
+}
+
+LTECell cell()
+{
+    LTECell some;
+    some.identity = 0x0123456;
+    some.physicalCellId = 0x01F7;
+    some.downlinkChannel = 1300;
+    some.uplinkChannel = 19300;
+    some.band = 3;
+    some.resourceBlocks = 100;
+    some.antennas = 4;
+    some.trackingArea = 0xABCD;
+    return some;
+}
+
+TEST(LTERecordsTest, ServingCellRecordIsLaidOutByteForByte)
+{
+    const Bytes record = lteServingCellRecord(cell(), Epoch1980);
+    const Bytes payload {2, 0xF7, 0x01, 0x14, 0x05, 0x64, 0x4B, 100, 100, 0x56, 0x34, 0x12, 0x00, 0xCD, 0xAB, 3, 0, 0,
+        0, 0, 0, 0, 0, 0, 0};
+    ASSERT_EQ(record.size(), 38u);
+    EXPECT_EQ(payloadOf(record), payload);
+}
+
+TEST(LTERecordsTest, AntennasRecordHasTheAntennasAtOffset20)
+{
+    const Bytes record = lteAntennasRecord(cell(), Epoch1980);
+    ASSERT_EQ(record.size(), 22u);
+    EXPECT_EQ(record[20], 4);
 }
 
 TEST(LTERecordsTest, ConnectedModeHasTheDetectedCellsAfterTheMeasuredOnes)
@@ -48,7 +72,7 @@ TEST(LTERecordsTest, ConnectedModeHasTheDetectedCellsAfterTheMeasuredOnes)
     LTEConnectedReport report {1300, 257, 9, {-95, 0, -11}, {}, {515, 4}};
     report.measured.push_back({258, {-139.75, 0, -19.875}});
     const Bytes record = lteConnectedModeRecord(report, Epoch1980);
-    EXPECT_EQ(payload(record),
+    EXPECT_EQ(payloadOf(record),
         (Bytes {
             3, 0, 0, 0, 0x14, 0x05, 0x01, 0x01, 9, 0, 180, 0, 72, 0, 1, 2, 0x02, 0x01, 1, 0, 1, 0, 0x03, 0x02, 4, 0}));
 }
@@ -91,9 +115,9 @@ TEST(LTERecordsTest, ServingMeasurementHasEveryFieldAtItsBits)
 TEST(LTERecordsTest, AbsentThresholdsHaveTheirOwnCodes)
 {
     LTEServingReport report = servingReport();
-    report.greatestPower.reset();
-    report.intraSearch.reset();
-    report.nonIntraSearch.reset();
+    report.pMax.reset();
+    report.sIntraSearch.reset();
+    report.sNonIntraSearch.reset();
     const Bytes record = lteServingMeasurementRecord(report, Epoch1980);
     EXPECT_EQ(bitsOf(record, 26, 7, 7), 64u);
     EXPECT_EQ(bitsOf(record, 30, 5, 6), 32u);
@@ -106,7 +130,7 @@ TEST(LTERecordsTest, NeighbourMeasurementHasEveryFieldOfEveryEntryAtItsBits)
     neighbour.physicalCellId = 300;
     neighbour.measured = {-95, -60.5, -12.25};
     neighbour.average = {-94, -60, -11.75};
-    neighbour.receiveLevel = 29;
+    neighbour.srxlev = 29;
     neighbour.frequencyOffset = 0xABCD;
     neighbour.antennas[0] = {1023, 307199};
     neighbour.antennas[1] = {1, 2};
@@ -129,7 +153,7 @@ TEST(LTERecordsTest, NeighbourMeasurementHasEveryFieldOfEveryEntryAtItsBits)
     EXPECT_EQ(bitsOf(record, 58, 3, 19), 2u);
 }
 
-TEST(LTERecordsTest, NeighbourMeasurementTellsOneTo32)
+TEST(LTERecordsTest, NeighbourMeasurementHoldsOneTo32)
 {
     LTENeighbourReport report;
     EXPECT_TRUE(lteNeighbourMeasurementRecord(report, Epoch1980).empty());
@@ -168,7 +192,7 @@ TEST(LTERecordsTest, LaterCandidatesLieOverTheEarlierOnes)
         Bytes(record.begin() + 21, record.begin() + 33), (Bytes {6, 0, 0, 0, 3, 0, 1, 0, 0xCC, 0x29, 0x37, 0x01}));
 }
 
-TEST(LTERecordsTest, NoCandidateIsToldTo)
+TEST(LTERecordsTest, NoCandidateIsWrittenToo)
 {
     const Bytes record = lteReselectionRecord({1300, 44, {}}, Epoch1980);
     EXPECT_EQ(record.size(), 21u);

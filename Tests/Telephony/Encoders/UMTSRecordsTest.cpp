@@ -131,7 +131,7 @@ TEST(UMTSRecordsTest, SecondaryProcessesStandFarBehindThePrimaryOnes)
     EXPECT_EQ(two[18 + 2 * 162], 9);
 }
 
-TEST(UMTSRecordsTest, ListsAreCutToWhatTheirCountCanTell)
+TEST(UMTSRecordsTest, ListsAreCutToWhatTheirCountCanHold)
 {
     const Bytes record = rankingRecord({std::vector<RankedUMTSCell>(300), {}}, Epoch1980);
     EXPECT_EQ(record[13], 255);

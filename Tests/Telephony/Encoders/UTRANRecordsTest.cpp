@@ -38,7 +38,7 @@ TEST(UTRANRecordsTest, ServingCellIsLaidOutByteForByte)
 
 TEST(UTRANRecordsTest, NeighboursStand16BytesApartFromOffset168)
 {
-    // 10054 = 0x2746 in 14 bits; parameter 0x55 in 7; -100 dBm is level 16 in 8; set 1 in 2; 1.
+    // 10054 = 0x2746 in 14 bits; cellParameterId 0x55 in 7; -100 dBm is level 16 in 8; set 1 in 2; 1.
     const UTRANNeighbour cells[] {{}, {10054, 0x55, -100, UTRANCellSet::Monitored, true}};
     const Bytes record = utranNeighbourRecord(cells, Epoch1980);
     EXPECT_EQ(record.size(), 200u);
@@ -98,16 +98,19 @@ TEST(UTRANRecordsTest, CodedCompositeChannelsStandWhereTheTransportChannelsPutTh
     EXPECT_EQ(from(record, 323, 8), (Bytes {1, 2, 30, 28, 0, 0, 0, 0}));
 }
 
-TEST(UTRANRecordsTest, CellInformationTellsTheServingCellFirst)
+TEST(UTRANRecordsTest, CellInformationNamesTheServingCellFirst)
 {
-    const UTRANWorld world(Scene::Drive, 1);
-    const auto cells = parsePropertyList(ByteView(utranCellInformationRecord(world, Epoch1980)).subspan(13));
+    UTRANCell served;
+    served.identity = 12u << 16 | 301;
+    const UTRANCell other;
+    const std::vector<const UTRANCell*> others(6, &other);
+    const auto cells = parsePropertyList(ByteView(utranCellInformationRecord(served, others, Epoch1980)).subspan(13));
     ASSERT_TRUE(cells && cells->list());
-    EXPECT_EQ(cells->list()->count(), 5u);
+    EXPECT_EQ(cells->list()->count(), 5u) << "the serving one and four";
     const auto& serving = *(*cells->list())[0].dictionary();
     EXPECT_EQ(serving["kRKCellMonitorCellType"], Value("kRKCellMonitorCellTypeServing"));
     EXPECT_EQ(serving["kRKCellMonitorCellRadioAccessTechnology"], Value("kRKCellMonitorRadioAccessTechnologyUTRAN2"));
-    EXPECT_EQ(serving["kRKCellMonitorCellId"].int32(), static_cast<std::int32_t>(world.servingCell().identity));
+    EXPECT_EQ(serving["kRKCellMonitorCellId"].int32(), 12 << 16 | 301);
 }
 
 } // namespace

@@ -1,7 +1,7 @@
 #include "Telephony/Modem/ModemRecords.h"
 
 #include "Records/TelephonyConstants.h"
-#include "Telephony/Encoders/RecordWriter.h"
+#include "Telephony/RoutedCode.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
@@ -40,7 +40,8 @@ CellFacts cell(CellKind kind, bool isServing = true)
     facts.areaCode = 0x84CD;
     facts.cellId = 0xD30156;
     facts.channel = 1300;
-    facts.codeOnAir = 301;
+    facts.psc = 301;
+    facts.physicalCellId = 301;
     return facts;
 }
 
@@ -73,16 +74,16 @@ TEST(ModemCells, LTECellHasTrackingAreaAndBand)
         "\"kRKCellMonitorUARFCN\": int 1300}");
 }
 
-TEST(ModemCells, ReceptionLevelIsToldInStepsOfTwoDecibels)
+TEST(ModemCells, ReceptionLevelIsReportedInStepsOfTwoDecibels)
 {
     CellFacts facts = cell(CellKind::GSM, false);
-    const auto told = [&facts](std::uint32_t level) {
+    const auto shownLevel = [&facts](std::uint32_t level) {
         facts.rxLevel = level;
         return (*cellOf(facts))[kRKCellMonitorRSSI];
     };
-    EXPECT_EQ(told(21), Value::integer(-45)) << "-90 dBm";
-    EXPECT_EQ(told(63), Value::integer(-24)) << "-48 dBm";
-    EXPECT_EQ(told(64), Value::integer(32767)) << "no level";
+    EXPECT_EQ(shownLevel(21), Value::integer(-45)) << "-90 dBm";
+    EXPECT_EQ(shownLevel(63), Value::integer(-24)) << "-48 dBm";
+    EXPECT_EQ(shownLevel(64), Value::integer(32767)) << "no level";
 }
 
 TEST(ModemCells, MeasurementsBelongToTheServingCellAndWinOverTheList)
@@ -121,12 +122,12 @@ TEST(ModemCells, WhatIsNotKnownHasNoKey)
     EXPECT_EQ(cellOf(facts)->count(), 2u) << displayText(cellOf(facts));
 }
 
-TEST(ModemCells, LargestListFitsIntoARecord)
+TEST(ModemCells, ListOfMaxLengthFitsIntoARecord)
 {
     const std::vector<CellFacts> many(1000, cell(CellKind::LTE));
     const SignalFacts signal {-60, -85, -7, -91, -10, 14};
     const Value cells = payload(modemCellsRecord(many, signal, Now), 0xFF0001);
-    EXPECT_EQ(cells.list()->count(), MostModemElements);
+    EXPECT_EQ(cells.list()->count(), MaxModemElements);
 }
 
 TEST(ModemSim, FilesAreNamedAsTheyAreShown)
@@ -148,7 +149,7 @@ TEST(ModemContexts, AreShownAsTheyAre)
         "\"Bytes Sent\": \"0\"}, {}]");
 }
 
-TEST(ModemContexts, LongestTextsFitIntoARecord)
+TEST(ModemContexts, TextsOfMaxLengthFitIntoARecord)
 {
     const std::string longest(256, '&'); // five bytes each as XML
     const BearerFacts bearer {longest, longest, longest, longest, longest, longest, longest, longest, {longest}, 1, 1};

@@ -1,7 +1,7 @@
 #include "Telephony/Modem/ModemSource.h"
 
 #include "Records/TelephonyConstants.h"
-#include "Telephony/Encoders/RecordWriter.h"
+#include "Telephony/RoutedCode.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Telephony/Modem/FakeModemService.h"
@@ -84,7 +84,7 @@ protected:
         facts.kind = CellKind::LTE;
         facts.isServing = isServing;
         facts.operatorId = "00101";
-        facts.codeOnAir = physicalCellId;
+        facts.physicalCellId = physicalCellId;
         facts.power = -100;
         return facts;
     }
@@ -117,8 +117,8 @@ protected:
         ledger.modems = {modem};
         open();
     }
-    /// What has been told on standard error since the test began.
-    std::string told()
+    /// What has been printed on standard error since the test began.
+    std::string printed()
     {
         _isStderrTaken = true;
         return testing::internal::GetCapturedStderr();
@@ -240,7 +240,7 @@ TEST_F(ModemSourceTest, RateThatAnotherClientHasSetSinceStays)
     EXPECT_EQ(ledger.rates.size(), 1u);
 }
 
-TEST_F(ModemSourceTest, ModemThatMeasuresNothingIsNotToldARate)
+TEST_F(ModemSourceTest, ModemThatMeasuresNothingIsNotSetARate)
 {
     modem.signalRate.reset();
     openWithModem();
@@ -248,17 +248,17 @@ TEST_F(ModemSourceTest, ModemThatMeasuresNothingIsNotToldARate)
     EXPECT_TRUE(ledger.rates.empty());
 }
 
-TEST_F(ModemSourceTest, DeniedSignalRateIsToldOnceAndNotPutBack)
+TEST_F(ModemSourceTest, DeniedSignalRateIsPrintedOnceAndNotPutBack)
 {
     ledger.rateOutcome = ModemOutcome::Denied;
     openWithModem();
     source->start(listener).reset();
     source->start(listener).reset();
     EXPECT_EQ(ledger.rates.size(), 2u) << "one attempt each";
-    EXPECT_EQ(occurrences(told(), "Signal.Setup"), 1u);
+    EXPECT_EQ(occurrences(printed(), "Signal.Setup"), 1u);
 }
 
-TEST_F(ModemSourceTest, NewMeasurementIsToldInTheServingCell)
+TEST_F(ModemSourceTest, NewMeasurementIsReportedInTheServingCell)
 {
     openWithModem();
     const auto stream = source->start(listener);
@@ -284,7 +284,7 @@ TEST_F(ModemSourceTest, OtherKindOfCellIsAskedForAtOnce)
     EXPECT_EQ(listener.cell(0, kRKCellMonitorRSCP), Value::integer(-85));
 }
 
-TEST_F(ModemSourceTest, ChangeOfNothingTellsNothing)
+TEST_F(ModemSourceTest, ChangeOfNothingSendsNothing)
 {
     openWithModem();
     const auto stream = source->start(listener);
@@ -293,7 +293,7 @@ TEST_F(ModemSourceTest, ChangeOfNothingTellsNothing)
     EXPECT_TRUE(listener.received.empty());
 }
 
-TEST_F(ModemSourceTest, TrafficIsTold)
+TEST_F(ModemSourceTest, TrafficIsReported)
 {
     openWithModem();
     const auto stream = source->start(listener);
@@ -312,10 +312,10 @@ TEST_F(ModemSourceTest, SimThatIsTakenOutLeavesDashes)
     plug();
     EXPECT_EQ(displayText(listener.last(0xFF0000)),
         R"({"kSimFile_ICCID": "-", "kSimFile_MSISDN": "-", "kSimFile_AHPLMN": "-", "kSimFile_PNN": "-"})");
-    EXPECT_NE(told().find("modem 0 (EM7455), without a SIM"), std::string::npos);
+    EXPECT_NE(printed().find("modem 0 (EM7455), without a SIM"), std::string::npos);
 }
 
-TEST_F(ModemSourceTest, DeniedCellListIsToldOnceAndTheServingCellComesFromLocation)
+TEST_F(ModemSourceTest, DeniedCellListIsPrintedOnceAndTheServingCellComesFromLocation)
 {
     ledger.cellsOutcome = ModemOutcome::Denied;
     modem.signal.rsrp = -91;
@@ -330,7 +330,7 @@ TEST_F(ModemSourceTest, DeniedCellListIsToldOnceAndTheServingCellComesFromLocati
         "\"kRKCellMonitorCellType\": \"kRKCellMonitorCellTypeServing\", \"kRKCellMonitorMCC\": int 1, "
         "\"kRKCellMonitorMNC\": int 1, \"kRKCellMonitorPLMN\": \"001-01\", \"kRKCellMonitorCellId\": int 30322048, "
         "\"kRKCellMonitorTAC\": int 28670, \"kRKCellMonitorRSRP\": int -91}]");
-    const std::string lines = told();
+    const std::string lines = printed();
     EXPECT_EQ(occurrences(lines, "GetCellInfo"), 1u);
     EXPECT_NE(lines.find("have spectrel-modem.conf and spectrel-modem.rules in place"), std::string::npos) << lines;
 }
@@ -345,14 +345,14 @@ TEST_F(ModemSourceTest, PermissionGivenSinceIsUsedByTheNextChannel)
     EXPECT_EQ(listener.cell(0, kRKCellMonitorPID), Value::integer(416));
 }
 
-TEST_F(ModemSourceTest, ModemWithoutCellListIsToldOnce)
+TEST_F(ModemSourceTest, ModemWithoutCellListIsPrintedOnce)
 {
     ledger.cellsOutcome = ModemOutcome::Unsupported;
     openWithModem();
     const auto stream = source->start(listener);
     loop.advance(20s);
     EXPECT_EQ(ledger.cellsAsked, 1);
-    EXPECT_EQ(occurrences(told(), "cannot list its cells"), 1u);
+    EXPECT_EQ(occurrences(printed(), "cannot list its cells"), 1u);
 }
 
 TEST_F(ModemSourceTest, ModemThatIsEnabledLaterIsAskedForEverythingAnew)
@@ -404,7 +404,7 @@ TEST_F(ModemSourceTest, DeniedLocationLeavesTheNetworkAlone)
     EXPECT_EQ(ledger.locationsAsked, 1);
     EXPECT_EQ(listener.cell(0, kRKCellMonitorPLMN), Value("001-01"));
     EXPECT_TRUE(listener.cell(0, kRKCellMonitorTAC).isAbsent());
-    EXPECT_EQ(occurrences(told(), "GetLocation"), 1u);
+    EXPECT_EQ(occurrences(printed(), "GetLocation"), 1u);
 }
 
 TEST_F(ModemSourceTest, ModemThatKnowsNothingHasNoCells)
@@ -429,7 +429,7 @@ TEST_F(ModemSourceTest, WithoutModemAChannelIsSilentUntilOneComes)
     EXPECT_EQ(listener.count(0xFF0000), 1u);
     EXPECT_EQ(listener.count(0xFF0001), 1u);
     EXPECT_EQ(listener.count(0xFF0002), 1u);
-    EXPECT_EQ(told(),
+    EXPECT_EQ(printed(),
         "spectrel-telephonyd: no modem; waiting for one\n"
         "spectrel-telephonyd: using modem 0 (EM7455)\n");
 }
@@ -443,11 +443,11 @@ TEST_F(ModemSourceTest, UnpluggedModemEndsTheChannels)
     unplug();
     EXPECT_TRUE(stream) << "never in the middle of a delivery";
     loop.runQueued();
-    EXPECT_FALSE(stream) << "the programs are to tell that nothing is heard any more";
+    EXPECT_FALSE(stream) << "the programs are to show that nothing is heard any more";
     loop.advance(60s);
     EXPECT_TRUE(listener.received.empty());
     EXPECT_EQ(ledger.cellsAsked, 1);
-    const std::string lines = told();
+    const std::string lines = printed();
     EXPECT_NE(lines.find("modem 0 (EM7455) is no longer used"), std::string::npos) << lines;
     EXPECT_NE(lines.find("no modem; waiting for one"), std::string::npos) << lines;
 }
@@ -489,7 +489,7 @@ TEST_F(ModemSourceTest, ServiceThatIsNotThereIsNamed)
     open();
     ledger.isRunning = true;
     plug();
-    EXPECT_EQ(told(),
+    EXPECT_EQ(printed(),
         "spectrel-telephonyd: no ModemManager on the system bus; waiting for it\n"
         "spectrel-telephonyd: the technology is now lte\n"
         "spectrel-telephonyd: using modem 0 (EM7455)\n");
@@ -508,7 +508,7 @@ TEST_F(ModemSourceTest, TechnologyIsGSMUntilOneIsKnownAndThenTheLastKnown)
     EXPECT_EQ(source->technology(), Technology::LTE);
 }
 
-TEST_F(ModemSourceTest, ChangeOfTechnologyIsToldFromTheQueue)
+TEST_F(ModemSourceTest, ChangeOfTechnologyIsReportedFromTheQueue)
 {
     openWithModem();
     int changes = 0;
@@ -545,18 +545,18 @@ TEST_F(ModemSourceTest, WishedModemIsWaitedFor)
 {
     ledger.modems = {modem};
     open("EM7565");
-    EXPECT_NE(told().find("no modem 'EM7565'; waiting for it"), std::string::npos);
+    EXPECT_NE(printed().find("no modem 'EM7565'; waiting for it"), std::string::npos);
     EXPECT_EQ(source->technology(), Technology::GSM);
 }
 
-TEST_F(ModemSourceTest, SubscriberIdentitiesAreNotTold)
+TEST_F(ModemSourceTest, SubscriberIdentitiesAreNotPrinted)
 {
     openWithModem();
     const auto stream = source->start(listener);
     modem.sim->iccid = "8900101000000000018";
     plug();
     unplug();
-    const std::string lines = told();
+    const std::string lines = printed();
     EXPECT_EQ(lines.find("89001"), std::string::npos) << lines;
     EXPECT_EQ(lines.find("5550100"), std::string::npos) << lines;
 }

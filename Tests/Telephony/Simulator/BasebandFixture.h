@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Telephony/Encoders/RecordWriter.h"
+#include "Telephony/RoutedCode.h"
 #include "Telephony/Simulator/Baseband.h"
 #include "Tests/Telephony/RecordBytes.h"
 #include "Values/PropertyList/PropertyList.h"

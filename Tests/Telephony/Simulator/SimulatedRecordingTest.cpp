@@ -65,7 +65,7 @@ TEST_F(SimulatedRecordingTest, StressSendsEveryRecordAtEveryStep)
         write(Technology::LTE, Scene::Stress, 1, 10s).size(), 5 * write(Technology::LTE, Scene::Drive, 1, 10s).size());
 }
 
-TEST_F(SimulatedRecordingTest, FileThatCannotBeMadeIsTold)
+TEST_F(SimulatedRecordingTest, FileThatCannotBeMadeIsReported)
 {
     const auto baseband = makeBaseband(Technology::LTE, Scene::Drive, 1);
     std::string reason;

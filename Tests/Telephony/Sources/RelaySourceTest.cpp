@@ -76,7 +76,7 @@ TEST_F(RelaySourceTest, EveryChannelHearsWhatComesFromItsStartOn)
     EXPECT_THAT(numbers(late), ElementsAre(3));
 }
 
-TEST_F(RelaySourceTest, TechnologyIsKnownOnceTheStreamHasTold)
+TEST_F(RelaySourceTest, TechnologyIsKnownOnceTheStreamHasNamedIt)
 {
     open();
     EXPECT_FALSE(source->isReady());
@@ -121,11 +121,11 @@ TEST_F(RelaySourceTest, ClientThatTakesNothingHarmsNoOther)
         input->write(capture(round, 100));
     EXPECT_FALSE(input->isPaused);
     EXPECT_EQ(collector.messages.size(), 6000u);
-    EXPECT_EQ(second->waiting(), ChannelQueue::MostMessages);
-    EXPECT_EQ(second->lost(), 6000 - ChannelQueue::MostMessages);
+    EXPECT_EQ(second->waiting(), ChannelQueue::MaxMessages);
+    EXPECT_EQ(second->lost(), 6000 - ChannelQueue::MaxMessages);
     stuck.isFull = false;
     second->resume();
-    EXPECT_EQ(stuck.messages.size(), ChannelQueue::MostMessages);
+    EXPECT_EQ(stuck.messages.size(), ChannelQueue::MaxMessages);
     EXPECT_EQ(stuck.messages.back(), collector.messages.back()) << "the oldest are lost, the latest come";
 }
 
@@ -222,7 +222,7 @@ TEST_F(RelaySourceTest, OnlyStreamThatCannotBeUsedIsAFailure)
     EXPECT_EQ(failures, 1);
 }
 
-TEST_F(RelaySourceTest, OnlyStreamThatEndsWithoutTellingItsTechnologyIsAFailure)
+TEST_F(RelaySourceTest, OnlyStreamThatEndsWithoutNamingItsTechnologyIsAFailure)
 {
     open();
     input->furtherWriters = false;
@@ -248,7 +248,7 @@ TEST_F(RelaySourceTest, EndOfAClientInTheMiddleOfTheStreamIsNoHarm)
     EXPECT_THAT(numbers(other), ElementsAre(1, 2, 3, 4));
 }
 
-TEST_F(RelaySourceTest, StatusTellsWhatWasRelayedAndSkipped)
+TEST_F(RelaySourceTest, StatusShowsWhatWasRelayedAndSkipped)
 {
     open();
     const auto stream = start(collector);

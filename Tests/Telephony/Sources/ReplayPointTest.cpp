@@ -24,7 +24,7 @@ TEST_F(ReplayPointTest, OffsetCountsFromTheFirstMessage)
     EXPECT_EQ(defaultDateForm(point.in(FakeRunLoop::Start, clock)), "2024-03-05 14:09:01 +0000");
 }
 
-TEST_F(ReplayPointTest, DateAndTimeAreLocalUnlessAZoneIsTold)
+TEST_F(ReplayPointTest, DateAndTimeAreLocalUnlessAZoneIsGiven)
 {
     clock.setZone({7200, false});
     EXPECT_EQ(place("2024-03-06 01:30:05"), "2024-03-05 23:30:05 +0000");

@@ -65,7 +65,7 @@ TEST_F(UTRANBasebandTest, TransportChannelsGoWithTheDedicatedChannel)
     EXPECT_GT(dedicated, 20);
 }
 
-TEST_F(UTRANBasebandTest, SIMTellsTheLocationAreaOfTheServingCell)
+TEST_F(UTRANBasebandTest, SIMHoldsTheLocationAreaOfTheServingCell)
 {
     std::set<std::int32_t> areas;
     for (int look = 0; look < 40; ++look) {

@@ -66,7 +66,7 @@ TEST(ModemManagerFacts, SignalIsOfTheTechnologyInUse)
     EXPECT_EQ(factsOf(0).signalRate, 10u);
 }
 
-TEST(ModemManagerFacts, StateTellsEnabledAndRegistered)
+TEST(ModemManagerFacts, StateShowsEnabledAndRegistered)
 {
     EXPECT_FALSE(factsOf(0, -1).isEnabled);
     EXPECT_FALSE(factsOf(0, 5).isEnabled);
@@ -88,31 +88,31 @@ TEST(ModemManagerFacts, NothingIsKnownOfAModemWithoutProperties)
 
 TEST(ModemManagerFacts, HexadecimalTextsOfACellAreRead)
 {
-    const QList<QVariantMap> told {
+    const QList<QVariantMap> reported {
         {{"cell-type", u(5)}, {"serving", true}, {"operator-id", "001001"}, {"tac", "6FFE"}, {"ci", "1CEAD80"},
             {"physical-ci", "1A0"}, {"earfcn", u(1300)}, {"rsrp", -93.0}},
     };
-    const auto cells = cellFacts(told);
+    const auto cells = cellFacts(reported);
     ASSERT_EQ(cells.size(), 1u);
     EXPECT_EQ(cells[0].kind, CellKind::LTE);
     EXPECT_TRUE(cells[0].isServing);
     EXPECT_EQ(cells[0].operatorId, "001001");
     EXPECT_EQ(cells[0].areaCode, 0x6FFEu);
     EXPECT_EQ(cells[0].cellId, 0x1CEAD80u);
-    EXPECT_EQ(cells[0].codeOnAir, 0x1A0u);
+    EXPECT_EQ(cells[0].physicalCellId, 0x1A0u);
     EXPECT_EQ(cells[0].channel, 1300u);
     EXPECT_EQ(cells[0].power, -93.0);
 }
 
 TEST(ModemManagerFacts, CellsOfOtherKindsAreLeftOut)
 {
-    const QList<QVariantMap> told {{{"cell-type", u(0)}}, {{"cell-type", u(1)}}, {{"cell-type", u(4)}},
+    const QList<QVariantMap> reported {{{"cell-type", u(0)}}, {{"cell-type", u(1)}}, {{"cell-type", u(4)}},
         {{"cell-type", u(6)}}, {{"cell-type", "5"}}, {}, {{"cell-type", u(2)}, {"rx-level", u(21)}},
         {{"cell-type", u(3)}, {"psc", u(302)}}};
-    const auto cells = cellFacts(told);
+    const auto cells = cellFacts(reported);
     ASSERT_EQ(cells.size(), 2u);
     EXPECT_EQ(cells[0].rxLevel, 21u);
-    EXPECT_EQ(cells[1].codeOnAir, 302u);
+    EXPECT_EQ(cells[1].psc, 302u);
     EXPECT_EQ(cells[1].power, std::nullopt);
 }
 

@@ -98,7 +98,7 @@ TEST_F(GSMUMTSBasebandTest, LeavingUMTSEmptiesItsCellSets)
     EXPECT_GT(emptied, 0u);
 }
 
-TEST_F(GSMUMTSBasebandTest, CellInformationTellsTheServingCellFirstAndItsSystem)
+TEST_F(GSMUMTSBasebandTest, CellInformationNamesTheServingCellFirstAndItsSystem)
 {
     drive(20min);
     std::set<std::string> technologies;

@@ -118,7 +118,7 @@ TEST(GSMUMTSWorldTest, StrongestCellOfTheActiveSetServes)
     EXPECT_EQ(sizes, (std::set<std::size_t> {0, 1, 2, 3}));
 }
 
-TEST(GSMUMTSWorldTest, CellSetsTellTheActiveCellsFirstAndEachCellOnce)
+TEST(GSMUMTSWorldTest, CellSetsNameTheActiveCellsFirstAndEachCellOnce)
 {
     GSMUMTSWorld world(Scene::Drive, 3);
     drive(world, FiveMinutes, [&] {

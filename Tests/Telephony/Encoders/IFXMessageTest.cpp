@@ -1,4 +1,4 @@
-#include "Telephony/Encoders/IFXReport.h"
+#include "Telephony/Encoders/IFXMessage.h"
 
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 #include "Telephony/Simulator/Baseband.h"
@@ -11,7 +11,6 @@
 #include "Values/PropertyList/PropertyList.h"
 
 #include <gtest/gtest.h>
-#include <set>
 
 namespace spectrel {
 namespace {
@@ -20,45 +19,7 @@ using namespace std::chrono_literals;
 
 constexpr int FiveMinutes = 3000; // steps
 
-std::string diary(std::uint32_t seed)
-{
-    IFXWorld world(Scene::Drive, seed);
-    std::string text;
-    for (int step = 0; step < 300; ++step) {
-        world.advance(100ms);
-        text += displayText(ifxState(world)) + "\n";
-    }
-    return text;
-}
-
-TEST(IFXWorldTest, SameSeedGivesTheSameDrive)
-{
-    EXPECT_EQ(diary(7), diary(7));
-    EXPECT_NE(diary(7), diary(8));
-}
-
-TEST(IFXWorldTest, DriveChangesCellsAndMakesCalls)
-{
-    IFXWorld world(Scene::Drive, 1);
-    std::set<std::uint16_t> cells;
-    int talking = 0;
-    for (int step = 0; step < FiveMinutes; ++step) {
-        world.advance(100ms);
-        cells.insert(world.serving().identity);
-        talking += world.isTalking();
-        EXPECT_LE(world.quality(), 7u);
-        EXPECT_LE(world.timingAdvance(), 63u);
-        const auto neighbours = world.neighbours(6);
-        for (std::size_t index = 1; index < neighbours.size(); ++index)
-            EXPECT_GE(neighbours[index - 1]->level, neighbours[index]->level);
-    }
-    EXPECT_GE(cells.size(), 4u);
-    EXPECT_GE(world.cellsVisited(), cells.size());
-    EXPECT_GT(talking, 1000);
-    EXPECT_GT(world.bytesReceived(), 1'000'000u);
-}
-
-class IFXReportTest : public testing::Test {
+class IFXMessageTest : public testing::Test {
 protected:
     const Value& shown(std::initializer_list<std::string_view> path)
     {
@@ -74,30 +35,30 @@ protected:
     IFXWorld world {Scene::Drive, 5};
 };
 
-TEST_F(IFXReportTest, MessageIsTheStateAsAPropertyList)
+TEST_F(IFXMessageTest, MessageIsTheStateAsAPropertyList)
 {
-    const auto parsed = parsePropertyList(ifxReport(world, SimulatedRecordingStart));
+    const auto parsed = parsePropertyList(ifxMessage(world.report(), SimulatedRecordingStart));
     ASSERT_TRUE(parsed);
-    EXPECT_EQ(displayText(*parsed), displayText(ifxState(world)));
+    EXPECT_EQ(displayText(*parsed), displayText(ifxState(world.report())));
 }
 
-TEST_F(IFXReportTest, StateIsShownAsItIs)
+TEST_F(IFXMessageTest, StateIsShownAsItIs)
 {
     log.takeLog();
     for (int step = 1; step <= FiveMinutes; ++step) {
         world.advance(100ms);
         if (step % 20 != 0)
             continue;
-        generator.updateState(state, ifxReport(world, SimulatedRecordingStart));
+        generator.updateState(state, ifxMessage(world.report(), SimulatedRecordingStart));
         EXPECT_EQ(shown({"Serving Cell", "Cell Identity"}), Value(std::to_string(world.serving().identity)));
         EXPECT_EQ(shown({"Serving Cell", "Timing Advance"}), Value(std::to_string(world.timingAdvance())));
         EXPECT_EQ(shown({"SIM"}), Value("Ready")) << "a chain of single entries";
-        const auto neighbours = world.neighbours(6);
+        const auto neighbours = world.neighbours();
         const auto& list = shown({"Neighbour Cells"}).list();
         ASSERT_TRUE(list);
         ASSERT_EQ(list->count(), neighbours.size()) << "without the heading";
         for (std::size_t index = 0; index < neighbours.size(); ++index)
-            EXPECT_EQ((*(*list)[index].dictionary())["ARFCN"], Value(std::to_string(neighbours[index]->channel)));
+            EXPECT_EQ((*(*list)[index].dictionary())["ARFCN"], Value(std::to_string(neighbours[index].channel)));
         EXPECT_EQ(displayText(shown({"Call"})),
             world.isTalking()
                 ? "{\"State\": \"Active\", \"Duration\": \"" + std::to_string(world.talkingFor().count())
@@ -112,7 +73,7 @@ TEST_F(IFXReportTest, StateIsShownAsItIs)
     EXPECT_EQ(log.takeLog(), "") << "nothing but texts, dictionaries and lists";
 }
 
-TEST_F(IFXReportTest, BasebandReportsAtOnceAndThenSteadily)
+TEST_F(IFXMessageTest, BasebandReportsAtOnceAndThenSteadily)
 {
     for (const auto& [scene, expected] :
         {std::pair(Scene::Still, 30), {Scene::Walk, 30}, {Scene::Drive, 30}, {Scene::Stress, 600}}) {

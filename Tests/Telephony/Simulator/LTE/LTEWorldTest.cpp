@@ -1,9 +1,12 @@
 #include "Telephony/Simulator/LTE/LTEWorld.h"
 
+#include <algorithm>
 #include <cmath>
+#include <functional>
 #include <gtest/gtest.h>
 #include <set>
 #include <string>
+#include <vector>
 
 namespace spectrel {
 namespace {
@@ -38,17 +41,38 @@ TEST(LTEWorldTest, DrivePassesSeveralCells)
     EXPECT_GE(cells.size(), 5u) << "in five minutes";
 }
 
-TEST(LTEWorldTest, ValuesBelongTogether)
+TEST(LTEWorldTest, CellsAgreeWithTheirCarriers)
+{
+    const LTEWorld world(Scene::Drive, 3);
+    std::set<std::uint32_t> identities;
+    for (const LTECell& cell : world.road().cells()) {
+        EXPECT_LT(cell.physicalCellId, 504);
+        ASSERT_TRUE(cell.layer);
+        EXPECT_EQ(cell.band, cell.layer->band);
+        EXPECT_EQ(cell.downlinkChannel, cell.layer->downlinkChannel);
+        EXPECT_EQ(cell.uplinkChannel, cell.downlinkChannel + 18000);
+        EXPECT_EQ(cell.resourceBlocks, cell.layer->resourceBlocks);
+        EXPECT_TRUE(identities.insert(cell.identity).second) << "an identity of its own";
+    }
+}
+
+TEST(LTEWorldTest, NeighboursAreTheStrongestOtherCells)
 {
     LTEWorld world(Scene::Drive, 3);
     for (int step = 0; step < 3000; ++step) {
         world.advance(100ms);
-        const LTECell& cell = world.servingCell();
-        EXPECT_LT(cell.physicalCellId, 504);
-        EXPECT_EQ(cell.uplinkChannel, cell.downlinkChannel + 18000);
+        std::vector<double> levels; // of the other cells
+        for (const LTECell& cell : world.road().cells()) {
+            if (&cell != &world.servingCell())
+                levels.push_back(cell.average.rsrp);
+        }
+        std::ranges::sort(levels, std::ranges::greater());
         const auto neighbours = world.neighbours(3);
         ASSERT_EQ(neighbours.size(), 3u);
-        EXPECT_GE(neighbours[0]->average.rsrp, neighbours[1]->average.rsrp);
+        for (std::size_t index = 0; index < neighbours.size(); ++index) {
+            EXPECT_NE(neighbours[index], &world.servingCell());
+            EXPECT_EQ(neighbours[index]->average.rsrp, levels[index]);
+        }
     }
 }
 
@@ -101,16 +125,16 @@ TEST(LTEWorldTest, NextCellRisesAsTheServingCellFalls)
         now.advance(100ms);
     int changes = 0;
     for (int step = 0; step < 6000; ++step) {
-        const std::size_t last = servingIndex(now);
+        const std::size_t previous = servingIndex(now);
         now.advance(100ms);
         before.advance(100ms);
         const std::size_t next = servingIndex(now);
         const auto& cells = now.road().cells();
-        if (next == last || cells[next].layer != cells[last].layer)
+        if (next == previous || cells[next].layer != cells[previous].layer)
             continue;
         ++changes;
-        EXPECT_GE(ahead(now, next, last), 0);
-        EXPECT_LT(ahead(before, next, last), ahead(now, next, last));
+        EXPECT_GE(ahead(now, next, previous), 0);
+        EXPECT_LT(ahead(before, next, previous), ahead(now, next, previous));
     }
     EXPECT_GE(changes, 5);
 }
@@ -118,12 +142,12 @@ TEST(LTEWorldTest, NextCellRisesAsTheServingCellFalls)
 /// Whether idle mode may have moved from one cell to the other now (3GPP TS 36.304, 5.2.4.5 and 5.2.4.6).
 bool mayMove(const LTECell& from, const LTECell& to)
 {
-    const auto level = [](const LTECell& cell) { return std::floor(cell.average.rsrp) - cell.layer->leastLevel; };
+    const auto level = [](const LTECell& cell) { return std::floor(cell.average.rsrp) - cell.layer->qRxLevMin; };
     if (to.layer->priority > from.layer->priority)
-        return level(to) > to.layer->highThreshold;
+        return level(to) > to.layer->threshHigh;
     if (to.layer == from.layer)
         return level(to) > 0 && to.average.rsrp > from.average.rsrp + 4;
-    return level(from) < from.layer->servingLowThreshold && level(to) > to.layer->lowThreshold;
+    return level(from) < from.layer->threshServingLow && level(to) > to.layer->threshLow;
 }
 
 TEST(LTEWorldTest, IdlePhoneMovesByTheCriteriaOnly)
@@ -132,16 +156,15 @@ TEST(LTEWorldTest, IdlePhoneMovesByTheCriteriaOnly)
     for (std::uint32_t seed = 1; seed <= 4; ++seed) {
         LTEWorld world(Scene::Drive, seed);
         for (int step = 0; step < 6000; ++step) {
-            const LTECell& last = world.servingCell();
+            const LTECell& previous = world.servingCell();
             const bool wasIdle = !world.isConnected();
             const unsigned cyclesBelowZero = world.idleMode().serving().cyclesBelowZero;
             world.advance(100ms);
-            if (&world.servingCell() == &last || !wasIdle || world.isConnected())
+            if (&world.servingCell() == &previous || !wasIdle || world.isConnected())
                 continue;
             ++moves;
-            const bool isLost =
-                cyclesBelowZero + 1 >= LTEIdleMode::CyclesUntilLost && world.servingCell().receiveLevel() > 0;
-            EXPECT_TRUE(isLost || mayMove(last, world.servingCell())) << seed << " " << step;
+            const bool isLost = cyclesBelowZero + 1 >= LTEIdleMode::CyclesUntilLost && world.servingCell().srxlev() > 0;
+            EXPECT_TRUE(isLost || mayMove(previous, world.servingCell())) << seed << " " << step;
         }
     }
     EXPECT_GE(moves, 20);
@@ -154,12 +177,12 @@ TEST(LTEWorldTest, RulesFollowTheThresholds)
     for (int step = 0; step < 6000; ++step) {
         world.advance(100ms);
         const LTEServingReport& report = world.idleMode().serving();
-        const bool intra = !report.intraSearch || report.receiveLevel <= *report.intraSearch;
-        const bool lower = !report.nonIntraSearch || report.receiveLevel <= *report.nonIntraSearch;
+        const bool intra = !report.sIntraSearch || report.srxlev <= *report.sIntraSearch;
+        const bool lower = !report.sNonIntraSearch || report.srxlev <= *report.sNonIntraSearch;
         EXPECT_EQ(report.rules & 3, (intra ? 1 : 0) | (lower ? 2 : 0));
         EXPECT_EQ(report.rules & 4, report.priority < 6 ? 4 : 0);
-        EXPECT_EQ(report.receiveLevel, std::floor(report.average.rsrp) - report.leastLevel);
-        EXPECT_EQ(report.cyclesBelowZero > 0, report.receiveLevel < 0);
+        EXPECT_EQ(report.srxlev, std::floor(report.average.rsrp) - report.qRxLevMin);
+        EXPECT_EQ(report.cyclesBelowZero > 0, report.srxlev < 0);
         rules.insert(report.rules);
     }
     EXPECT_GE(rules.size(), 4u);

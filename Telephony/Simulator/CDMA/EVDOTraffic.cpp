@@ -1,4 +1,4 @@
-#include "Telephony/Simulator/CDMA/EVDOCounters.h"
+#include "Telephony/Simulator/CDMA/EVDOTraffic.h"
 
 #include <algorithm>
 
@@ -37,44 +37,44 @@ std::size_t formatToFill(std::size_t format, Dice& dice)
 
 } // namespace
 
-void EVDOCounters::advance(std::chrono::milliseconds step, double signal, double power, Dice& dice)
+void EVDOTraffic::advance(std::chrono::milliseconds step, double signal, double power, Dice& dice)
 {
     const double seconds = std::chrono::duration<double>(step).count();
     advanceForward(SlotsASecond * seconds * dice.between(0.3, 0.9), signal, dice);
     advanceReverse(SubframesASecond * seconds, power, dice);
 }
 
-void EVDOCounters::advanceForward(double slots, double signal, Dice& dice)
+void EVDOTraffic::advanceForward(double slots, double signal, Dice& dice)
 {
     const std::size_t best = bestFormat(signal);
     for (_slots += slots; _slots >= ForwardFormats[best].slots; _slots -= ForwardFormats[best].slots) {
         const std::size_t format = formatToFill(best, dice);
         if (dice.between(0, 1) < LossRate) {
-            ++_forwardLost[ForwardFormats[format].drc];
+            ++_counts.forwardLost[ForwardFormats[format].drc];
         } else {
-            ++_forward[format];
-            _forwardBits += ForwardFormats[format].bits;
+            ++_counts.forward[format];
+            _counts.forwardBits += ForwardFormats[format].bits;
         }
     }
 }
 
 /// The louder the phone has to speak already, the smaller the packets that it has power for.
-void EVDOCounters::advanceReverse(double subframes, double power, Dice& dice)
+void EVDOTraffic::advanceReverse(double subframes, double power, Dice& dice)
 {
     constexpr std::size_t Subpackets = 4;
     constexpr double DecibelsAPayload = 3;
     const auto payload = static_cast<std::size_t>(std::clamp((23 - power) / DecibelsAPayload, 0.0, 11.0));
-    for (std::size_t interlace = 0; interlace < Interlaces; ++interlace) {
+    for (std::size_t interlace = 0; interlace < EVDOCounts::Interlaces; ++interlace) {
         double& left = _subframes[interlace];
         for (left += subframes; left >= Subpackets;) {
             const std::uint32_t needed = dice.below(Subpackets);
-            ReversePackets& packets = _reverse[interlace][dice.below(Modes)][payload];
+            ReversePackets& packets = _counts.reverse[interlace][dice.below(EVDOCounts::Modes)][payload];
             left -= needed + 1;
             if (dice.between(0, 1) < LossRate) {
                 ++packets.lost;
             } else {
                 ++packets.arrived[needed];
-                _reverseBits += ReversePayloads[payload];
+                _counts.reverseBits += ReversePayloads[payload];
             }
         }
     }

@@ -1,9 +1,6 @@
 #pragma once
 
-#include "Telephony/Simulator/Radio.h"
-
 #include <array>
-#include <chrono>
 #include <cstddef>
 #include <cstdint>
 
@@ -75,47 +72,16 @@ struct ReversePackets {
 };
 
 /// What an EV-DO session has carried since it began, packet by packet.
-class EVDOCounters {
-public:
+struct EVDOCounts {
     static constexpr std::size_t Interlaces = 3;
     static constexpr std::size_t Modes = 2; // high capacity, low latency
+    using ReverseInterlace = std::array<std::array<ReversePackets, ReversePayloads.size()>, Modes>;
 
-    /// The data of one step at a SINR in dB on the forward link and a transmitter power in dBm on the reverse.
-    void advance(std::chrono::milliseconds step, double signal, double power, Dice& dice);
-
-    const std::array<std::uint32_t, ForwardFormats.size()>& forward() const
-    {
-        return _forward;
-    }
-    /// Packets that did not arrive whole, by data rate.
-    const std::array<std::uint32_t, ForwardRates>& forwardLost() const
-    {
-        return _forwardLost;
-    }
-    const ReversePackets& reverse(std::size_t interlace, std::size_t mode, std::size_t payload) const
-    {
-        return _reverse[interlace][mode][payload];
-    }
-    std::uint64_t forwardBits() const
-    {
-        return _forwardBits;
-    }
-    std::uint64_t reverseBits() const
-    {
-        return _reverseBits;
-    }
-
-private:
-    void advanceForward(double slots, double signal, Dice& dice);
-    void advanceReverse(double subframes, double power, Dice& dice);
-
-    std::array<std::uint32_t, ForwardFormats.size()> _forward {};
-    std::array<std::uint32_t, ForwardRates> _forwardLost {};
-    std::array<std::array<std::array<ReversePackets, ReversePayloads.size()>, Modes>, Interlaces> _reverse {};
-    std::uint64_t _forwardBits = 0;
-    std::uint64_t _reverseBits = 0;
-    double _slots = 0; // allotted and not filled yet
-    std::array<double, Interlaces> _subframes {}; // likewise
+    std::array<std::uint32_t, ForwardFormats.size()> forward {};
+    std::array<std::uint32_t, ForwardRates> forwardLost {}; // packets that did not arrive whole, by data rate
+    std::array<ReverseInterlace, Interlaces> reverse {}; // by interlace, mode and payload
+    std::uint64_t forwardBits = 0;
+    std::uint64_t reverseBits = 0;
 };
 
 } // namespace spectrel

@@ -1,9 +1,8 @@
-#include "Telephony/Simulator/Radio.h"
+#include "Telephony/Simulator/Journey.h"
 
 #include <algorithm>
 #include <array>
 #include <cmath>
-#include <numbers>
 
 namespace spectrel {
 
@@ -12,8 +11,8 @@ namespace {
 struct Pace {
     std::string_view name;
     Scene scene;
-    double slowest; // metres a second
-    double fastest;
+    double minSpeed; // metres a second
+    double maxSpeed;
 };
 
 constexpr std::array<Pace, 4> Paces {{
@@ -39,24 +38,19 @@ bool sceneNamed(std::string_view name, Scene& scene)
     return true;
 }
 
-double Dice::between(double from, double to)
-{
-    return from + (to - from) * static_cast<double>(number()) / static_cast<double>(std::mt19937::max());
-}
-
 Journey::Journey(Scene scene, double length, Dice& dice)
     : _length(length)
-    , _slowest(paceOf(scene).slowest)
-    , _fastest(paceOf(scene).fastest)
+    , _minSpeed(paceOf(scene).minSpeed)
+    , _maxSpeed(paceOf(scene).maxSpeed)
     , _position(dice.between(0, length))
-    , _speed((_slowest + _fastest) / 2)
+    , _speed((_minSpeed + _maxSpeed) / 2)
 {
 }
 
 void Journey::advance(std::chrono::milliseconds step, Dice& dice)
 {
     const double seconds = std::chrono::duration<double>(step).count();
-    _speed = std::clamp(_speed + dice.between(-1, 1) * seconds, _slowest, _fastest);
+    _speed = std::clamp(_speed + dice.between(-1, 1) * seconds, _minSpeed, _maxSpeed);
     _position = std::fmod(_position + _speed * seconds, _length);
 }
 
@@ -69,23 +63,6 @@ double Journey::distanceTo(double position, double offset) const
 double Journey::ahead(double position) const
 {
     return std::remainder(position - _position, _length);
-}
-
-void Shadowing::advance(std::chrono::milliseconds step, Dice& dice)
-{
-    const double seconds = std::chrono::duration<double>(step).count();
-    _decibels = std::clamp(_decibels + dice.between(-1, 1) * std::sqrt(seconds), -6.0, 6.0);
-}
-
-double Valley::lossAt(const Journey& journey) const
-{
-    const double out = journey.distanceTo((from + to) / 2, 0) / ((to - from) / 2);
-    return out >= 1 ? 0 : loss * (1 + std::cos(out * std::numbers::pi)) / 2;
-}
-
-double pathLoss(double metres)
-{
-    return 128.1 + 37.6 * std::log10(std::max(metres, 35.0) / 1000);
 }
 
 } // namespace spectrel

@@ -1,4 +1,4 @@
-#include "Telephony/Simulator/SimulatorSource.h"
+#include "Telephony/Sources/SimulatorSource.h"
 
 #include "Telephony/ChannelQueue.h"
 

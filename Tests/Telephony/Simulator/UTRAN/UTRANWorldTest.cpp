@@ -46,27 +46,27 @@ TEST(UTRANWorldTest, PhoneMovesByTheRankingOnly)
     UTRANWorld world(Scene::Drive, 2);
     int moves = 0;
     for (int step = 0; step < Drive; ++step) {
-        const UTRANCell& last = world.servingCell();
+        const UTRANCell& previous = world.servingCell();
         const RRCMode mode = world.mode();
         world.advance(100ms);
-        if (&world.servingCell() == &last)
+        if (&world.servingCell() == &previous)
             continue;
         ++moves;
-        EXPECT_GT(world.servingCell().rscp, last.rscp + UTRANThresholds::Hysteresis);
-        EXPECT_GT(world.servingCell().rscp, UTRANThresholds::LeastRSCP);
-        if (mode != RRCMode::CellDCH && world.servingCell().channel != last.channel) {
-            EXPECT_LE(last.rscp - UTRANThresholds::LeastRSCP, UTRANThresholds::SearchBelow);
+        EXPECT_GT(world.servingCell().rscp, previous.rscp + UTRANThresholds::Hysteresis);
+        EXPECT_GT(world.servingCell().rscp, UTRANThresholds::QRxLevMin);
+        if (mode != RRCMode::CellDCH && world.servingCell().channel != previous.channel) {
+            EXPECT_LE(previous.rscp - UTRANThresholds::QRxLevMin, UTRANThresholds::SInterSearch);
         }
     }
     EXPECT_GE(moves, 10);
 }
 
-/// The told cells beside the serving one.
+/// The reported cells beside the serving one.
 std::vector<UTRANNeighbour> others(const UTRANWorld& world)
 {
-    auto told = world.neighbours();
-    std::erase_if(told, [](const UTRANNeighbour& cell) { return cell.set == UTRANCellSet::Active; });
-    return told;
+    auto reported = world.neighbours();
+    std::erase_if(reported, [](const UTRANNeighbour& cell) { return cell.set == UTRANCellSet::Active; });
+    return reported;
 }
 
 bool hasOtherChannel(const UTRANWorld& world)
@@ -82,7 +82,7 @@ TEST(UTRANWorldTest, IdlePhoneMeasuresItsOwnChannelUnderTheMastToo)
     int withNeighbours = 0;
     for (int step = 0; step < Drive; ++step) {
         world.advance(100ms);
-        if (world.mode() == RRCMode::CellDCH || world.receiveLevel() <= UTRANThresholds::SearchBelow)
+        if (world.mode() == RRCMode::CellDCH || world.srxlev() <= UTRANThresholds::SInterSearch)
             continue;
         ++near;
         withNeighbours += others(world).empty() ? 0 : 1;
@@ -101,7 +101,7 @@ TEST(UTRANWorldTest, OtherChannelsAreMeasuredOnceTheServingCellHasFallenOrOnADed
         world.advance(100ms);
         if (!hasOtherChannel(world))
             continue;
-        const bool hasFallen = world.receiveLevel() <= UTRANThresholds::SearchBelow;
+        const bool hasFallen = world.srxlev() <= UTRANThresholds::SInterSearch;
         fallen += hasFallen && world.mode() != RRCMode::CellDCH ? 1 : 0;
         dedicated += !hasFallen ? 1 : 0;
         EXPECT_TRUE(hasFallen || world.mode() == RRCMode::CellDCH);
@@ -136,7 +136,7 @@ TEST(UTRANWorldTest, ServingCellIsTheActiveSetOfADedicatedChannel)
         const auto active = std::ranges::find(neighbours, UTRANCellSet::Active, &UTRANNeighbour::set);
         ASSERT_EQ(active != neighbours.end(), world.mode() == RRCMode::CellDCH);
         if (active != neighbours.end()) {
-            EXPECT_EQ(active->parameter, world.servingCell().parameter);
+            EXPECT_EQ(active->cellParameterId, world.servingCell().cellParameterId);
         }
     }
 }
@@ -172,13 +172,13 @@ TEST(UTRANWorldTest, InTheValleyOnlyHelpCanBeCalled)
             continue;
         ++without;
         EXPECT_EQ(world.mode(), RRCMode::Disconnected);
-        EXPECT_LE(world.servingCell().rscp, UTRANThresholds::LeastRSCP);
+        EXPECT_LE(world.servingCell().rscp, UTRANThresholds::QRxLevMin);
     }
     EXPECT_GT(without, 10);
     EXPECT_LT(without, Drive / 4);
 }
 
-TEST(UTRANWorldTest, GSMCellsAreToldStrongestFirst)
+TEST(UTRANWorldTest, GSMCellsAreReportedStrongestFirst)
 {
     UTRANWorld world(Scene::Walk, 1);
     world.advance(100ms);
@@ -190,47 +190,6 @@ TEST(UTRANWorldTest, GSMCellsAreToldStrongestFirst)
         EXPECT_LT(cell.networkColour, 8);
         EXPECT_LT(cell.stationColour, 8);
     }
-}
-
-/// Advances until the mode is there, and tells how long that took.
-std::chrono::milliseconds until(RRCConnection& connection, RRCMode mode, bool isNeeded)
-{
-    std::chrono::milliseconds elapsed {0};
-    while (connection.mode() != mode && elapsed < 1min) {
-        connection.advance(100ms, isNeeded);
-        elapsed += 100ms;
-    }
-    return elapsed;
-}
-
-TEST(RRCConnectionTest, IsSetUpAndSteppedDown)
-{
-    RRCConnection connection;
-    EXPECT_EQ(until(connection, RRCMode::Connecting, true), 100ms);
-    EXPECT_EQ(until(connection, RRCMode::CellDCH, true), 900ms);
-    connection.advance(1min, true);
-    EXPECT_TRUE(connection.isOnDedicatedChannel()) << "for as long as it is needed";
-    EXPECT_EQ(until(connection, RRCMode::CellFACH, false), 3s);
-    EXPECT_EQ(until(connection, RRCMode::CellPCH, false), 5s);
-    EXPECT_EQ(until(connection, RRCMode::URAPCH, false), 8s);
-    EXPECT_EQ(until(connection, RRCMode::Disconnected, false), 10s);
-}
-
-TEST(RRCConnectionTest, ComesBackFromPagingThroughTheCommonChannel)
-{
-    RRCConnection connection;
-    until(connection, RRCMode::CellDCH, true);
-    until(connection, RRCMode::URAPCH, false);
-    EXPECT_EQ(until(connection, RRCMode::CellFACH, true), 100ms);
-    EXPECT_EQ(until(connection, RRCMode::CellDCH, true), 500ms);
-}
-
-TEST(RRCConnectionTest, LosesItsCellAtOnce)
-{
-    RRCConnection connection;
-    until(connection, RRCMode::CellDCH, true);
-    connection.lose();
-    EXPECT_EQ(connection.mode(), RRCMode::Disconnected);
 }
 
 } // namespace

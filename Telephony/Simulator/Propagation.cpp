@@ -1,0 +1,26 @@
+#include "Telephony/Simulator/Propagation.h"
+
+#include <algorithm>
+#include <cmath>
+#include <numbers>
+
+namespace spectrel {
+
+void Shadowing::advance(std::chrono::milliseconds step, Dice& dice)
+{
+    const double seconds = std::chrono::duration<double>(step).count();
+    _decibels = std::clamp(_decibels + dice.between(-1, 1) * std::sqrt(seconds), -6.0, 6.0);
+}
+
+double Valley::lossAt(const Journey& journey) const
+{
+    const double out = journey.distanceTo((from + to) / 2, 0) / ((to - from) / 2);
+    return out >= 1 ? 0 : loss * (1 + std::cos(out * std::numbers::pi)) / 2;
+}
+
+double pathLoss(double metres)
+{
+    return 128.1 + 37.6 * std::log10(std::max(metres, 35.0) / 1000);
+}
+
+} // namespace spectrel
