@@ -4,6 +4,7 @@
 #include "Benchmarks/Yardstick.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Platform/Resources.h"
+#include "Records/Frame.h"
 #include "Records/Recording.h"
 #include "Telephony/Encoders/RecordWriter.h"
 #include "Telephony/Simulator/SimulatedRecording.h"
@@ -96,11 +97,8 @@ std::map<std::uint32_t, Messages> messagesByCode(Technology technology)
     const Drive drive(technology);
     if (!drive.isWritten)
         return byCode;
-    forEachMessage(drive.path, [&byCode](ByteView body) {
-        std::uint32_t code = 0;
-        routedCode(body, code);
-        byCode[code].emplace_back(body.begin(), body.end());
-    });
+    forEachMessage(drive.path,
+        [&byCode](ByteView body) { byCode[routedCode(body).value_or(0)].emplace_back(body.begin(), body.end()); });
     return byCode;
 }
 

@@ -1,7 +1,7 @@
 #include "Telephony/LogChannel.h"
 
 #include "Platform/TelephonyProtocol.h"
-#include "Telephony/Encoders/RecordWriter.h"
+#include "Records/Frame.h"
 #include "Telephony/ServiceLine.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
@@ -56,15 +56,15 @@ std::optional<Subscription> Subscription::fromStartCommand(const Value& command)
     const Value& ordinary = (*dictionary)[Protocol::OrdinaryCodesKey];
     const Value& extra = (*dictionary)[Protocol::ExtraCodesKey];
     subscription._wantsEverything = ordinary.isAbsent() && extra.isAbsent();
-    if (!addCodes(ordinary, 0, subscription._codes) || !addCodes(extra, ExtraStreamOffset, subscription._codes))
+    if (!addCodes(ordinary, 0, subscription._codes) || !addCodes(extra, ExtraStream, subscription._codes))
         return std::nullopt;
     return subscription;
 }
 
 bool Subscription::wants(ByteView message) const
 {
-    std::uint32_t code = 0;
-    return _wantsEverything || !routedCode(message, code) || _codes.contains(code);
+    const auto code = routedCode(message);
+    return _wantsEverything || !code || _codes.contains(*code);
 }
 
 LogChannel::LogChannel(RunLoop& runLoop, LogSource& source, unsigned number, std::function<void()> onEnd)

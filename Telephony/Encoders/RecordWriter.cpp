@@ -1,15 +1,10 @@
 #include "Telephony/Encoders/RecordWriter.h"
 
+#include "Records/Frame.h"
+
 #include <utility>
 
 namespace spectrel {
-
-namespace {
-constexpr std::uint8_t OrdinaryType = 0x01;
-constexpr std::uint8_t ExtraType = 0xFF;
-constexpr std::uint8_t WrapperMark = 0x81;
-constexpr std::size_t HeaderSize = 13;
-} // namespace
 
 std::uint64_t itemTimestamp(Moment time)
 {
@@ -22,7 +17,7 @@ RecordWriter::RecordWriter(std::uint32_t code, Moment time)
 {
     _record.reserve(64);
     const std::uint64_t timestamp = itemTimestamp(time);
-    u8(code >= ExtraStreamOffset ? ExtraType : OrdinaryType);
+    u8(code >= ExtraStream ? ExtraRecord : OrdinaryRecord);
     u16(0); // the item length, once it is known
     u16(code);
     u32(static_cast<std::uint32_t>(timestamp));
@@ -59,23 +54,10 @@ RecordWriter& RecordWriter::bytes(ByteView bytes)
 
 Bytes RecordWriter::take()
 {
-    const std::size_t itemLength = _record.size() - 1;
-    _record[1] = static_cast<std::uint8_t>(itemLength);
-    _record[2] = static_cast<std::uint8_t>(itemLength >> 8);
+    const std::size_t itemLength = _record.size() - RecordTypeSize;
+    _record[RecordTypeSize] = static_cast<std::uint8_t>(itemLength);
+    _record[RecordTypeSize + 1] = static_cast<std::uint8_t>(itemLength >> 8);
     return std::move(_record);
-}
-
-bool routedCode(ByteView message, std::uint32_t& code)
-{
-    if (message.size() < HeaderSize)
-        return false;
-    const ByteView record = message[0] == WrapperMark ? message.subspan(2) : message;
-    if (record[0] != OrdinaryType && record[0] != ExtraType)
-        return false;
-    code = record[3] | static_cast<std::uint32_t>(record[4]) << 8;
-    if (record[0] == ExtraType)
-        code |= ExtraStreamOffset;
-    return true;
 }
 
 } // namespace spectrel

@@ -7,11 +7,7 @@
 
 namespace spectrel {
 
-/// Added to the 16-bit code of a record of the extra stream.
-constexpr std::uint32_t ExtraStreamOffset = 0xFF0000;
-
-/// Writes one log record as a baseband frames it: type byte (0x01, or 0xFF for the extra stream), 16-bit item length
-/// counted from itself, 16-bit log code, 8-byte timestamp, payload; little-endian throughout.
+/// Writes one log record as a baseband frames it (`Records/Frame.h`), without a wrapper.
 class RecordWriter {
 public:
     /// A code from 0xFF0000 on belongs to the extra stream.
@@ -32,9 +28,5 @@ private:
 
 /// The timestamp of a log item: 1/800 s since 1980-01-06 00:00 UTC in the upper 48 bits (3GPP2 C.S0002 system time).
 std::uint64_t itemTimestamp(Moment time);
-
-/// The code by which a message is routed (extra stream: code + 0xFF0000), its wrapper aside; false when it is too short
-/// or of an unknown type.
-bool routedCode(ByteView message, std::uint32_t& code);
 
 } // namespace spectrel

@@ -78,20 +78,5 @@ TEST(RecordWriterTest, CellInformationTellsTheServingCellFirst)
     EXPECT_EQ(serving["kRKCellMonitorPID"].int32(), world.servingCell().physicalCellId);
 }
 
-TEST(RoutedCodeTest, IsReadBehindAWrapperAndOnlyFromKnownTypes)
-{
-    std::uint32_t code = 0;
-    Bytes record = RecordWriter(0xFF0002, Epoch1980).take();
-    EXPECT_TRUE(routedCode(record, code));
-    EXPECT_EQ(code, 0xFF0002u);
-    record.insert(record.begin(), {0x81, 0});
-    EXPECT_TRUE(routedCode(record, code));
-    EXPECT_EQ(code, 0xFF0002u);
-    record[2] = 0x10;
-    EXPECT_FALSE(routedCode(record, code));
-    EXPECT_FALSE(routedCode(Bytes(12, 1), code));
-    EXPECT_FALSE(routedCode({}, code));
-}
-
 } // namespace
 } // namespace spectrel

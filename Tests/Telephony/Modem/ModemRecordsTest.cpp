@@ -1,4 +1,5 @@
 #include "Telephony/Modem/ModemRecords.h"
+#include "Records/Frame.h"
 
 #include "Records/TelephonyConstants.h"
 #include "Telephony/Encoders/RecordWriter.h"
@@ -17,9 +18,7 @@ constexpr Moment Now {std::chrono::seconds(1'700'000'000)};
 
 Value payload(const Bytes& record, std::uint32_t expectedCode)
 {
-    std::uint32_t code = 0;
-    EXPECT_TRUE(routedCode(record, code));
-    EXPECT_EQ(code, expectedCode);
+    EXPECT_EQ(routedCode(record), expectedCode);
     EXPECT_EQ(record[1] | record[2] << 8, static_cast<int>(record.size()) - 1) << "the length has its 16 bits";
     return parsePropertyList(ByteView(record).subspan(13)).value_or(Value());
 }

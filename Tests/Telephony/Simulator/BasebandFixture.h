@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Records/Frame.h"
 #include "Telephony/Encoders/RecordWriter.h"
 #include "Telephony/Simulator/Baseband.h"
 #include "Tests/Telephony/RecordBytes.h"
@@ -56,9 +57,9 @@ protected:
 private:
     void keep(ByteView record)
     {
-        std::uint32_t code = 0;
-        ASSERT_TRUE(routedCode(record, code));
-        records[code].emplace_back(record.begin(), record.end());
+        const auto code = routedCode(record);
+        ASSERT_TRUE(code);
+        records[*code].emplace_back(record.begin(), record.end());
     }
 
     Technology _technology;
