@@ -29,9 +29,8 @@ class Drive {
 public:
     explicit Drive(Technology technology)
     {
-        std::string reason;
         const auto baseband = makeBaseband(technology, Scene::Drive, 1);
-        isWritten = baseband && writeSimulatedRecording(*baseband, path, DriveLength, reason);
+        isWritten = baseband && writeSimulatedRecording(*baseband, path, DriveLength);
     }
 
     ScratchFolder folder;
@@ -41,8 +40,7 @@ public:
 
 template <typename Use> std::size_t forEachMessage(const std::string& path, Use use)
 {
-    std::string reason;
-    const auto reader = openRecording(path, reason);
+    const auto reader = *openRecording(path);
     RecordedMessage message;
     std::size_t count = 0;
     for (; reader->next(message); ++count)
