@@ -25,8 +25,7 @@ class Capture {
 public:
     Capture()
     {
-        std::string reason;
-        const auto writer = createRecording(path, Technology::LTE, reason);
+        const auto writer = *createRecording(path, Technology::LTE);
         for (int number = 0; number < Records; ++number)
             writer->write(Moment(std::chrono::milliseconds(number)), servingCell(number));
         writer->flush();
@@ -65,8 +64,7 @@ const DirectoryResources& resources()
 
 std::size_t readAll(const std::string& path)
 {
-    std::string reason;
-    const auto reader = openRecording(path, reason);
+    const auto reader = *openRecording(path);
     RecordedMessage message;
     std::size_t sum = 0;
     while (reader->next(message))
@@ -76,8 +74,7 @@ std::size_t readAll(const std::string& path)
 
 void decodeAll(const std::string& path, Dictionary& state)
 {
-    std::string reason;
-    const auto reader = openRecording(path, reason);
+    const auto reader = *openRecording(path);
     const auto generator = LTELogGenerator::generator();
     RecordedMessage message;
     for (int count = 0; reader->next(message); ++count) {

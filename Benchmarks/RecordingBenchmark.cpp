@@ -4,6 +4,7 @@
 #include "Benchmarks/Yardstick.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Platform/Resources.h"
+#include "Records/Frame.h"
 #include "Records/Recording.h"
 #include "Telephony/RoutedCode.h"
 #include "Telephony/Simulator/SimulatedRecording.h"
@@ -28,9 +29,8 @@ class Drive {
 public:
     explicit Drive(Technology technology)
     {
-        std::string reason;
         const auto baseband = makeBaseband(technology, Scene::Drive, 1);
-        isWritten = baseband && writeSimulatedRecording(*baseband, path, DriveLength, reason);
+        isWritten = baseband && writeSimulatedRecording(*baseband, path, DriveLength);
     }
 
     ScratchFolder folder;
@@ -40,8 +40,7 @@ public:
 
 template <typename Use> std::size_t forEachMessage(const std::string& path, Use use)
 {
-    std::string reason;
-    const auto reader = openRecording(path, reason);
+    const auto reader = *openRecording(path);
     RecordedMessage message;
     std::size_t count = 0;
     for (; reader->next(message); ++count)
@@ -96,11 +95,8 @@ std::map<std::uint32_t, Messages> messagesByCode(Technology technology)
     const Drive drive(technology);
     if (!drive.isWritten)
         return byCode;
-    forEachMessage(drive.path, [&byCode](ByteView body) {
-        std::uint32_t code = 0;
-        routedCode(body, code);
-        byCode[code].emplace_back(body.begin(), body.end());
-    });
+    forEachMessage(drive.path,
+        [&byCode](ByteView body) { byCode[routedCode(body).value_or(0)].emplace_back(body.begin(), body.end()); });
     return byCode;
 }
 

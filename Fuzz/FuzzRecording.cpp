@@ -11,13 +11,12 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t siz
     const int file = ::memfd_create("recording", MFD_CLOEXEC);
     if (file < 0 || ::write(file, bytes, size) != static_cast<ssize_t>(size))
         std::abort();
-    std::string reason;
-    const auto reader = openRecording("/proc/self/fd/" + std::to_string(file), reason);
+    const auto opened = openRecording("/proc/self/fd/" + std::to_string(file));
     ::close(file);
-    if (reader ? !reason.empty() : reason.empty())
+    if (!opened && opened.failure().text.empty())
         std::abort();
     unsigned sum = 0;
-    for (RecordedMessage message; reader && reader->next(message);) {
+    for (RecordedMessage message; opened && (*opened)->next(message);) {
         for (const std::uint8_t byte : message.body)
             sum += byte;
     }

@@ -1,6 +1,6 @@
 #include "Monitor/MessageText.h"
 
-#include "Records/RecordView.h"
+#include "Records/Frame.h"
 
 #include <cstdio>
 #include <cstdlib>
@@ -12,12 +12,11 @@ namespace spectrel {
 
 std::string codeText(ByteView message)
 {
-    const RecordView record(
-        !message.empty() && message[0] == 0x81 && message.size() > 2 ? message.subspan(2) : message);
-    if (record.size() < 5)
+    const RecordView record(recordInMessage(message));
+    if (record.size() < RecordTypeSize + ItemLengthSize + ItemCodeSize)
         return "no code";
     char text[32];
-    std::snprintf(text, sizeof text, "code 0x%04X", record.u16(3) | (record.u8(0) == 0xFF ? 0xFF0000u : 0u));
+    std::snprintf(text, sizeof text, "code 0x%04X", routingCode(record));
     return text;
 }
 

@@ -34,7 +34,10 @@ bool writeSnapshot(const DictionaryRef& snapshot, const std::string& path, std::
         reason = error.message();
         return false;
     }
-    return writePropertyListToFile(snapshot, path, reason);
+    const auto written = writePropertyListToFile(snapshot, path);
+    if (!written)
+        reason = written.failure().text;
+    return bool(written);
 }
 
 } // namespace spectrel

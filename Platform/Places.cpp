@@ -2,7 +2,6 @@
 
 #include <cerrno>
 #include <cstdlib>
-#include <cstring>
 #include <filesystem>
 #include <sys/stat.h>
 #include <system_error>
@@ -78,29 +77,21 @@ std::string Places::resourcesDirectory()
     return (program.parent_path() / "share/spectrel").string();
 }
 
-bool makePrivateDirectory(const std::string& path, std::string& reason)
+Outcome makePrivateDirectory(const std::string& path)
 {
     const fs::path folder(path);
     std::error_code error;
     fs::create_directories(folder.parent_path(), error);
-    if (::mkdir(path.c_str(), 0700) != 0 && errno != EEXIST) {
-        reason = path + ": " + std::strerror(errno);
-        return false;
-    }
+    if (::mkdir(path.c_str(), 0700) != 0 && errno != EEXIST)
+        return Failure::ofSystem().of(path);
     struct stat status { };
-    if (::lstat(path.c_str(), &status) != 0) {
-        reason = path + ": " + std::strerror(errno);
-        return false;
-    }
-    if (!S_ISDIR(status.st_mode) || status.st_uid != ::geteuid()) {
-        reason = path + ": not a folder of this user";
-        return false;
-    }
-    if ((status.st_mode & 0777) != 0700 && ::chmod(path.c_str(), 0700) != 0) {
-        reason = path + ": " + std::strerror(errno);
-        return false;
-    }
-    return true;
+    if (::lstat(path.c_str(), &status) != 0)
+        return Failure::ofSystem().of(path);
+    if (!S_ISDIR(status.st_mode) || status.st_uid != ::geteuid())
+        return Failure {path + ": not a folder of this user", Failure::Code::Refused};
+    if ((status.st_mode & 0777) != 0700 && ::chmod(path.c_str(), 0700) != 0)
+        return Failure::ofSystem().of(path);
+    return Done();
 }
 
 } // namespace spectrel

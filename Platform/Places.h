@@ -1,5 +1,7 @@
 #pragma once
 
+#include "Values/Result.h"
+
 #include <string>
 
 namespace spectrel {
@@ -14,8 +16,8 @@ struct Places {
     static std::string resourcesDirectory(); // Resources/ beside the program, the installed data directory otherwise
 };
 
-/// Makes a private folder (mode 0700) with its parents. False, with `reason`, when it cannot be made or belongs to
+/// Makes a private folder (mode 0700) with its parents. Fails, naming the folder, when it cannot be made or belongs to
 /// somebody else.
-bool makePrivateDirectory(const std::string& path, std::string& reason);
+Outcome makePrivateDirectory(const std::string& path);
 
 } // namespace spectrel

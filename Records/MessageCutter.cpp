@@ -1,5 +1,7 @@
 #include "Records/MessageCutter.h"
 
+#include "Records/Frame.h"
+
 #include <algorithm>
 #include <limits>
 
@@ -7,10 +9,7 @@ namespace spectrel {
 
 namespace {
 
-constexpr std::uint8_t Wrapper = 0x81;
-constexpr std::uint8_t OrdinaryType = 0x01;
-constexpr std::uint8_t ExtraType = 0xFF;
-constexpr std::size_t SmallestItem = 12; // length, code, timestamp
+constexpr std::size_t BeheadedWrapper = WrapperSize - 1; // its first byte is missing
 constexpr std::size_t SmallestExtraFree = 0x0010; // codes below belong to the extra stream
 
 /// Places looked at together; a plan serves its first half. Much longer than the longest item.
@@ -30,36 +29,32 @@ constexpr std::int32_t NoWay = std::numeric_limits<std::int32_t>::min() / 2;
 
 } // namespace
 
-std::size_t MessageCutter::itemLength(std::size_t place) const
-{
-    return _bytes[place] | _bytes[place + 1] << 8;
-}
-
 bool MessageCutter::isItem(std::size_t place) const
 {
-    return place + SmallestItem <= _bytes.size() && itemLength(place) >= SmallestItem
-        && itemLength(place) <= _bytes.size() - place;
+    return place + ItemHeaderSize <= _bytes.size() && itemLength(_bytes, place) >= ItemHeaderSize
+        && itemLength(_bytes, place) <= _bytes.size() - place;
 }
 
 bool MessageCutter::isKnownType(std::size_t place) const
 {
-    return place < _bytes.size() && (_bytes[place] == OrdinaryType || _bytes[place] == ExtraType);
+    return isRecordType(_bytes.u8(place));
 }
 
 /// A whole message, wrapper and all.
 MessageCutter::Candidate MessageCutter::message(std::size_t place) const
 {
-    const std::size_t type = place + (_bytes[place] == Wrapper ? 2 : 0);
-    if (!isItem(type + 1))
+    const std::size_t type = recordPlace(_bytes, place);
+    const std::size_t item = type + RecordTypeSize;
+    if (!isItem(item))
         return {};
-    return {type + 1 + itemLength(type + 1) - place, isKnownType(type) ? MessageScore : UnknownTypeScore, {}};
+    return {item + itemLength(_bytes, item) - place, isKnownType(type) ? MessageScore : UnknownTypeScore, {}};
 }
 
 /// Whether an item may start at the place whose rest is to come.
 bool MessageCutter::isStartOfItem(std::size_t place) const
 {
     return place + 2 > _bytes.size()
-        || (itemLength(place) >= SmallestItem && itemLength(place) > _bytes.size() - place);
+        || (itemLength(_bytes, place) >= ItemHeaderSize && itemLength(_bytes, place) > _bytes.size() - place);
 }
 
 /// Whether a message may start at the place whose rest is to come.
@@ -67,11 +62,12 @@ bool MessageCutter::goesOn(std::size_t place) const
 {
     if (_end == SequenceEnd::Whole || place >= _bytes.size())
         return false;
-    const std::size_t type = place + (_bytes[place] == Wrapper ? 2 : 0);
-    if (type >= _bytes.size() || (isKnownType(type) && isStartOfItem(type + 1)))
+    const std::size_t type = recordPlace(_bytes, place);
+    if (type >= _bytes.size() || (isKnownType(type) && isStartOfItem(type + RecordTypeSize)))
         return true;
     return _sequence == MessageSequence::Beheaded
-        && (isStartOfItem(place) || (isKnownType(place + 1) && isStartOfItem(place + 2)));
+        && (isStartOfItem(place)
+            || (isKnownType(place + BeheadedWrapper) && isStartOfItem(place + BeheadedWrapper + RecordTypeSize)));
 }
 
 /// Calls `visit` with each message that may start at the place.
@@ -82,11 +78,12 @@ template <typename Visitor> void MessageCutter::visitCandidates(std::size_t plac
     if (_sequence == MessageSequence::Whole)
         return;
     if (isItem(place)) { // its type byte is missing: the code tells it
-        const std::size_t code = _bytes[place + 2] | _bytes[place + 3] << 8;
-        visit({itemLength(place), BeheadedScore, code < SmallestExtraFree ? ExtraType : OrdinaryType});
+        const bool isExtra = itemCode(_bytes, place) < SmallestExtraFree;
+        visit({itemLength(_bytes, place), BeheadedScore, isExtra ? ExtraRecord : OrdinaryRecord});
     }
-    if (isKnownType(place + 1) && isItem(place + 2)) // the first byte of its wrapper is missing
-        visit({2 + itemLength(place + 2), BeheadedWrapperScore, Wrapper});
+    const std::size_t item = place + BeheadedWrapper + RecordTypeSize;
+    if (isKnownType(place + BeheadedWrapper) && isItem(item))
+        visit({item + itemLength(_bytes, item) - place, BeheadedWrapperScore, WrapperMark});
 }
 
 /// The score of the best way on; beyond the plan nothing is known yet.
@@ -144,8 +141,8 @@ std::optional<std::size_t> MessageCutter::endOfPiece() const
 /// type.
 bool MessageCutter::isRefusedMessage(std::size_t end) const
 {
-    const std::size_t record = _place + (_bytes[_place] == Wrapper ? 2 : 0);
-    return record + 1 + SmallestItem > end || !isKnownType(record);
+    const std::size_t record = recordPlace(_bytes, _place);
+    return record + RecordHeaderSize > end || !isKnownType(record);
 }
 
 bool MessageCutter::next(Cut& cut)
@@ -191,15 +188,16 @@ std::string MessageCutter::complaint() const
 {
     const std::size_t left = _bytes.size() - _place;
     std::size_t item = _place;
-    if (_bytes[_place] == Wrapper)
-        item += 3;
+    if (_bytes.u8(_place) == WrapperMark)
+        item += WrapperSize + RecordTypeSize;
     else if (_sequence == MessageSequence::Whole || isKnownType(_place))
-        item += 1;
-    if (item + SmallestItem > _bytes.size())
+        item += RecordTypeSize;
+    if (item + ItemHeaderSize > _bytes.size())
         return std::to_string(left) + " bytes are left, too few for a message";
-    const std::size_t length = itemLength(item);
-    if (length < SmallestItem)
-        return "the item has a length of " + std::to_string(length) + ", the least is " + std::to_string(SmallestItem);
+    const std::size_t length = itemLength(_bytes, item);
+    if (length < ItemHeaderSize)
+        return "the item has a length of " + std::to_string(length) + ", the least is "
+            + std::to_string(ItemHeaderSize);
     if (length > _bytes.size() - item)
         return "the item has a length of " + std::to_string(length) + ", " + std::to_string(_bytes.size() - item)
             + " bytes are left";

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Records/RecordView.h"
 #include "Values/Bytes.h"
 
 #include <cstddef>
@@ -12,7 +13,7 @@ namespace spectrel {
 
 /// What the bytes to be cut are.
 enum class MessageSequence : std::uint8_t {
-    /// Messages as received, back to back: an optional wrapper (0x81 and one more byte), a type byte, an item.
+    /// Messages as received, back to back.
     Whole,
     /// The same, but the first byte of some messages is missing: at the start of each former buffer.
     Beheaded,
@@ -26,7 +27,7 @@ enum class SequenceEnd : std::uint8_t {
 
 /// Cuts log messages that lie back to back.
 ///
-/// An item starts with its own length (16 bits, little-endian, 12 to 65535, the two bytes included). Received bytes
+/// An item starts with its own length (12 to 65535, the header included). Received bytes
 /// that were no proper message (too short, or of an unknown type) lie between the others and tell no length of their
 /// own: what stands before the next place from where the messages go on is such a piece. Of all ways to cut, the one
 /// that leaves the fewest such pieces and explains the most messages is taken, looking ahead over a window; time is
@@ -73,7 +74,6 @@ private:
     };
 
     bool isItem(std::size_t place) const;
-    std::size_t itemLength(std::size_t place) const;
     bool isKnownType(std::size_t place) const;
     bool isStartOfItem(std::size_t place) const;
     bool goesOn(std::size_t place) const;
@@ -85,7 +85,7 @@ private:
     bool isRefusedMessage(std::size_t end) const;
     std::optional<std::size_t> endOfPiece() const;
 
-    ByteView _bytes;
+    RecordView _bytes;
     MessageSequence _sequence;
     SequenceEnd _end;
     std::size_t _place = 0;

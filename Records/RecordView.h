@@ -7,11 +7,8 @@
 
 namespace spectrel {
 
-/// Bytes before the payload: type byte, 16-bit item length, 16-bit log code, 8-byte timestamp.
-constexpr std::size_t RecordHeaderSize = 13;
-
-/// One log record as the sections read it. Offsets count from its first byte, the header included; multi-byte fields
-/// are little-endian and may be unaligned. Bytes past the end read as 0.
+/// A log record, or bytes that may hold some, as everything here reads them. Offsets count from the first byte, a
+/// record's header included; multi-byte fields are little-endian and may be unaligned. Bytes past the end read as 0.
 class RecordView {
 public:
     constexpr RecordView(ByteView bytes)
@@ -45,10 +42,10 @@ public:
     {
         return u32(offset) >> first & ((std::uint32_t(1) << count) - 1);
     }
-    /// What follows the header; empty for a record that ends before it.
-    constexpr ByteView payload() const
+    /// The bytes from there on; empty past the end.
+    constexpr ByteView from(std::size_t offset) const
     {
-        return _bytes.size() > RecordHeaderSize ? _bytes.subspan(RecordHeaderSize) : ByteView();
+        return offset < _bytes.size() ? _bytes.subspan(offset) : ByteView();
     }
 
 private:

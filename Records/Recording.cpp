@@ -25,38 +25,33 @@ bool looksLikePropertyList(ByteView bytes)
 }
 
 /// Snapshots and DLF files are read as a whole.
-std::unique_ptr<RecordingReader> openWhole(Bytes bytes, std::string& reason)
+Result<std::unique_ptr<RecordingReader>> openWhole(Bytes bytes)
 {
+    if (bytes.empty())
+        return Failure {"the file is empty"};
     if (looksLikePropertyList(bytes)) {
-        const auto list = parsePropertyList(bytes);
-        if (list)
-            return openSnapshot(*list, reason);
-        reason = "a property list that does not parse";
-        return nullptr;
+        if (const auto list = parsePropertyList(bytes))
+            return openSnapshot(*list);
+        return Failure {"a property list that does not parse"};
     }
     if (looksLikeDLF(bytes))
         return openDLF(std::move(bytes));
-    reason = "neither a capture nor a snapshot nor a DLF file";
-    return nullptr;
+    return Failure {"neither a capture nor a snapshot nor a DLF file"};
 }
 
 } // namespace
 
-std::unique_ptr<RecordingReader> openRecording(const std::string& path, std::string& reason)
+Result<std::unique_ptr<RecordingReader>> openRecording(const std::string& path)
 {
-    auto file = RecordingFile::open(path, reason);
+    auto file = RecordingFile::open(path);
     if (!file)
-        return nullptr;
+        return file.failure();
     if (startsCapture(file->peek()))
-        return openCapture(std::move(*file), reason);
-    auto bytes = file->readAll(PropertyListLimits::SerialisedBytes, reason);
+        return openCapture(*std::move(file));
+    auto bytes = file->readAll(PropertyListLimits::SerialisedBytes);
     if (!bytes)
-        return nullptr;
-    if (bytes->empty()) {
-        reason = "the file is empty";
-        return nullptr;
-    }
-    return openWhole(std::move(*bytes), reason);
+        return bytes.failure();
+    return openWhole(*std::move(bytes));
 }
 
 } // namespace spectrel

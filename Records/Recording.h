@@ -3,6 +3,7 @@
 #include "Records/Technology.h"
 #include "Values/Bytes.h"
 #include "Values/Moment.h"
+#include "Values/Result.h"
 #include "Values/Value.h"
 
 #include <cstdint>
@@ -36,9 +37,8 @@ public:
     }
 };
 
-/// Opens a recording; its content tells its kind. Null when it cannot be read or is of no known kind, with `reason`
-/// telling why (without the file's name).
-std::unique_ptr<RecordingReader> openRecording(const std::string& path, std::string& reason);
+/// Opens a recording; its content tells its kind. Fails when it cannot be read or is of no known kind.
+Result<std::unique_ptr<RecordingReader>> openRecording(const std::string& path);
 
 /// Writes a capture file (classic pcap); the link type tells the technology.
 class RecordingWriter {
@@ -50,13 +50,12 @@ public:
     virtual const std::string& error() const = 0;
 };
 
-/// Null when the file cannot be made, with `reason` telling why. "-" is standard output.
+/// Makes a capture file, or overwrites one; "-" is standard output.
 ///
 /// A program that is killed, at whatever time, leaves a file that can be read: a new one has its head from the start,
 /// and at most the last message is cut, where the kill struck in the midst of a write.
-std::unique_ptr<RecordingWriter> createRecording(const std::string& path, Technology technology, std::string& reason);
-/// The same for a name that no file has yet: null with an empty `reason` when one has it.
-std::unique_ptr<RecordingWriter> createNewRecording(
-    const std::string& path, Technology technology, std::string& reason);
+Result<std::unique_ptr<RecordingWriter>> createRecording(const std::string& path, Technology technology);
+/// The same for a name that no file has yet: fails with `Exists` when one has it.
+Result<std::unique_ptr<RecordingWriter>> createNewRecording(const std::string& path, Technology technology);
 
 } // namespace spectrel

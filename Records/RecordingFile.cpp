@@ -1,24 +1,19 @@
 #include "Records/RecordingFile.h"
 
 #include <cerrno>
-#include <cstring>
 #include <sys/stat.h>
 
 namespace spectrel {
 
-std::optional<RecordingFile> RecordingFile::open(const std::string& path, std::string& reason)
+Result<RecordingFile> RecordingFile::open(const std::string& path)
 {
     RecordingFile file;
     file._file.reset(std::fopen(path.c_str(), "rbe"));
     struct stat status { };
-    if (!file._file || ::fstat(::fileno(file.get()), &status) != 0) {
-        reason = std::strerror(errno);
-        return std::nullopt;
-    }
-    if (S_ISDIR(status.st_mode)) {
-        reason = std::strerror(EISDIR);
-        return std::nullopt;
-    }
+    if (!file._file || ::fstat(::fileno(file.get()), &status) != 0)
+        return Failure::ofSystem();
+    if (S_ISDIR(status.st_mode))
+        return Failure::ofSystem(EISDIR);
     return file;
 }
 
@@ -32,23 +27,19 @@ Bytes RecordingFile::peek()
     return bytes;
 }
 
-std::optional<Bytes> RecordingFile::readAll(std::size_t largest, std::string& reason)
+Result<Bytes> RecordingFile::readAll(std::size_t largest)
 {
     constexpr std::size_t Step = 1 << 16;
     Bytes bytes;
     std::size_t length = 0;
     for (std::size_t count = Step; count == Step; length += count) {
-        if (length > largest) {
-            reason = "larger than " + std::to_string(largest) + " bytes";
-            return std::nullopt;
-        }
+        if (length > largest)
+            return Failure {"larger than " + std::to_string(largest) + " bytes"};
         bytes.resize(length + Step);
         count = std::fread(bytes.data() + length, 1, Step, get());
     }
-    if (std::ferror(get())) {
-        reason = std::strerror(errno);
-        return std::nullopt;
-    }
+    if (std::ferror(get()))
+        return Failure::ofSystem();
     bytes.resize(length);
     return bytes;
 }

@@ -1,11 +1,11 @@
 #pragma once
 
 #include "Values/Bytes.h"
+#include "Values/Result.h"
 
 #include <cstddef>
 #include <cstdio>
 #include <memory>
-#include <optional>
 #include <string>
 
 namespace spectrel {
@@ -13,13 +13,13 @@ namespace spectrel {
 /// A file opened for reading, closed at the end.
 class RecordingFile {
 public:
-    /// None, with `reason`, when it is missing, unreadable or a folder.
-    static std::optional<RecordingFile> open(const std::string& path, std::string& reason);
+    /// Fails when it is missing, unreadable or a folder.
+    static Result<RecordingFile> open(const std::string& path);
 
     /// The first bytes, at most 4, without taking them: works on pipes, too.
     Bytes peek();
-    /// The rest of the file; none, with `reason`, when it cannot be read or is larger than that.
-    std::optional<Bytes> readAll(std::size_t largest, std::string& reason);
+    /// The rest of the file; fails when it cannot be read or is larger than that.
+    Result<Bytes> readAll(std::size_t largest);
 
     std::FILE* get() const
     {

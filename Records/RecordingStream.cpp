@@ -4,7 +4,7 @@
 #include "Records/Capture/CaptureStream.h"
 #include "Records/DLF/DLFReader.h"
 #include "Records/DLF/DLFStream.h"
-#include "Records/StreamBuffer.h"
+#include "Records/StreamCutter.h"
 
 #include <algorithm>
 #include <utility>

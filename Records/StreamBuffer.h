@@ -1,11 +1,9 @@
 #pragma once
 
-#include "Records/Recording.h"
 #include "Values/Bytes.h"
 
 #include <cstddef>
 #include <cstdint>
-#include <optional>
 
 namespace spectrel {
 
@@ -43,26 +41,6 @@ private:
     Bytes _bytes;
     std::size_t _start = 0;
     std::uint64_t _offset = 0;
-};
-
-/// How one kind of recording is cut out of a stream.
-class StreamCutter {
-public:
-    enum class Found : std::uint8_t {
-        Nothing, // more bytes must come
-        Begin, // of a recording; its header is taken
-        Message,
-        Damage, // bytes that are none of it are taken; `damage` tells why
-    };
-    struct Piece {
-        std::uint64_t length = 0; // of the damage
-        const char* reason = "";
-    };
-
-    virtual ~StreamCutter() = default;
-    /// Takes the next piece from the buffer's front. At the stream's end everything is taken in the end.
-    virtual Found next(StreamBuffer& buffer, RecordedMessage& message, Piece& damage) = 0;
-    virtual std::optional<Technology> technology() const = 0;
 };
 
 } // namespace spectrel

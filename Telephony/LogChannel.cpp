@@ -2,7 +2,6 @@
 
 #include "Platform/TelephonyProtocol.h"
 #include "Records/Frame.h"
-#include "Telephony/RoutedCode.h"
 #include "Telephony/ServiceLine.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
@@ -64,8 +63,8 @@ std::optional<Subscription> Subscription::fromStartCommand(const Value& command)
 
 bool Subscription::wants(ByteView message) const
 {
-    std::uint32_t code = 0;
-    return _wantsEverything || !routedCode(message, code) || _codes.contains(code);
+    const auto code = routedCode(message);
+    return _wantsEverything || !code || _codes.contains(*code);
 }
 
 LogChannel::LogChannel(RunLoop& runLoop, LogSource& source, unsigned number, std::function<void()> onEnd)

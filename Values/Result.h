@@ -1,7 +1,10 @@
 #pragma once
 
+#include <cerrno>
+#include <concepts>
 #include <cstdint>
 #include <string>
+#include <type_traits>
 #include <utility>
 #include <variant>
 
@@ -18,15 +21,30 @@ struct Failure {
         NoRoom, // the disk, a quota or a limit of the system is exhausted
     };
 
+    /// Of a system call, in the C library's words.
+    static Failure ofSystem(int error = errno);
+    /// The same failure, its text led in by what failed: "FILE: No such file or directory".
+    Failure of(const std::string& what) const
+    {
+        return {what + ": " + text, code};
+    }
+
     std::string text; // for people, without the name of the file or program, which the caller knows
     Code code = Code::Failed;
 };
 
 /// What an operation that can fail yields: the value, or why there is none.
+///
+///     auto reader = openRecording(path);
+///     if (!reader)
+///         return reader.failure();
 template <typename Value> class [[nodiscard]] Result {
 public:
-    Result(Value value)
-        : _held(std::in_place_index<0>, std::move(value))
+    /// From whatever a value is made of, such as a pointer to a derived class.
+    template <typename Source = Value>
+    requires std::convertible_to<Source, Value> &&(!std::same_as<std::remove_cvref_t<Source>, Result>)&&(
+        !std::same_as<std::remove_cvref_t<Source>, Failure>)Result(Source&& value)
+        : _held(std::in_place_index<0>, std::forward<Source>(value))
     {
     }
     Result(Failure failure)
@@ -38,13 +56,18 @@ public:
     {
         return _held.index() == 0;
     }
-    Value& operator*()
+    /// Only of a result with a value, as the arrow.
+    Value& operator*() &
     {
         return *std::get_if<0>(&_held);
     }
-    const Value& operator*() const
+    const Value& operator*() const&
     {
         return *std::get_if<0>(&_held);
+    }
+    Value operator*() &&
+    {
+        return std::move(*std::get_if<0>(&_held));
     }
     Value* operator->()
     {

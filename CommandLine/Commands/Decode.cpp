@@ -48,12 +48,12 @@ private:
     {
         const bool isStandardInput = path == "-";
         const std::string file = isStandardInput ? "standard input" : path;
-        std::string reason;
-        const auto reader = openRecording(isStandardInput ? "/dev/stdin" : path, reason);
-        if (!reader) {
-            fail(file + ": " + reason);
+        const auto opened = openRecording(isStandardInput ? "/dev/stdin" : path);
+        if (!opened) {
+            fail(opened.failure().of(file).text);
             return true;
         }
+        const auto& reader = *opened;
         const auto technology = reader->technology() ? reader->technology() : _options.technology;
         if (!technology) {
             fail(file + ": does not tell its technology; name it with --technology");

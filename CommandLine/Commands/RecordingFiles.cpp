@@ -136,14 +136,20 @@ bool RecordingFiles::createNext(Technology technology)
 {
     if (_isFolder)
         _number = latestNumber();
-    std::string reason;
-    do {
+    for (;;) {
         ++_number;
         _path = numberedPath(technology);
         const bool isTarget = _path == _options.target;
-        _writer = (isTarget ? createRecording : createNewRecording)(_path, technology, reason);
-    } while (!_writer && reason.empty());
-    return _writer || failed(_path, reason);
+        auto created = (isTarget ? createRecording : createNewRecording)(_path, technology);
+        if (created) {
+            _writer = *std::move(created);
+            return true;
+        }
+        if (created.failure().code != Failure::Code::Exists) {
+            _writer.reset();
+            return failed(_path, created.failure().text);
+        }
+    }
 }
 
 std::string RecordingFiles::numberedPath(Technology technology) const

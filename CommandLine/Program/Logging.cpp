@@ -22,11 +22,14 @@ bool Logging::start(const std::optional<std::string>& file, Use use)
 bool Logging::startDiagnostics()
 {
     const std::string path = Places::diagnosticLog();
-    std::string reason;
-    if (!path.empty() && !(_diagnostics = DiagnosticFile::create(path, reason))) {
-        report(path + ": " + reason);
+    if (path.empty())
+        return true;
+    auto created = DiagnosticFile::create(path);
+    if (!created) {
+        report(created.failure().of(path).text);
         return false;
     }
+    _diagnostics = *std::move(created);
     return true;
 }
 
@@ -34,13 +37,13 @@ bool Logging::startLog(const std::optional<std::string>& file, Use use)
 {
     if (file) {
         _path = *file;
-        std::string reason;
-        _file =
-            FileLog::create(_path, use == Use::Live ? FileLog::Writing::EachLine : FileLog::Writing::Buffered, reason);
-        if (!_file) {
-            report(_path + ": " + reason);
+        auto created =
+            FileLog::create(_path, use == Use::Live ? FileLog::Writing::EachLine : FileLog::Writing::Buffered);
+        if (!created) {
+            report(created.failure().of(_path).text);
             return false;
         }
+        _file = *std::move(created);
         SystemLog::install(_file.get(), EveryPriority);
     } else if (use == Use::Live) {
         _system = std::make_unique<SyslogLog>();

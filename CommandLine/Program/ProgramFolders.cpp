@@ -22,12 +22,11 @@ std::optional<std::string> templates(const std::optional<std::string>& named)
 
 bool preparePorts(std::string_view portPrefix)
 {
-    std::string reason;
     const std::string name = std::string(portPrefix) + std::string(SpectrelModel::PortSuffix);
-    if (SocketMessagePorts::prepareDirectory(Places::portDirectory(), name, reason))
-        return true;
-    report("the message ports' folder cannot be had: " + reason);
-    return false;
+    const auto prepared = SocketMessagePorts::prepareDirectory(Places::portDirectory(), name);
+    if (!prepared)
+        report(prepared.failure().of("the message ports' folder cannot be had").text);
+    return bool(prepared);
 }
 
 } // namespace spectrel::Surroundings

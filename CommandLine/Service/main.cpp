@@ -35,51 +35,70 @@ int fail(const std::string& line)
     return ExitFailed;
 }
 
-std::unique_ptr<Baseband> makeBaseband(const SimulateOptions& options, std::string& reason)
+Result<std::unique_ptr<Baseband>> makeBaseband(const SimulateOptions& options)
 {
     auto baseband = makeBaseband(*options.technology, options.scene, options.seed);
     if (!baseband)
-        reason = "there is no simulated baseband of technology " + std::string(technologyName(*options.technology));
+        return Failure {
+            "there is no simulated baseband of technology " + std::string(technologyName(*options.technology))};
     return baseband;
 }
 
-std::unique_ptr<LogSource> makeSource(
-    ServiceOptions& options, QtRunLoop& runLoop, const Clock& clock, std::string& reason)
+using MadeSource = Result<std::unique_ptr<LogSource>>;
+
+MadeSource relay(const ServiceOptions& options, QtRunLoop& runLoop)
 {
-    if (!options.relay.empty()) {
-        auto input = openStreamInput(options.relay, reason);
-        return input ? std::make_unique<RelaySource>(
-                   runLoop, std::move(input), options.technology, [&runLoop] { runLoop.quit(ExitFailed); })
-                     : nullptr;
-    }
-    if (options.modem) {
-        auto service = ModemManagerService::open(reason);
-        return service ? std::make_unique<ModemSource>(runLoop, clock, std::move(service), *options.modem) : nullptr;
-    }
+    auto input = openStreamInput(options.relay);
+    if (!input)
+        return input.failure();
+    return std::make_unique<RelaySource>(
+        runLoop, *std::move(input), options.technology, [&runLoop] { runLoop.quit(ExitFailed); });
+}
+
+MadeSource listenToModem(const std::string& wish, QtRunLoop& runLoop, const Clock& clock)
+{
+    auto service = ModemManagerService::open();
+    if (!service)
+        return service.failure();
+    return std::make_unique<ModemSource>(runLoop, clock, *std::move(service), wish);
+}
+
+MadeSource simulate(const SimulateOptions& options, QtRunLoop& runLoop, const Clock& clock)
+{
+    auto baseband = makeBaseband(options);
+    if (!baseband)
+        return baseband.failure();
+    return std::make_unique<SimulatorSource>(runLoop, clock, *std::move(baseband), options.rate);
+}
+
+MadeSource makeSource(ServiceOptions& options, QtRunLoop& runLoop, const Clock& clock)
+{
+    if (!options.relay.empty())
+        return relay(options, runLoop);
+    if (options.modem)
+        return listenToModem(*options.modem, runLoop, clock);
+    if (options.simulate.technology)
+        return simulate(options.simulate, runLoop, clock);
     options.replay.technology = options.technology;
-    if (!options.simulate.technology)
-        return ReplaySource::open(runLoop, clock, std::move(options.replay), reason);
-    auto baseband = makeBaseband(options.simulate, reason);
-    return baseband ? std::make_unique<SimulatorSource>(runLoop, clock, std::move(baseband), options.simulate.rate)
-                    : nullptr;
+    return ReplaySource::open(runLoop, clock, std::move(options.replay));
 }
 
 int writeRecording(const SimulateOptions& options)
 {
-    std::string reason;
-    const auto baseband = makeBaseband(options, reason);
+    const auto baseband = makeBaseband(options);
     if (!baseband)
-        return fail(reason);
-    return writeSimulatedRecording(*baseband, options.file, options.duration, reason)
-        ? 0
-        : fail(options.file + ": " + reason);
+        return fail(baseband.failure().text);
+    const auto written = writeSimulatedRecording(**baseband, options.file, options.duration);
+    return written ? 0 : fail(written.failure().of(options.file).text);
 }
 
 /// Serves the socket that the service manager has passed on, if it has.
-bool adoptSocket(ServiceManager& manager, SocketMessagePorts& ports, std::string& reason)
+Outcome adoptSocket(ServiceManager& manager, SocketMessagePorts& ports)
 {
-    FileDescriptor socket = manager.takeListeningSocket(reason);
-    return socket ? ports.adopt(TelephonyProtocol::ServicePort, std::move(socket), reason) : reason.empty();
+    auto socket = manager.takeListeningSocket();
+    if (!socket)
+        return socket.failure();
+    return *socket ? ports.adopt(TelephonyProtocol::ServicePort, *std::move(socket)) : Done();
 }
 
 bool writeReady(int descriptor)
@@ -126,27 +145,27 @@ int serve(ServiceOptions& options)
     QtRunLoop runLoop;
     QtClock clock;
     Clock::install(&clock);
-    std::string reason;
-    if (!SocketMessagePorts::prepareDirectory(Places::portDirectory(), TelephonyProtocol::ServicePort, reason))
-        return fail("the message ports' folder cannot be had: " + reason);
-    SocketMessagePorts ports(Places::portDirectory());
-    if (!adoptSocket(manager, ports, reason))
-        return fail(reason);
-    const auto source = makeSource(options, runLoop, clock, reason);
-    if (!source)
-        return fail(reason);
-    TelephonyService service(runLoop, ports, *source);
+    const std::string folder = Places::portDirectory();
+    if (const auto prepared = SocketMessagePorts::prepareDirectory(folder, TelephonyProtocol::ServicePort); !prepared)
+        return fail(prepared.failure().of("the message ports' folder cannot be had").text);
+    SocketMessagePorts ports(folder);
+    if (const auto adopted = adoptSocket(manager, ports); !adopted)
+        return fail(adopted.failure().text);
+    const auto made = makeSource(options, runLoop, clock);
+    if (!made)
+        return fail(made.failure().text);
+    LogSource& source = **made;
+    TelephonyService service(runLoop, ports, source);
     if (!service.start())
-        return fail(
-            "cannot take the telephony service's port in " + Places::portDirectory() + ": another service runs there");
-    StatusReport report(clock, service, *source);
+        return fail("cannot take the telephony service's port in " + folder + ": another service runs there");
+    StatusReport report(clock, service, source);
     const TerminationSignals terminationSignals(
         [&](int signal) { signal == SIGUSR1 ? printStatus(report) : runLoop.quit(); }, {SIGUSR1});
     std::optional<RegularReport> regularReport;
     if (options.statusInterval)
         regularReport.emplace(runLoop, report, *options.statusInterval);
     ManagerStatus managerStatus(runLoop, manager, service, report);
-    printServiceLine("serving in " + Places::portDirectory() + ": " + source->status());
+    printServiceLine("serving in " + folder + ": " + source.status());
     if (!writeReady(options.readyDescriptor))
         return fail("--ready-fd: the descriptor cannot be written");
     managerStatus.notifyManager("READY=1\n");

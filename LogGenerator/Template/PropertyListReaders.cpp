@@ -1,6 +1,7 @@
 #include "LogGenerator/Template/PropertyListReaders.h"
 
 #include "Platform/SystemLog.h"
+#include "Records/Frame.h"
 #include "Records/TelephonyConstants.h"
 #include "Values/Dictionary.h"
 #include "Values/PropertyList/PropertyList.h"
@@ -22,7 +23,7 @@ const std::optional<Value>& parsedPayload(RecordView record)
 {
     static Bytes latest;
     static std::optional<Value> parsed;
-    const ByteView payload = record.payload();
+    const ByteView payload = recordPayload(record);
     if (!std::ranges::equal(payload, latest)) {
         parsed = parsePropertyList(payload);
         latest.assign(payload.begin(), payload.end());

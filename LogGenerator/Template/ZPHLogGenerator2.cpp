@@ -40,7 +40,7 @@ void ZPHLogGenerator2::updateWithData(ByteView data)
         return;
     const RecordView record(recordInMessage(data));
     const std::uint8_t type = record.u8(0);
-    if (type != OrdinaryRecord && type != ExtraRecord) {
+    if (!isRecordType(type)) {
         SPECTREL_LOG(Priority::Error, InvalidTypeLine, type);
         return;
     }

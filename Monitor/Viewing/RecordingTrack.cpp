@@ -42,10 +42,12 @@ void RecordingTrack::measure(RecordingReader& reader)
 
 bool RecordingTrack::rewind(std::string& reason)
 {
-    auto reader = openRecording(_path, reason);
-    if (!reader)
+    auto opened = openRecording(_path);
+    if (!opened) {
+        reason = opened.failure().text;
         return false;
-    _reader = std::move(reader);
+    }
+    _reader = *std::move(opened);
     _taken = 0;
     _lastTime = {};
     readNext();

@@ -20,9 +20,12 @@ std::unique_ptr<ViewedFile> ViewedFile::open(
         reason = "not a plain file: it could not be read again for going back";
         return nullptr;
     }
-    auto reader = openRecording(path, reason);
-    if (!reader)
+    auto opened = openRecording(path);
+    if (!opened) {
+        reason = opened.failure().text;
         return nullptr;
+    }
+    auto reader = *std::move(opened);
     std::unique_ptr<ViewedFile> file(new ViewedFile(deviceClock));
     if ((file->_snapshot = reader->snapshot())) {
         const std::string* made = (*file->_snapshot)["Timestamp"].string();

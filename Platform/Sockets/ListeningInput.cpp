@@ -26,47 +26,40 @@ constexpr int Backlog = 8; // writers that wait for the current one's end
 constexpr int AcceptPause = 100; // milliseconds without new writers when the process has no descriptor to spare
 constexpr const char* ThisMachine = "127.0.0.1";
 
-FileDescriptor failed(std::string& reason, const char* text = nullptr)
-{
-    reason = text ? text : std::strerror(errno);
-    return {};
-}
-
-/// Removes a socket that nobody listens on any more. False, with `reason`, when something else is there.
-bool makeWay(const sockaddr_un& address, std::string& reason)
+/// Removes a socket that nobody listens on any more. Fails when something else is there.
+Outcome makeWay(const sockaddr_un& address)
 {
     struct stat status { };
     if (::lstat(address.sun_path, &status) != 0)
-        return true;
-    if (!S_ISSOCK(status.st_mode)) {
-        reason = "something else is there already";
-        return false;
-    }
+        return Done();
+    if (!S_ISSOCK(status.st_mode))
+        return Failure {"something else is there already", Failure::Code::Exists};
     const FileDescriptor probe(::socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0));
     const bool isServed = ::connect(probe.number(), reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0
         || errno != ECONNREFUSED;
     if (isServed)
-        reason = "another program listens there";
-    else
-        ::unlink(address.sun_path);
-    return !isServed;
+        return Failure {"another program listens there", Failure::Code::Exists};
+    ::unlink(address.sun_path);
+    return Done();
 }
 
-FileDescriptor listenAtPath(const std::string& path, std::string& reason)
+Result<FileDescriptor> listenAtPath(const std::string& path)
 {
     sockaddr_un address = {};
     address.sun_family = AF_UNIX;
     if (path.empty() || path.size() >= sizeof address.sun_path)
-        return failed(reason, "a socket's path has 1 to 107 bytes");
+        return Failure {"a socket's path has 1 to 107 bytes"};
     std::memcpy(address.sun_path, path.data(), path.size());
-    if (!makeWay(address, reason))
-        return {};
+    if (const auto way = makeWay(address); !way)
+        return way.failure();
     FileDescriptor socket(::socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0));
     const mode_t before = ::umask(0177); // other users do not even get to connect
     const bool isBound = socket && ::bind(socket.number(), reinterpret_cast<sockaddr*>(&address), sizeof address) == 0
         && ::listen(socket.number(), Backlog) == 0;
     ::umask(before);
-    return isBound ? std::move(socket) : failed(reason);
+    if (!isBound)
+        return Failure::ofSystem();
+    return socket;
 }
 
 struct HostAndPort {
@@ -85,29 +78,29 @@ HostAndPort splitAddress(const std::string& address)
     return {host.empty() ? ThisMachine : host, address.substr(colon + 1)};
 }
 
-FileDescriptor listenAtAddress(const addrinfo& address, std::string& reason)
+Result<FileDescriptor> listenAtAddress(const addrinfo& address)
 {
     FileDescriptor socket(::socket(address.ai_family, SOCK_STREAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0));
     const int yes = 1;
     if (!socket || ::setsockopt(socket.number(), SOL_SOCKET, SO_REUSEADDR, &yes, sizeof yes) != 0
         || ::bind(socket.number(), address.ai_addr, address.ai_addrlen) != 0 || ::listen(socket.number(), Backlog) != 0)
-        return failed(reason);
+        return Failure::ofSystem();
     return socket;
 }
 
-FileDescriptor listenAtHost(const HostAndPort& place, std::string& reason)
+Result<FileDescriptor> listenAtHost(const HostAndPort& place)
 {
     if (place.port.empty() || place.port.find_first_not_of("0123456789") != std::string::npos || place.port.size() > 5
         || std::stoi(place.port) > 65535)
-        return failed(reason, "a port is a number from 0 to 65535, as in tcp:127.0.0.1:4000");
+        return Failure {"a port is a number from 0 to 65535, as in tcp:127.0.0.1:4000"};
     addrinfo hints = {};
     hints.ai_socktype = SOCK_STREAM;
     hints.ai_flags = AI_PASSIVE | AI_NUMERICSERV;
     addrinfo* found = nullptr;
     if (const int error = ::getaddrinfo(place.host.c_str(), place.port.c_str(), &hints, &found); error != 0)
-        return failed(reason, ::gai_strerror(error));
+        return Failure {::gai_strerror(error)};
     const std::unique_ptr<addrinfo, decltype(&::freeaddrinfo)> owned(found, &::freeaddrinfo);
-    return listenAtAddress(*found, reason);
+    return listenAtAddress(*found);
 }
 
 /// "127.0.0.1:4000", with the port that the system chose.
@@ -141,21 +134,21 @@ void watchForVanishing(const FileDescriptor& socket)
 
 } // namespace
 
-std::unique_ptr<ListeningInput> ListeningInput::openUnix(const std::string& path, std::string& reason)
+Result<std::unique_ptr<StreamInput>> ListeningInput::openUnix(const std::string& path)
 {
-    FileDescriptor socket = listenAtPath(path, reason);
+    auto socket = listenAtPath(path);
     if (!socket)
-        return nullptr;
-    return std::unique_ptr<ListeningInput>(new ListeningInput("unix:" + path, path, std::move(socket)));
+        return socket.failure();
+    return std::unique_ptr<StreamInput>(new ListeningInput("unix:" + path, path, *std::move(socket)));
 }
 
-std::unique_ptr<ListeningInput> ListeningInput::openTCP(const std::string& address, std::string& reason)
+Result<std::unique_ptr<StreamInput>> ListeningInput::openTCP(const std::string& address)
 {
-    FileDescriptor socket = listenAtHost(splitAddress(address), reason);
+    auto socket = listenAtHost(splitAddress(address));
     if (!socket)
-        return nullptr;
-    std::string name = "tcp:" + addressOf(socket);
-    return std::unique_ptr<ListeningInput>(new ListeningInput(std::move(name), "", std::move(socket)));
+        return socket.failure();
+    std::string name = "tcp:" + addressOf(*socket);
+    return std::unique_ptr<StreamInput>(new ListeningInput(std::move(name), "", *std::move(socket)));
 }
 
 ListeningInput::ListeningInput(std::string name, std::string path, FileDescriptor socket)

@@ -2,6 +2,7 @@
 
 #include "Platform/Sockets/WriterFeed.h"
 #include "Platform/StreamInput.h"
+#include "Values/Result.h"
 
 #include <memory>
 #include <string>
@@ -14,9 +15,9 @@ namespace spectrel {
 class ListeningInput final : public StreamInput {
 public:
     /// Listens at the path for this user's writers; a socket that a dead process left there is removed.
-    static std::unique_ptr<ListeningInput> openUnix(const std::string& path, std::string& reason);
+    static Result<std::unique_ptr<StreamInput>> openUnix(const std::string& path);
     /// "HOST:PORT", "[IPv6]:PORT" or "PORT", which listens on this machine alone.
-    static std::unique_ptr<ListeningInput> openTCP(const std::string& address, std::string& reason);
+    static Result<std::unique_ptr<StreamInput>> openTCP(const std::string& address);
     ~ListeningInput() override;
 
     const std::string& name() const override

@@ -12,22 +12,22 @@ namespace {
 constexpr std::string_view UnixPrefix = "unix:";
 constexpr std::string_view TCPPrefix = "tcp:";
 
-std::unique_ptr<StreamInput> openByKind(const std::string& address, std::string& reason)
+Result<std::unique_ptr<StreamInput>> openByKind(const std::string& address)
 {
     if (address.starts_with(UnixPrefix))
-        return ListeningInput::openUnix(address.substr(UnixPrefix.size()), reason);
+        return ListeningInput::openUnix(address.substr(UnixPrefix.size()));
     if (address.starts_with(TCPPrefix))
-        return ListeningInput::openTCP(address.substr(TCPPrefix.size()), reason);
-    return PipeInput::open(address, reason);
+        return ListeningInput::openTCP(address.substr(TCPPrefix.size()));
+    return PipeInput::open(address);
 }
 
 } // namespace
 
-std::unique_ptr<StreamInput> openStreamInput(const std::string& address, std::string& reason)
+Result<std::unique_ptr<StreamInput>> openStreamInput(const std::string& address)
 {
-    auto input = openByKind(address, reason);
+    auto input = openByKind(address);
     if (!input)
-        reason = (address == "-" ? "standard input" : address) + ": " + reason;
+        return input.failure().of(address == "-" ? "standard input" : address);
     return input;
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Platform/StreamInput.h"
+#include "Values/Result.h"
 
 #include <memory>
 #include <string>
@@ -9,7 +10,7 @@ namespace spectrel {
 
 /// The input at an address: "-" (standard input), the path of a FIFO or a device, "unix:PATH" (listens on a socket of
 /// that path, for this user), or "tcp:HOST:PORT" (listens; "tcp:PORT" on this machine alone, port 0 on any free one).
-/// Null, with `reason` naming the address, when it cannot be had.
-std::unique_ptr<StreamInput> openStreamInput(const std::string& address, std::string& reason);
+/// A failure names the address.
+Result<std::unique_ptr<StreamInput>> openStreamInput(const std::string& address);
 
 } // namespace spectrel

@@ -3,7 +3,6 @@
 #include <QTimer>
 
 #include <cerrno>
-#include <cstring>
 #include <fcntl.h>
 #include <sys/stat.h>
 #include <unistd.h>
@@ -23,34 +22,33 @@ FileDescriptor openPath(const std::string& path)
                                                 : ::open(path.c_str(), O_RDONLY | O_NONBLOCK | O_CLOEXEC));
 }
 
-/// Why a thing of that kind cannot be relayed; empty when it can.
-std::string objectionTo(const std::string& path, int descriptor, const struct stat& status)
+/// Whether a thing of that kind can be relayed.
+Outcome checkKind(const std::string& path, int descriptor, const struct stat& status)
 {
     if (S_ISDIR(status.st_mode))
-        return std::strerror(EISDIR);
-    if (path == StandardInput)
-        return ::isatty(descriptor) ? "a terminal, not a stream of log messages" : "";
-    if (S_ISREG(status.st_mode))
-        return "a file, which --replay plays";
-    return "";
+        return Failure::ofSystem(EISDIR);
+    if (path == StandardInput && ::isatty(descriptor))
+        return Failure {"a terminal, not a stream of log messages", Failure::Code::Refused};
+    if (path != StandardInput && S_ISREG(status.st_mode))
+        return Failure {"a file, which --replay plays", Failure::Code::Refused};
+    return Done();
 }
 
 } // namespace
 
-std::unique_ptr<PipeInput> PipeInput::open(const std::string& path, std::string& reason)
+Result<std::unique_ptr<StreamInput>> PipeInput::open(const std::string& path)
 {
     FileDescriptor descriptor = openPath(path);
     struct stat status { };
     if (!descriptor || ::fstat(descriptor.number(), &status) != 0) {
-        // A socket cannot be opened.
-        reason = errno == ENXIO ? "a socket; to listen on one name it unix:" + path : std::strerror(errno);
-        return nullptr;
+        if (errno == ENXIO) // a socket cannot be opened
+            return Failure {"a socket; to listen on one name it unix:" + path, Failure::Code::Refused};
+        return Failure::ofSystem();
     }
-    reason = objectionTo(path, descriptor.number(), status);
-    if (!reason.empty())
-        return nullptr;
+    if (const auto kind = checkKind(path, descriptor.number(), status); !kind)
+        return kind.failure();
     const bool isFifo = path != StandardInput && S_ISFIFO(status.st_mode);
-    return std::unique_ptr<PipeInput>(new PipeInput(path, std::move(descriptor), isFifo));
+    return std::unique_ptr<StreamInput>(new PipeInput(path, std::move(descriptor), isFifo));
 }
 
 PipeInput::PipeInput(std::string path, FileDescriptor descriptor, bool isFifo)
@@ -72,8 +70,12 @@ void PipeInput::end(const std::string& reason)
 {
     const bool hadWriter = _feed.hasWriter();
     std::string told = reason;
-    if (!openAnew(told))
+    if (!_isFifo) {
         _feed.close();
+    } else if (const auto opened = openAnew(); !opened) {
+        told = opened.failure().text;
+        _feed.close();
+    }
     if (hadWriter || !told.empty())
         _listener->writerEnded(told);
 }
@@ -84,27 +86,25 @@ void PipeInput::dropWriter()
     _feed.close();
     if (_isFifo) {
         QTimer::singleShot(RestAfterDropping, &_later, [this] {
-            std::string reason;
-            if (!openAnew(reason))
-                _listener->writerEnded(reason);
+            if (!_isFifo)
+                return; // has failed to open, and said so
+            if (const auto opened = openAnew(); !opened)
+                _listener->writerEnded(opened.failure().text);
         });
     }
 }
 
 /// A FIFO's old end stays open until the new one is: a writer that has come in between must not find it without reader.
 /// A new end does not tell of the former writer's hanging up again and again.
-bool PipeInput::openAnew(std::string& reason)
+Outcome PipeInput::openAnew()
 {
-    if (!_isFifo)
-        return false;
     FileDescriptor next = openPath(_path);
-    if (next) {
-        _feed.open(std::move(next), *_listener, WriterFeed::Coming::WithFirstBytes);
-        return true;
+    if (!next) {
+        _isFifo = false;
+        return Failure::ofSystem().of("the FIFO cannot be opened again");
     }
-    reason = "the FIFO cannot be opened again: " + std::string(std::strerror(errno));
-    _isFifo = false;
-    return false;
+    _feed.open(std::move(next), *_listener, WriterFeed::Coming::WithFirstBytes);
+    return Done();
 }
 
 } // namespace spectrel

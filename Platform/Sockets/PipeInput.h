@@ -2,6 +2,7 @@
 
 #include "Platform/Sockets/WriterFeed.h"
 #include "Platform/StreamInput.h"
+#include "Values/Result.h"
 
 #include <QObject>
 
@@ -13,8 +14,8 @@ namespace spectrel {
 /// Standard input, a FIFO or a device. A FIFO is opened anew when its last writer has closed it.
 class PipeInput final : public StreamInput {
 public:
-    /// Null, with `reason`, when it cannot be opened or is of another kind. "-" is standard input.
-    static std::unique_ptr<PipeInput> open(const std::string& path, std::string& reason);
+    /// Fails when it cannot be opened or is of another kind. "-" is standard input.
+    static Result<std::unique_ptr<StreamInput>> open(const std::string& path);
 
     const std::string& name() const override
     {
@@ -34,7 +35,7 @@ public:
 private:
     PipeInput(std::string path, FileDescriptor descriptor, bool isFifo);
     void end(const std::string& reason);
-    bool openAnew(std::string& reason);
+    Outcome openAnew();
 
     std::string _path;
     std::string _name;

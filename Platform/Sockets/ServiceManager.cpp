@@ -7,6 +7,7 @@
 #include <sys/socket.h>
 #include <sys/un.h>
 #include <unistd.h>
+#include <utility>
 
 namespace spectrel {
 
@@ -61,17 +62,17 @@ void ServiceManager::notify(const std::string& state) const
     }
 }
 
-FileDescriptor ServiceManager::takeListeningSocket(std::string& reason)
+Result<FileDescriptor> ServiceManager::takeListeningSocket()
 {
-    if (_passedDescriptors == 0)
-        return {};
+    const int count = std::exchange(_passedDescriptors, 0);
+    if (count == 0)
+        return FileDescriptor();
     FileDescriptor socket(FirstDescriptor);
-    if (_passedDescriptors > 1)
-        reason = "the service manager passed " + std::to_string(_passedDescriptors) + " sockets instead of one";
-    else if (option(socket.number(), SO_TYPE) != SOCK_SEQPACKET || option(socket.number(), SO_ACCEPTCONN) == 0)
-        reason = "the service manager passed something else than a listening socket of sequential packets";
-    _passedDescriptors = 0;
-    return reason.empty() ? std::move(socket) : FileDescriptor();
+    if (count > 1)
+        return Failure {"the service manager passed " + std::to_string(count) + " sockets instead of one"};
+    if (option(socket.number(), SO_TYPE) != SOCK_SEQPACKET || option(socket.number(), SO_ACCEPTCONN) == 0)
+        return Failure {"the service manager passed something else than a listening socket of sequential packets"};
+    return socket;
 }
 
 } // namespace spectrel

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Platform/Sockets/FileDescriptor.h"
+#include "Values/Result.h"
 
 #include <optional>
 #include <string>
@@ -21,9 +22,9 @@ public:
     }
     /// Sends such as "READY=1\nSTATUS=two clients"; nothing without a listener. Never waits.
     void notify(const std::string& state) const;
-    /// The listening socket of sequential packets that was passed on. Empty, with `reason`, when something else was;
-    /// empty without a reason when nothing was.
-    FileDescriptor takeListeningSocket(std::string& reason);
+    /// The listening socket of sequential packets that was passed on; empty when nothing was. Fails when something else
+    /// was.
+    Result<FileDescriptor> takeListeningSocket();
 
 private:
     std::string _address; // of the notification socket; an abstract one starts with "@"

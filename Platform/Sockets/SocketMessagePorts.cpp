@@ -46,14 +46,13 @@ SocketMessagePorts::SocketMessagePorts(std::string directory)
 {
 }
 
-bool SocketMessagePorts::prepareDirectory(const std::string& directory, std::string_view name, std::string& reason)
+Outcome SocketMessagePorts::prepareDirectory(const std::string& directory, std::string_view name)
 {
-    if (!makePrivateDirectory(directory, reason))
-        return false;
-    if (portAddress(directory, name))
-        return true;
-    reason = directory + ": with a port's name the path is longer than 107 bytes";
-    return false;
+    if (auto made = makePrivateDirectory(directory); !made)
+        return made;
+    if (!portAddress(directory, name))
+        return Failure {directory + ": with a port's name the path is longer than 107 bytes"};
+    return Done();
 }
 
 MessagePorts::LocalResult SocketMessagePorts::createLocal(
@@ -65,11 +64,12 @@ MessagePorts::LocalResult SocketMessagePorts::createLocal(
             return {std::move(existing), true};
     }
     const auto address = portAddress(_directory, name);
-    std::string reason;
-    if (address && !makePrivateDirectory(_directory, reason))
-        SPECTREL_LOG(Priority::Error, "Message ports: %s", reason.c_str());
-    if (!address || !reason.empty())
+    if (!address)
         return {};
+    if (const auto made = makePrivateDirectory(_directory); !made) {
+        SPECTREL_LOG(Priority::Error, "Message ports: %s", made.failure().text.c_str());
+        return {};
+    }
     auto lock = NameLock::take(_directory, name);
     if (!lock)
         return {};
@@ -84,20 +84,18 @@ MessagePorts::LocalResult SocketMessagePorts::createLocal(
     return {std::move(port), false};
 }
 
-bool SocketMessagePorts::adopt(std::string_view name, FileDescriptor socket, std::string& reason)
+Outcome SocketMessagePorts::adopt(std::string_view name, FileDescriptor socket)
 {
     const auto expected = portAddress(_directory, name);
     sockaddr_un address = {};
     socklen_t length = sizeof address;
     if (!expected || ::getsockname(socket.number(), reinterpret_cast<sockaddr*>(&address), &length) != 0
-        || std::strncmp(address.sun_path, expected->sun_path, sizeof address.sun_path) != 0) {
-        reason = "the socket passed on listens at " + std::string(address.sun_path) + ", clients look for it at "
-            + (expected ? expected->sun_path : _directory);
-        return false;
-    }
+        || std::strncmp(address.sun_path, expected->sun_path, sizeof address.sun_path) != 0)
+        return Failure {"the socket passed on listens at " + std::string(address.sun_path) + ", clients look for it at "
+            + (expected ? expected->sun_path : _directory)};
     ::fcntl(socket.number(), F_SETFL, ::fcntl(socket.number(), F_GETFL) | O_NONBLOCK);
     _adopted.insert_or_assign(std::string(name), std::move(socket));
-    return true;
+    return Done();
 }
 
 std::shared_ptr<RemoteMessagePort> SocketMessagePorts::createRemote(std::string_view name)

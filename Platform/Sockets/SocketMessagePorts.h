@@ -2,6 +2,7 @@
 
 #include "Platform/MessagePort.h"
 #include "Platform/Sockets/FileDescriptor.h"
+#include "Values/Result.h"
 
 #include <map>
 #include <memory>
@@ -16,14 +17,14 @@ class SocketMessagePorts final : public MessagePorts {
 public:
     /// Nothing is made or checked yet.
     explicit SocketMessagePorts(std::string directory);
-    /// Makes the folder at need. False, with `reason`, when it cannot be had or a port of that name would not fit.
-    static bool prepareDirectory(const std::string& directory, std::string_view name, std::string& reason);
+    /// Makes the folder at need. Fails when it cannot be had or a port of that name would not fit.
+    static Outcome prepareDirectory(const std::string& directory, std::string_view name);
 
     /// Makes the folder at need. Null and logged when it belongs to somebody else or the name cannot be used.
     LocalResult createLocal(std::string_view name, LocalMessagePort::MessageHandler handler) override;
-    /// Gives the listening socket of a name that was made elsewhere: `createLocal` of the name serves it. False, with
-    /// `reason`, when it does not listen where the name is looked for.
-    bool adopt(std::string_view name, FileDescriptor socket, std::string& reason);
+    /// Gives the listening socket of a name that was made elsewhere: `createLocal` of the name serves it. Fails when
+    /// it does not listen where the name is looked for.
+    Outcome adopt(std::string_view name, FileDescriptor socket);
     /// Null when nobody, or another user, serves the name.
     std::shared_ptr<RemoteMessagePort> createRemote(std::string_view name) override;
 

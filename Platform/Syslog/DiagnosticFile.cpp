@@ -8,10 +8,12 @@ namespace {
 constexpr int DebugPriority = 7; // LOG_DEBUG
 }
 
-std::unique_ptr<DiagnosticFile> DiagnosticFile::create(const std::string& path, std::string& reason)
+Result<std::unique_ptr<DiagnosticFile>> DiagnosticFile::create(const std::string& path)
 {
-    auto file = FileLog::create(path, FileLog::Writing::EachLine, reason);
-    return file ? std::unique_ptr<DiagnosticFile>(new DiagnosticFile(std::move(file))) : nullptr;
+    auto file = FileLog::create(path, FileLog::Writing::EachLine);
+    if (!file)
+        return file.failure();
+    return std::unique_ptr<DiagnosticFile>(new DiagnosticFile(*std::move(file)));
 }
 
 DiagnosticFile::DiagnosticFile(std::unique_ptr<FileLog> file)

@@ -2,6 +2,7 @@
 
 #include "Platform/DiagnosticLog.h"
 #include "Platform/Syslog/FileLog.h"
+#include "Values/Result.h"
 
 #include <memory>
 #include <string>
@@ -12,8 +13,8 @@ namespace spectrel {
 /// ("<7>TEXT") and in the file at once. Installs itself for as long as it lives.
 class DiagnosticFile final : public DiagnosticLog {
 public:
-    /// Null when the file cannot be made, with `reason` telling why.
-    static std::unique_ptr<DiagnosticFile> create(const std::string& path, std::string& reason);
+    /// An existing file is replaced.
+    static Result<std::unique_ptr<DiagnosticFile>> create(const std::string& path);
     ~DiagnosticFile() override;
 
     void write(std::string_view line) override;

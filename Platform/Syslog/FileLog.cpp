@@ -1,8 +1,5 @@
 #include "Platform/Syslog/FileLog.h"
 
-#include <cerrno>
-#include <cstring>
-
 namespace spectrel {
 
 namespace {
@@ -48,12 +45,11 @@ void appendEscaped(std::string& line, char character)
 
 } // namespace
 
-std::unique_ptr<FileLog> FileLog::create(const std::string& path, Writing writing, std::string& reason)
+Result<std::unique_ptr<FileLog>> FileLog::create(const std::string& path, Writing writing)
 {
     if (std::FILE* const file = std::fopen(path.c_str(), "we"))
         return std::unique_ptr<FileLog>(new FileLog(file, writing));
-    reason = std::strerror(errno);
-    return nullptr;
+    return Failure::ofSystem();
 }
 
 void FileLog::write(int priority, std::string_view text)

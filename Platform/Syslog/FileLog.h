@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Platform/SystemLog.h"
+#include "Values/Result.h"
 
 #include <cstdint>
 #include <cstdio>
@@ -18,8 +19,8 @@ public:
     /// Whether each line is in the file at once, or whenever the buffer is full and at the end.
     enum class Writing : std::uint8_t { EachLine, Buffered };
 
-    /// Null when the file cannot be made, with `reason` telling why. An existing file is replaced.
-    static std::unique_ptr<FileLog> create(const std::string& path, Writing writing, std::string& reason);
+    /// An existing file is replaced.
+    static Result<std::unique_ptr<FileLog>> create(const std::string& path, Writing writing);
 
     void write(int priority, std::string_view text) override;
     /// False when a line could not be written since the log began.

@@ -1,7 +1,6 @@
 #include "Records/Capture/CaptureOutput.h"
 
 #include <cerrno>
-#include <cstring>
 #include <fcntl.h>
 #include <filesystem>
 #include <sys/stat.h>
@@ -71,7 +70,7 @@ CaptureOutput::~CaptureOutput()
         ::unlink(_hidden.c_str());
 }
 
-std::optional<CaptureOutput> CaptureOutput::open(const std::string& path, IfThere ifThere, std::string& reason)
+Result<CaptureOutput> CaptureOutput::open(const std::string& path, IfThere ifThere)
 {
     std::string hidden;
     int file = -1;
@@ -84,24 +83,21 @@ std::optional<CaptureOutput> CaptureOutput::open(const std::string& path, IfTher
         file = ::open(hidden.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0666);
     }
     std::FILE* const stream = file < 0 ? nullptr : ::fdopen(file, "wb");
-    if (!stream) {
-        reason = std::strerror(errno);
-        return std::nullopt;
-    }
+    if (!stream)
+        return Failure::ofSystem();
     return CaptureOutput(stream, path, std::move(hidden), ifThere);
 }
 
-bool CaptureOutput::publish(std::string& reason)
+Outcome CaptureOutput::publish()
 {
     if (_hidden.empty())
-        return true;
+        return Done();
     const bool named =
         _ifThere == IfThere::Overwrite ? ::rename(_hidden.c_str(), _path.c_str()) == 0 : renamedToFree(_hidden, _path);
-    if (named)
-        _hidden.clear();
-    else
-        reason = errno == EEXIST ? "" : std::strerror(errno);
-    return named;
+    if (!named)
+        return Failure::ofSystem();
+    _hidden.clear();
+    return Done();
 }
 
 } // namespace spectrel

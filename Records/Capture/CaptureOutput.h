@@ -1,7 +1,8 @@
 #pragma once
 
+#include "Values/Result.h"
+
 #include <cstdio>
-#include <optional>
 #include <string>
 
 namespace spectrel {
@@ -14,8 +15,8 @@ class CaptureOutput {
 public:
     enum class IfThere { Overwrite, Refuse };
 
-    /// Opens the output; "-" is standard output. None on failure, with `reason`.
-    static std::optional<CaptureOutput> open(const std::string& path, IfThere ifThere, std::string& reason);
+    /// Opens the output; "-" is standard output.
+    static Result<CaptureOutput> open(const std::string& path, IfThere ifThere);
     CaptureOutput(CaptureOutput&& other) noexcept;
     CaptureOutput(const CaptureOutput&) = delete;
     CaptureOutput& operator=(const CaptureOutput&) = delete;
@@ -27,9 +28,8 @@ public:
     {
         return _stream;
     }
-    /// To be called when the head has been written. False with `reason`, which is empty when a file of the name is
-    /// there and must stay.
-    bool publish(std::string& reason);
+    /// To be called when the head has been written. Fails with `Exists` when a file of the name is there and must stay.
+    Outcome publish();
 
 private:
     CaptureOutput(std::FILE* stream, std::string path, std::string hidden, IfThere ifThere);

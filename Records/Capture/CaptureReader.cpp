@@ -120,15 +120,13 @@ bool startsCapture(ByteView firstBytes)
     return firstBytes.size() >= 4 && std::ranges::find(Magics, magicOf(firstBytes)) != Magics.end();
 }
 
-std::unique_ptr<RecordingReader> openCapture(RecordingFile file, std::string& reason)
+Result<std::unique_ptr<RecordingReader>> openCapture(RecordingFile file)
 {
     const bool isClassic = magicOf(file.peek()) != PcapngMagic;
     char error[PCAP_ERRBUF_SIZE] = "";
     Capture capture(pcap_fopen_offline(file.get(), error));
-    if (!capture) {
-        reason = error;
-        return nullptr;
-    }
+    if (!capture)
+        return Failure {error};
     file.release(); // the capture closes it
     return std::make_unique<CaptureReader>(std::move(capture), isClassic);
 }

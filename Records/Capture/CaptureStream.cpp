@@ -1,6 +1,7 @@
 #include "Records/Capture/CaptureStream.h"
 
 #include "Records/Capture/LinkTypes.h"
+#include "Records/Frame.h"
 #include "Values/Bytes.h"
 
 #include <algorithm>
@@ -13,17 +14,12 @@ namespace {
 
 constexpr std::size_t FileHeaderLength = 24;
 constexpr std::size_t PacketHeaderLength = 16;
-constexpr std::size_t LongestFrame = 5; // wrapper, type and length: what tells that a body is a log message
+/// What tells that a body is a log message.
+constexpr std::size_t LongestFrame = WrapperSize + RecordTypeSize + ItemLengthSize;
 constexpr std::size_t LeastEvidence = PacketHeaderLength + LongestFrame; // no place is confirmed by fewer bytes
 constexpr std::uint32_t Microseconds = 0xA1B2C3D4;
 constexpr std::uint32_t Nanoseconds = 0xA1B23C4D;
 constexpr std::array<std::uint8_t, 8> Version {2, 0, 4, 0, 0, 0, 0, 0}; // 2.4, and no time zone
-
-std::uint32_t littleEndian(ByteView bytes, std::size_t place)
-{
-    return bytes[place] | bytes[place + 1] << 8 | bytes[place + 2] << 16
-        | static_cast<std::uint32_t>(bytes[place + 3]) << 24;
-}
 
 std::uint32_t swapped(std::uint32_t number)
 {
@@ -54,7 +50,7 @@ bool startsCapture(ByteView bytes)
 
 std::uint32_t CaptureStream::u32(ByteView bytes, std::size_t place) const
 {
-    const std::uint32_t number = littleEndian(bytes, place);
+    const std::uint32_t number = RecordView(bytes).u32(place);
     return _isSwapped ? swapped(number) : number;
 }
 
@@ -76,8 +72,10 @@ bool CaptureStream::isLogMessage(ByteView body, std::size_t length) const
 {
     if (_technology == Technology::IFX)
         return body[0] == '<' && body[1] == '?' && body[2] == 'x' && body[3] == 'm' && body[4] == 'l';
-    const std::size_t type = body[0] == 0x81 ? 2 : 0;
-    return (body[type] == 0x01 || body[type] == 0xFF) && (body[type + 1] | body[type + 2] << 8) + type + 1 == length;
+    const RecordView bytes(body);
+    const std::size_t type = recordPlace(bytes, 0);
+    const std::size_t item = type + RecordTypeSize;
+    return isRecordType(bytes.u8(type)) && item + itemLength(bytes, item) == length;
 }
 
 CaptureStream::Verdict CaptureStream::judge(const StreamBuffer& buffer, std::size_t place) const
@@ -183,7 +181,7 @@ StreamCutter::Found CaptureStream::takePacket(StreamBuffer& buffer, RecordedMess
 StreamCutter::Found CaptureStream::takeHeader(StreamBuffer& buffer)
 {
     const ByteView bytes = buffer.bytes();
-    const std::uint32_t magic = littleEndian(bytes, 0);
+    const std::uint32_t magic = RecordView(bytes).u32(0);
     _isSwapped = !isMagic(magic);
     _hasNanoseconds = (_isSwapped ? swapped(magic) : magic) == Nanoseconds;
     const int linkType = static_cast<int>(u32(bytes, 20) & 0x0FFFFFFF); // the rest tells of check sums

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Records/Recording.h"
-#include "Records/StreamBuffer.h"
+#include "Records/StreamCutter.h"
 
 #include <cstddef>
 #include <cstdint>

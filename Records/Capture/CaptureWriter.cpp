@@ -98,39 +98,37 @@ bool CaptureWriter::flush()
     return !_isBroken || failed(std::strerror(errno));
 }
 
-std::unique_ptr<RecordingWriter> create(
-    const std::string& path, Technology technology, CaptureOutput::IfThere ifThere, std::string& reason)
+Result<std::unique_ptr<RecordingWriter>> create(
+    const std::string& path, Technology technology, CaptureOutput::IfThere ifThere)
 {
-    auto output = CaptureOutput::open(path, ifThere, reason);
+    auto output = CaptureOutput::open(path, ifThere);
     if (!output)
-        return nullptr;
+        return output.failure();
     auto buffer = std::make_unique_for_overwrite<char[]>(BufferSize);
     std::setvbuf(output->stream(), buffer.get(), _IOFBF, BufferSize);
     const auto link = std::ranges::find(LinkTypes, technology, &LinkType::technology);
     const Capture capture(pcap_open_dead(link->number, LargestMessage));
     Dumper dumper(pcap_dump_fopen(capture.get(), output->stream())); // closes the file when it fails
-    if (!dumper) {
-        reason = pcap_geterr(capture.get());
-        return nullptr;
-    }
+    if (!dumper)
+        return Failure {pcap_geterr(capture.get())};
     auto writer = std::make_unique<CaptureWriter>(std::move(buffer), std::move(dumper));
-    if (!writer->flush()) { // the head stands in the file from the start
-        reason = writer->error();
-        return nullptr;
-    }
-    return output->publish(reason) ? std::move(writer) : nullptr;
+    if (!writer->flush()) // the head stands in the file from the start
+        return Failure {writer->error()};
+    if (const auto published = output->publish(); !published)
+        return published.failure();
+    return writer;
 }
 
 } // namespace
 
-std::unique_ptr<RecordingWriter> createRecording(const std::string& path, Technology technology, std::string& reason)
+Result<std::unique_ptr<RecordingWriter>> createRecording(const std::string& path, Technology technology)
 {
-    return create(path, technology, CaptureOutput::IfThere::Overwrite, reason);
+    return create(path, technology, CaptureOutput::IfThere::Overwrite);
 }
 
-std::unique_ptr<RecordingWriter> createNewRecording(const std::string& path, Technology technology, std::string& reason)
+Result<std::unique_ptr<RecordingWriter>> createNewRecording(const std::string& path, Technology technology)
 {
-    return create(path, technology, CaptureOutput::IfThere::Refuse, reason);
+    return create(path, technology, CaptureOutput::IfThere::Refuse);
 }
 
 } // namespace spectrel

@@ -1,5 +1,6 @@
 #include "Records/DLF/DLFReader.h"
 
+#include "Records/Frame.h"
 #include "Records/MessageCutter.h"
 
 #include <algorithm>
@@ -8,15 +9,9 @@ namespace spectrel {
 
 namespace {
 
-constexpr std::size_t SmallestItem = 12; // length, code, timestamp
 constexpr std::size_t LongestFirstItem = 8191; // of a file without version report: rules text and most other files out
 constexpr unsigned VersionReportCode = 0x1FFD;
 constexpr std::size_t TimeOfWriting = 81; // in the version report: seconds since 1970, 32 bits
-
-unsigned u16(ByteView bytes, std::size_t place)
-{
-    return place + 2 <= bytes.size() ? bytes[place] | unsigned(bytes[place + 1]) << 8 : 0;
-}
 
 class DLFReader final : public RecordingReader {
 public:
@@ -44,7 +39,7 @@ private:
 
 DLFReader::DLFReader(Bytes bytes)
     : _bytes(std::move(bytes))
-    , _start(startsWithVersionReport(_bytes) ? u16(_bytes, 0) : 0)
+    , _start(startsWithVersionReport(_bytes) ? itemLength(ByteView(_bytes), 0) : 0)
     , _cutter(ByteView(_bytes).subspan(std::min(_start, _bytes.size())), MessageSequence::Beheaded)
 {
     if (_start > _bytes.size())
@@ -81,21 +76,21 @@ bool DLFReader::next(RecordedMessage& message)
 
 bool startsWithVersionReport(ByteView bytes)
 {
-    return u16(bytes, 0) >= SmallestItem && u16(bytes, 2) == VersionReportCode;
+    return itemLength(bytes, 0) >= ItemHeaderSize && itemCode(bytes, 0) == VersionReportCode;
 }
 
 Moment timeOfVersionReport(ByteView report)
 {
     if (report.size() < TimeOfWriting + 4)
         return {};
-    return Moment(std::chrono::seconds(u16(report, TimeOfWriting) | u16(report, TimeOfWriting + 2) << 16));
+    return Moment(std::chrono::seconds(RecordView(report).u32(TimeOfWriting)));
 }
 
 bool looksLikeDLF(ByteView bytes)
 {
-    const unsigned length = u16(bytes, 0);
+    const std::size_t length = itemLength(bytes, 0);
     return startsWithVersionReport(bytes)
-        || (length >= SmallestItem && length <= LongestFirstItem && length <= bytes.size());
+        || (length >= ItemHeaderSize && length <= LongestFirstItem && length <= bytes.size());
 }
 
 std::unique_ptr<RecordingReader> openDLF(Bytes bytes)

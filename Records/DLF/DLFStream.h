@@ -2,7 +2,7 @@
 
 #include "Records/MessageCutter.h"
 #include "Records/Recording.h"
-#include "Records/StreamBuffer.h"
+#include "Records/StreamCutter.h"
 
 #include <cstddef>
 #include <deque>

@@ -138,14 +138,12 @@ bool SnapshotReader::damaged(const std::string& place, const std::string& why)
 
 } // namespace
 
-std::unique_ptr<RecordingReader> openSnapshot(const Value& list, std::string& reason)
+Result<std::unique_ptr<RecordingReader>> openSnapshot(const Value& list)
 {
     const DictionaryRef& dictionary = list.dictionary();
     const ListRef entries = dictionary ? (*dictionary)["Data"].list() : nullptr;
-    if (!entries) {
-        reason = "a property list, but no snapshot: it has no list \"Data\"";
-        return nullptr;
-    }
+    if (!entries)
+        return Failure {"a property list, but no snapshot: it has no list \"Data\""};
     return std::make_unique<SnapshotReader>(dictionary, entries);
 }
 

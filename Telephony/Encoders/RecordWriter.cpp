@@ -54,9 +54,9 @@ RecordWriter& RecordWriter::bytes(ByteView bytes)
 
 Bytes RecordWriter::take()
 {
-    const std::size_t itemLength = _record.size() - 1;
-    _record[1] = static_cast<std::uint8_t>(itemLength);
-    _record[2] = static_cast<std::uint8_t>(itemLength >> 8);
+    const std::size_t itemLength = _record.size() - RecordTypeSize;
+    _record[RecordTypeSize] = static_cast<std::uint8_t>(itemLength);
+    _record[RecordTypeSize + 1] = static_cast<std::uint8_t>(itemLength >> 8);
     return std::move(_record);
 }
 

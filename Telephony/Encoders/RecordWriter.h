@@ -7,8 +7,7 @@
 
 namespace spectrel {
 
-/// Writes one log record as a baseband frames it: type byte (0x01, or 0xFF for the extra stream), 16-bit item length
-/// counted from itself, 16-bit log code, 8-byte timestamp, payload; little-endian throughout.
+/// Writes one log record as a baseband frames it (`Records/Frame.h`), without a wrapper.
 class RecordWriter {
 public:
     /// A code from 0xFF0000 on belongs to the extra stream.

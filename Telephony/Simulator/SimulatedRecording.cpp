@@ -2,23 +2,23 @@
 
 namespace spectrel {
 
-bool writeSimulatedRecording(
-    Baseband& baseband, const std::string& path, std::chrono::milliseconds duration, std::string& reason)
+Outcome writeSimulatedRecording(Baseband& baseband, const std::string& path, std::chrono::milliseconds duration)
 {
-    const auto writer = createRecording(path, baseband.technology(), reason);
-    if (!writer)
-        return false;
+    const auto created = createRecording(path, baseband.technology());
+    if (!created)
+        return created.failure();
+    RecordingWriter& writer = **created;
     bool isWritten = true;
     Moment now = SimulatedRecordingStart;
-    const auto write = [&](ByteView record) { isWritten = isWritten && writer->write(now, record); };
+    const auto write = [&](ByteView record) { isWritten = isWritten && writer.write(now, record); };
     baseband.greet(now, write);
     while (isWritten && now + Baseband::Step <= SimulatedRecordingStart + duration) {
         now += Baseband::Step;
         baseband.advance(now, write);
     }
-    isWritten = isWritten && writer->flush();
-    reason = writer->error();
-    return isWritten;
+    if (!isWritten || !writer.flush())
+        return Failure {writer.error()};
+    return Done();
 }
 
 } // namespace spectrel

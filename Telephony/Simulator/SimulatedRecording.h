@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Telephony/Simulator/Baseband.h"
+#include "Values/Result.h"
 
 #include <chrono>
 #include <string>
@@ -11,9 +12,7 @@ namespace spectrel {
 /// 2026-01-01 08:00:00 UTC.
 constexpr Moment SimulatedRecordingStart {std::chrono::seconds(1767254400)};
 
-/// Writes as much of the baseband's life into a capture file as `duration` says, without waiting. False when the file
-/// cannot be written, with `reason` saying why (without its name).
-bool writeSimulatedRecording(
-    Baseband& baseband, const std::string& path, std::chrono::milliseconds duration, std::string& reason);
+/// Writes as much of the baseband's life into a capture file as `duration` says, without waiting.
+Outcome writeSimulatedRecording(Baseband& baseband, const std::string& path, std::chrono::milliseconds duration);
 
 } // namespace spectrel

@@ -128,10 +128,11 @@ private:
         while (!_reader) {
             if (_file == _options.files.size() && !rewind())
                 return false;
-            std::string reason;
-            _reader = openRecording(_options.files[_file++], reason);
-            if (!_reader)
-                printServiceLine(_options.files[_file - 1] + ": " + reason);
+            const std::string& file = _options.files[_file++];
+            if (auto opened = openRecording(file))
+                _reader = *std::move(opened);
+            else
+                printServiceLine(opened.failure().of(file).text);
         }
         _isFirstOfFile = true;
         return true;
@@ -177,33 +178,25 @@ ReplaySource::ReplaySource(RunLoop& runLoop, const Clock& clock, ReplayOptions o
 {
 }
 
-std::unique_ptr<ReplaySource> ReplaySource::open(
-    RunLoop& runLoop, const Clock& clock, ReplayOptions options, std::string& reason)
+Result<std::unique_ptr<LogSource>> ReplaySource::open(RunLoop& runLoop, const Clock& clock, ReplayOptions options)
 {
     std::optional<Technology> technology;
     for (const std::string& file : options.files) {
-        const auto reader = openRecording(file, reason);
-        if (!reader) {
-            reason = file + ": " + reason;
-            return nullptr;
-        }
-        const auto named = reader->technology() ? reader->technology() : options.technology;
-        if (!named) {
-            reason = file + ": does not tell its technology; name it with --technology";
-            return nullptr;
-        }
-        if (technology && technology != named) {
-            reason = file + ": is of technology " + std::string(technologyName(*named)) + ", the first file of "
-                + std::string(technologyName(*technology));
-            return nullptr;
-        }
+        const auto opened = openRecording(file);
+        if (!opened)
+            return opened.failure().of(file);
+        const RecordingReader& reader = **opened;
+        const auto named = reader.technology() ? reader.technology() : options.technology;
+        if (!named)
+            return Failure {file + ": does not tell its technology; name it with --technology"};
+        if (technology && technology != named)
+            return Failure {file + ": is of technology " + std::string(technologyName(*named)) + ", the first file of "
+                + std::string(technologyName(*technology))};
         technology = named;
     }
-    if (!technology) {
-        reason = "no file to replay";
-        return nullptr;
-    }
-    return std::unique_ptr<ReplaySource>(new ReplaySource(runLoop, clock, std::move(options), *technology));
+    if (!technology)
+        return Failure {"no file to replay"};
+    return std::unique_ptr<LogSource>(new ReplaySource(runLoop, clock, std::move(options), *technology));
 }
 
 std::unique_ptr<LogStream> ReplaySource::start(MessageSink& sink)

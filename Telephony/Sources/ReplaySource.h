@@ -5,6 +5,7 @@
 #include "Records/Recording.h"
 #include "Telephony/LogSource.h"
 #include "Telephony/Sources/ReplayPoint.h"
+#include "Values/Result.h"
 
 #include <memory>
 #include <optional>
@@ -30,10 +31,9 @@ struct ReplayOptions {
 /// it goes on at once.
 class ReplaySource final : public LogSource {
 public:
-    /// Null when a file cannot be read, names no technology, or another one than the first; `reason`
-    /// names the file.
-    static std::unique_ptr<ReplaySource> open(
-        RunLoop& runLoop, const Clock& clock, ReplayOptions options, std::string& reason);
+    /// Fails, naming the file, when one cannot be read, does not tell its technology, or tells another one than the
+    /// first.
+    static Result<std::unique_ptr<LogSource>> open(RunLoop& runLoop, const Clock& clock, ReplayOptions options);
 
     Technology technology() const override
     {

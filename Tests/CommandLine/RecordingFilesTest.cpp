@@ -33,12 +33,12 @@ protected:
     {
         std::vector<std::string> lines;
         for (const auto& each : std::filesystem::directory_iterator(folder)) {
-            std::string reason;
-            const auto reader = openRecording(each.path().string(), reason);
+            const auto reader = openRecording(each.path().string());
             int messages = 0;
-            for (RecordedMessage message; reader && reader->next(message);)
+            for (RecordedMessage message; reader && (*reader)->next(message);)
                 ++messages;
-            lines.push_back(each.path().filename().string() + ": " + (reader ? std::to_string(messages) : reason));
+            lines.push_back(
+                each.path().filename().string() + ": " + (reader ? std::to_string(messages) : reader.failure().text));
         }
         std::ranges::sort(lines);
         return lines;

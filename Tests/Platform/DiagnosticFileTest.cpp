@@ -13,15 +13,13 @@ class DiagnosticFileTest : public testing::Test {
 protected:
     ScratchFolder folder;
     std::string path = folder.path().string() + "/diagnostics";
-    std::string reason;
 };
 
 TEST_F(DiagnosticFileTest, IsTheDiagnosticLogForAsLongAsItLives)
 {
     ASSERT_EQ(DiagnosticLog::installed(), nullptr);
     {
-        const auto log = DiagnosticFile::create(path, reason);
-        ASSERT_TRUE(log) << reason;
+        const auto log = *DiagnosticFile::create(path);
         ASSERT_EQ(DiagnosticLog::installed(), log.get());
         DiagnosticLog::installed()->write("Display Dict = {}\nmore");
         std::ifstream file(path, std::ios::binary);
@@ -32,8 +30,9 @@ TEST_F(DiagnosticFileTest, IsTheDiagnosticLogForAsLongAsItLives)
 
 TEST_F(DiagnosticFileTest, FileThatCannotBeMadeIsTold)
 {
-    EXPECT_EQ(DiagnosticFile::create(folder.path().string() + "/no/such/folder", reason), nullptr);
-    EXPECT_NE(reason.find("No such file or directory"), std::string::npos);
+    const auto created = DiagnosticFile::create(folder.path().string() + "/no/such/folder");
+    ASSERT_FALSE(created);
+    EXPECT_EQ(created.failure().text, "No such file or directory");
     EXPECT_EQ(DiagnosticLog::installed(), nullptr);
 }
 

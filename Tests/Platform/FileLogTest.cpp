@@ -21,12 +21,11 @@ protected:
 
     ScratchFolder folder;
     std::string path = folder.path().string() + "/log";
-    std::string reason;
 };
 
 TEST_F(FileLogTest, LinesHaveThePriorityAndTheText)
 {
-    const auto log = FileLog::create(path, FileLog::Writing::EachLine, reason);
+    const auto log = *FileLog::create(path, FileLog::Writing::EachLine);
     log->write(3, "Could not create the ports necessary");
     log->write(16, "DLF");
     EXPECT_EQ(content(), "<3>Could not create the ports necessary\n<16>DLF\n");
@@ -34,21 +33,21 @@ TEST_F(FileLogTest, LinesHaveThePriorityAndTheText)
 
 TEST_F(FileLogTest, ControlCharactersAreEscapedAsInC)
 {
-    const auto log = FileLog::create(path, FileLog::Writing::EachLine, reason);
+    const auto log = *FileLog::create(path, FileLog::Writing::EachLine);
     log->write(4, "\n\t\r\a\b\f\v\\"s + "\0"s + "1\x1b" + "7\x7f");
     EXPECT_EQ(content(), "<4>\\n\\t\\r\\a\\b\\f\\v\\\\0001\\0337\\177\n");
 }
 
 TEST_F(FileLogTest, BytesBeyondASCIIStandAsTheyAre)
 {
-    const auto log = FileLog::create(path, FileLog::Writing::EachLine, reason);
+    const auto log = *FileLog::create(path, FileLog::Writing::EachLine);
     log->write(4, "\xC3\xA4\xFF\"'");
     EXPECT_EQ(content(), "<4>\xC3\xA4\xFF\"'\n");
 }
 
 TEST_F(FileLogTest, BufferedLinesAreThereAfterFlush)
 {
-    const auto log = FileLog::create(path, FileLog::Writing::Buffered, reason);
+    const auto log = *FileLog::create(path, FileLog::Writing::Buffered);
     log->write(4, "line");
     EXPECT_EQ(content(), "");
     EXPECT_TRUE(log->flush());
@@ -57,13 +56,14 @@ TEST_F(FileLogTest, BufferedLinesAreThereAfterFlush)
 
 TEST_F(FileLogTest, FileThatCannotBeMadeTellsWhy)
 {
-    EXPECT_EQ(FileLog::create(folder.path().string() + "/no/log", FileLog::Writing::Buffered, reason), nullptr);
-    EXPECT_EQ(reason, "No such file or directory");
+    const auto created = FileLog::create(folder.path().string() + "/no/log", FileLog::Writing::Buffered);
+    ASSERT_FALSE(created);
+    EXPECT_EQ(created.failure().text, "No such file or directory");
 }
 
 TEST_F(FileLogTest, FullDeviceIsReportedByFlush)
 {
-    const auto log = FileLog::create("/dev/full", FileLog::Writing::Buffered, reason);
+    const auto log = *FileLog::create("/dev/full", FileLog::Writing::Buffered);
     log->write(4, "line");
     EXPECT_FALSE(log->flush());
 }

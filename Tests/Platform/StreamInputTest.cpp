@@ -45,16 +45,16 @@ protected:
 
     void open(const std::string& address)
     {
-        std::string reason;
-        input = openStreamInput(address, reason);
-        ASSERT_TRUE(input) << reason;
+        auto opened = openStreamInput(address);
+        ASSERT_TRUE(opened) << opened.failure().text;
+        input = *std::move(opened);
         input->start(*this);
     }
     std::string refusal(const std::string& address)
     {
-        std::string reason;
-        EXPECT_EQ(openStreamInput(address, reason), nullptr);
-        return reason;
+        const auto opened = openStreamInput(address);
+        EXPECT_FALSE(opened);
+        return opened ? "" : opened.failure().text;
     }
     void makeFifo()
     {

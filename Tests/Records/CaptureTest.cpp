@@ -57,9 +57,7 @@ TEST(CaptureTest, WrittenMessagesReadBackWithTimeAndTechnology)
     const ScratchFolder folder;
     for (const Technology technology :
         {Technology::IFX, Technology::GSM, Technology::CDMA, Technology::LTE, Technology::UTRAN}) {
-        std::string reason;
-        auto writer = createRecording(folder.file("x.pcap"), technology, reason);
-        ASSERT_TRUE(writer) << reason;
+        auto writer = *createRecording(folder.file("x.pcap"), technology);
         EXPECT_TRUE(writer->write(at(1'733'000'000'123'456), viewOf("first")));
         EXPECT_TRUE(writer->write(at(0), viewOf(std::string(3, '\0'))));
         EXPECT_TRUE(writer->write(at(4'294'967'295'999'999), viewOf("last")));
@@ -76,8 +74,7 @@ TEST(CaptureTest, WrittenMessagesReadBackWithTimeAndTechnology)
 TEST(CaptureTest, FileIsAClassicCaptureWithItsLinkType)
 {
     const ScratchFolder folder;
-    std::string reason;
-    auto writer = createRecording(folder.file("x"), Technology::UTRAN, reason);
+    auto writer = *createRecording(folder.file("x"), Technology::UTRAN);
     ASSERT_TRUE(writer->write(at(1'000'001), viewOf("ab")));
     writer.reset();
     EXPECT_EQ(folder.read("x"), CaptureBytes(0xA1B2C3D4, 151).packet(1, 1, "ab").bytes);
@@ -86,9 +83,8 @@ TEST(CaptureTest, FileIsAClassicCaptureWithItsLinkType)
 TEST(CaptureTest, MessagesOfEitherBoundAreWrittenAndRead)
 {
     const ScratchFolder folder;
-    std::string reason;
     const std::string longest(262144, 'x');
-    auto writer = createRecording(folder.file("x"), Technology::LTE, reason);
+    auto writer = *createRecording(folder.file("x"), Technology::LTE);
     EXPECT_TRUE(writer->write(at(0), viewOf("x")));
     EXPECT_TRUE(writer->write(at(0), viewOf(longest)));
     EXPECT_FALSE(writer->write(at(0), {}));
@@ -103,8 +99,7 @@ TEST(CaptureTest, MessagesOfEitherBoundAreWrittenAndRead)
 TEST(CaptureTest, TimesThatACaptureCannotTellAreRefused)
 {
     const ScratchFolder folder;
-    std::string reason;
-    const auto writer = createRecording(folder.file("x"), Technology::LTE, reason);
+    const auto writer = *createRecording(folder.file("x"), Technology::LTE);
     EXPECT_FALSE(writer->write(at(-1), viewOf("x")));
     EXPECT_EQ(writer->error(), "the time 1969-12-31 23:59:59 +0000 is outside what a capture can tell");
     EXPECT_FALSE(writer->write(at(4'294'967'296'000'000), viewOf("x")));
@@ -113,8 +108,7 @@ TEST(CaptureTest, TimesThatACaptureCannotTellAreRefused)
 TEST(CaptureTest, FlushedMessagesAreInTheFileWhileTheWriterLives)
 {
     const ScratchFolder folder;
-    std::string reason;
-    const auto writer = createRecording(folder.file("x"), Technology::LTE, reason);
+    const auto writer = *createRecording(folder.file("x"), Technology::LTE);
     EXPECT_TRUE(readRecording(folder.file("x")).isOpen);
     ASSERT_TRUE(writer->write(at(0), viewOf("message")));
     ASSERT_TRUE(writer->flush());
@@ -154,10 +148,9 @@ TEST(CaptureTest, NewFileGetsItsNameWithItsHead)
 {
     const ScratchFolder folder;
     const FolderEvents events(folder);
-    std::string reason;
     const std::string hidden = "created .x.pcap-" + std::to_string(::getpid());
     for (const auto create : {createRecording, createNewRecording}) {
-        const auto writer = create(folder.file("x.pcap"), Technology::LTE, reason);
+        const auto writer = *create(folder.file("x.pcap"), Technology::LTE);
         EXPECT_EQ(events.take(), (std::vector<std::string> {hidden, "renamed to x.pcap"}));
         EXPECT_EQ(folder.read("x.pcap"), CaptureBytes(0xA1B2C3D4, 150).bytes);
         std::filesystem::remove(folder.file("x.pcap"));
@@ -169,8 +162,7 @@ TEST(CaptureTest, OverwrittenFileKeepsItsPlaceAndItsOldPacketsGo)
     const ScratchFolder folder;
     folder.write("x.pcap", CaptureBytes(0xA1B2C3D4, 149).packet(1, 1, "old").packet(2, 2, "older").bytes);
     const FolderEvents events(folder);
-    std::string reason;
-    auto writer = createRecording(folder.file("x.pcap"), Technology::LTE, reason);
+    auto writer = *createRecording(folder.file("x.pcap"), Technology::LTE);
     EXPECT_EQ(folder.read("x.pcap"), CaptureBytes(0xA1B2C3D4, 150).bytes);
     EXPECT_TRUE(writer->write(at(1'000'001), viewOf("new")));
     writer.reset();
@@ -182,8 +174,7 @@ TEST(CaptureTest, OverwrittenShortFileOfAnotherKindIsACapture)
 {
     const ScratchFolder folder;
     folder.write("x.pcap", "text");
-    std::string reason;
-    EXPECT_TRUE(createRecording(folder.file("x.pcap"), Technology::LTE, reason));
+    EXPECT_TRUE(createRecording(folder.file("x.pcap"), Technology::LTE));
     EXPECT_EQ(folder.read("x.pcap"), CaptureBytes(0xA1B2C3D4, 150).bytes);
 }
 
@@ -191,9 +182,9 @@ TEST(CaptureTest, NewRecordingLeavesAFileOfItsNameAlone)
 {
     const ScratchFolder folder;
     folder.write("x.pcap", "mine");
-    std::string reason = "none";
-    EXPECT_FALSE(createNewRecording(folder.file("x.pcap"), Technology::LTE, reason));
-    EXPECT_EQ(reason, "");
+    const auto created = createNewRecording(folder.file("x.pcap"), Technology::LTE);
+    ASSERT_FALSE(created);
+    EXPECT_EQ(created.failure().code, Failure::Code::Exists);
     EXPECT_EQ(folder.read("x.pcap"), "mine");
     const auto files = std::filesystem::directory_iterator(folder.path());
     EXPECT_EQ(std::distance(begin(files), end(files)), 1) << "nothing hidden stays";
@@ -201,17 +192,17 @@ TEST(CaptureTest, NewRecordingLeavesAFileOfItsNameAlone)
 
 TEST(CaptureTest, FullDiskIsReported)
 {
-    std::string reason;
-    EXPECT_FALSE(createRecording("/dev/full", Technology::LTE, reason));
-    EXPECT_EQ(reason, "No space left on device");
+    const auto created = createRecording("/dev/full", Technology::LTE);
+    ASSERT_FALSE(created);
+    EXPECT_EQ(created.failure().text, "No space left on device");
 }
 
 TEST(CaptureTest, PlaceThatCannotBeWrittenIsReported)
 {
     const ScratchFolder folder;
-    std::string reason;
-    EXPECT_FALSE(createRecording(folder.file("no/such/folder"), Technology::LTE, reason));
-    EXPECT_EQ(reason, "No such file or directory");
+    const auto created = createRecording(folder.file("no/such/folder"), Technology::LTE);
+    ASSERT_FALSE(created);
+    EXPECT_EQ(created.failure().text, "No such file or directory");
 }
 
 TEST(CaptureTest, BothByteOrdersAndBothTimeUnitsAreRead)
@@ -315,8 +306,7 @@ TEST(CaptureTest, MemoryDoesNotGrowWithTheLength)
     CaptureBytes capture;
     for (std::uint32_t i = 0; i < 50000; ++i)
         capture.packet(i, 0, std::string(200, 'x'));
-    std::string reason;
-    const auto reader = openRecording(folder.write("x", capture.bytes), reason);
+    const auto reader = *openRecording(folder.write("x", capture.bytes));
     RecordedMessage message;
     ASSERT_TRUE(reader->next(message));
     const std::size_t heapAtStart = ::mallinfo2().uordblks;

@@ -33,9 +33,12 @@ std::string versionReport(std::uint32_t secondsSince1970)
 RecordingText readRecording(const std::string& path)
 {
     RecordingText text;
-    const auto reader = openRecording(path, text.reason);
-    if (!reader)
+    const auto opened = openRecording(path);
+    if (!opened) {
+        text.reason = opened.failure().text;
         return text;
+    }
+    const auto& reader = *opened;
     text.isOpen = true;
     text.technology = reader->technology();
     for (RecordedMessage message; reader->next(message);) {

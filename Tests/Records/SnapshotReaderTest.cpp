@@ -28,8 +28,7 @@ protected:
     RecordingText read(const ListRef& entries)
     {
         const Value snapshot = Dictionary::make({{"Timestamp", "2024-03-05 14:07:31 +0000"}, {"Data", entries}});
-        std::string reason;
-        EXPECT_TRUE(writePropertyListToFile(snapshot, _folder.file("x"), reason)) << reason;
+        EXPECT_TRUE(writePropertyListToFile(snapshot, _folder.file("x")));
         return readRecording(_folder.file("x"));
     }
     /// One entry with these bytes.

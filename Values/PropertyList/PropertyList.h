@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Values/Bytes.h"
+#include "Values/Result.h"
 #include "Values/Value.h"
 
 #include <cstddef>
@@ -28,9 +29,9 @@ std::optional<Value> parsePropertyList(ByteView bytes);
 /// (control characters, malformed UTF-8), a date outside the years 0 to 9999.
 std::optional<std::string> serialisePropertyList(const Value& value);
 
-/// Writes the XML form straight to the path, mode 0600 also where the file exists. On failure false, with `reason`
-/// telling why; a file without room for the list stays as it was, one that was not there is not left behind.
-bool writePropertyListToFile(const Value& value, const std::string& path, std::string& reason);
+/// Writes the XML form straight to the path, mode 0600 also where the file exists. A file without room for the list
+/// stays as it was, one that was not there is not left behind.
+Outcome writePropertyListToFile(const Value& value, const std::string& path);
 
 /// Reads a whole file as a property list; none when it cannot be read or does not parse.
 std::optional<Value> readPropertyListFile(const std::string& path);

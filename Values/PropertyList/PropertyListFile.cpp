@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <cerrno>
-#include <cstring>
 #include <fcntl.h>
 #include <string_view>
 #include <sys/stat.h>
@@ -12,54 +11,59 @@ namespace spectrel {
 
 namespace {
 
-bool failed(std::string& reason)
+Outcome doneIf(bool isDone)
 {
-    reason = std::strerror(errno);
-    return false;
+    return isDone ? Outcome(Done()) : Failure::ofSystem();
 }
 
-bool writeAll(int file, std::string_view text, std::string& reason)
+Outcome writeAll(int file, std::string_view text)
 {
     while (!text.empty()) {
         const ssize_t written = ::write(file, text.data(), text.size());
         if (written < 0 && errno == EINTR)
             continue;
         if (written < 0)
-            return failed(reason);
+            return Failure::ofSystem();
         text.remove_prefix(static_cast<std::size_t>(written));
     }
-    return true;
+    return Done();
 }
 
 /// A file that was there keeps its old mode when it is opened; devices and pipes are left alone.
-bool makePrivate(int file, std::string& reason)
+Outcome makePrivate(int file)
 {
     struct stat status { };
     if (::fstat(file, &status) != 0)
-        return failed(reason);
-    return !S_ISREG(status.st_mode) || ::fchmod(file, 0600) == 0 || failed(reason);
-}
-
-bool isWantOfRoom(int error)
-{
-    return error == ENOSPC || error == EDQUOT || error == EFBIG;
+        return Failure::ofSystem();
+    return doneIf(!S_ISREG(status.st_mode) || ::fchmod(file, 0600) == 0);
 }
 
 /// Gives a regular file its new size before the first byte is overwritten: where the disk is full, the file stays as it
 /// was. File systems that cannot reserve tell at the write.
-bool reserve(int file, std::size_t size, std::string& reason)
+Outcome reserve(int file, std::size_t size)
 {
     struct stat status { };
     if (::fstat(file, &status) != 0)
-        return failed(reason);
+        return Failure::ofSystem();
     if (!S_ISREG(status.st_mode))
-        return true;
-    if (::fallocate(file, 0, 0, static_cast<off_t>(size)) != 0 && isWantOfRoom(errno)) {
-        failed(reason);
-        [[maybe_unused]] const int shortened = ::ftruncate(file, status.st_size);
-        return false;
+        return Done();
+    if (::fallocate(file, 0, 0, static_cast<off_t>(size)) != 0) {
+        Failure failure = Failure::ofSystem();
+        if (failure.code == Failure::Code::NoRoom) {
+            [[maybe_unused]] const int shortened = ::ftruncate(file, status.st_size);
+            return failure;
+        }
     }
-    return ::ftruncate(file, static_cast<off_t>(size)) == 0 || failed(reason);
+    return doneIf(::ftruncate(file, static_cast<off_t>(size)) == 0);
+}
+
+Outcome fill(int file, std::string_view text)
+{
+    if (auto outcome = makePrivate(file); !outcome)
+        return outcome;
+    if (auto outcome = reserve(file, text.size()); !outcome)
+        return outcome;
+    return writeAll(file, text);
 }
 
 /// The file's bytes; none when it cannot be read or is larger than a list may be.
@@ -84,25 +88,23 @@ std::optional<Bytes> readAll(int file)
 
 } // namespace
 
-bool writePropertyListToFile(const Value& value, const std::string& path, std::string& reason)
+Outcome writePropertyListToFile(const Value& value, const std::string& path)
 {
     const auto text = serialisePropertyList(value);
-    if (!text) {
-        reason = "the value cannot be written as a property list";
-        return false;
-    }
+    if (!text)
+        return Failure {"the value cannot be written as a property list"};
     int file = ::open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0600);
     const bool isNew = file >= 0;
     if (!isNew)
         file = ::open(path.c_str(), O_WRONLY | O_CREAT | O_CLOEXEC, 0600);
     if (file < 0)
-        return failed(reason);
-    const bool written =
-        makePrivate(file, reason) && reserve(file, text->size(), reason) && writeAll(file, *text, reason);
-    const bool closed = ::close(file) == 0 || (written && failed(reason)); // some file systems tell only now
-    if (isNew && !(written && closed))
+        return Failure::ofSystem();
+    Outcome outcome = fill(file, *text);
+    if (::close(file) != 0 && outcome) // some file systems tell only now
+        outcome = Failure::ofSystem();
+    if (isNew && !outcome)
         ::unlink(path.c_str()); // half a list is of no use to anybody
-    return written && closed;
+    return outcome;
 }
 
 std::optional<Value> readPropertyListFile(const std::string& path)

@@ -80,17 +80,16 @@ ModemManagerService::ModemManagerService()
 {
     registerTypes();
     connect(&_busTimer, &QTimer::timeout, this, [this] {
-        std::string reason;
-        if (attach(reason))
+        if (attach())
             _busTimer.stop();
     });
 }
 
-std::unique_ptr<ModemManagerService> ModemManagerService::open(std::string& reason)
+Result<std::unique_ptr<ModemManagerService>> ModemManagerService::open()
 {
     std::unique_ptr<ModemManagerService> service(new ModemManagerService);
-    if (!service->attach(reason))
-        return nullptr;
+    if (const auto attached = service->attach(); !attached)
+        return attached.failure();
     service->waitForModems(FirstAnswerLimit);
     return service;
 }
@@ -108,13 +107,13 @@ ModemManagerService::~ModemManagerService()
 }
 
 /// Connects to the bus, follows ModemManager's coming, going and signals, and asks for what is there.
-bool ModemManagerService::attach(std::string& reason)
+Outcome ModemManagerService::attach()
 {
     _bus = QDBusConnection::connectToBus(QDBusConnection::SystemBus, ConnectionName);
     if (!_bus.isConnected()) {
-        reason = "there is no system bus to reach modems by: " + printable(_bus.lastError().message());
+        Failure failure {"there is no system bus to reach modems by: " + printable(_bus.lastError().message())};
         QDBusConnection::disconnectFromBus(ConnectionName);
-        return false;
+        return failure;
     }
     _watcher = std::make_unique<QDBusServiceWatcher>(ServiceName, _bus, QDBusServiceWatcher::WatchForOwnerChange);
     connect(_watcher.get(), &QDBusServiceWatcher::serviceOwnerChanged, this,
@@ -132,7 +131,7 @@ bool ModemManagerService::attach(std::string& reason)
     _bus.connect(QString(), QStringLiteral("/org/freedesktop/DBus/Local"), QStringLiteral("org.freedesktop.DBus.Local"),
         QStringLiteral("Disconnected"), this, SLOT(busLost()));
     listObjects();
-    return true;
+    return Done();
 }
 
 void ModemManagerService::waitForModems(std::chrono::milliseconds limit)

@@ -2,6 +2,7 @@
 
 #include "Telephony/Modem/ModemManager/ModemManagerFacts.h"
 #include "Telephony/Modem/ModemService.h"
+#include "Values/Result.h"
 
 #include <QDBusConnection>
 #include <QDBusMessage>
@@ -22,9 +23,9 @@ class ModemManagerService final : public QObject, public ModemService {
     Q_OBJECT
 
 public:
-    /// Null when there is no system bus; `reason` says why. ModemManager itself may come later. Waits a moment for its
-    /// first answer, turning the event loop, so that the technology is known before anybody asks for it.
-    static std::unique_ptr<ModemManagerService> open(std::string& reason);
+    /// Fails when there is no system bus. ModemManager itself may come later. Waits a moment for its first answer,
+    /// turning the event loop, so that the technology is known before anybody asks for it.
+    static Result<std::unique_ptr<ModemManagerService>> open();
     ~ModemManagerService() override;
 
     void setChangeHandler(ChangeHandler handler) override;
@@ -42,7 +43,7 @@ private Q_SLOTS:
 
 private:
     ModemManagerService();
-    bool attach(std::string& reason);
+    Outcome attach();
     void waitForModems(std::chrono::milliseconds limit);
     void listObjects();
     void takeObjects(const QDBusMessage& answer);

@@ -68,9 +68,8 @@ protected:
     };
     std::string writeRecording(const std::vector<Timed>& messages) const
     {
-        std::string why;
         const std::string path = scratch.file("a.pcap");
-        const auto writer = createRecording(path, Technology::LTE, why);
+        const auto writer = *createRecording(path, Technology::LTE);
         for (const Timed& message : messages)
             EXPECT_TRUE(writer->write(Start + message.time, message.body));
         EXPECT_TRUE(writer->flush());

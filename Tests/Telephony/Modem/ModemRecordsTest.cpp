@@ -1,7 +1,7 @@
 #include "Telephony/Modem/ModemRecords.h"
+#include "Records/Frame.h"
 
 #include "Records/TelephonyConstants.h"
-#include "Telephony/RoutedCode.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
@@ -17,9 +17,7 @@ constexpr Moment Now {std::chrono::seconds(1'700'000'000)};
 
 Value payload(const Bytes& record, std::uint32_t expectedCode)
 {
-    std::uint32_t code = 0;
-    EXPECT_TRUE(routedCode(record, code));
-    EXPECT_EQ(code, expectedCode);
+    EXPECT_EQ(routedCode(record), expectedCode);
     EXPECT_EQ(record[1] | record[2] << 8, static_cast<int>(record.size()) - 1) << "the length has its 16 bits";
     return parsePropertyList(ByteView(record).subspan(13)).value_or(Value());
 }

@@ -1,7 +1,7 @@
 #include "Telephony/Modem/ModemSource.h"
+#include "Records/Frame.h"
 
 #include "Records/TelephonyConstants.h"
-#include "Telephony/RoutedCode.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Telephony/Modem/FakeModemService.h"
@@ -23,11 +23,11 @@ public:
     {
         if (isFull)
             return false;
-        std::uint32_t code = 0;
-        EXPECT_TRUE(routedCode(message, code));
+        const auto code = routedCode(message);
+        EXPECT_TRUE(code);
         const auto payload = parsePropertyList(message.subspan(13));
         EXPECT_TRUE(payload) << "a payload that does not parse ends the application";
-        received.emplace_back(code, payload.value_or(Value()));
+        received.emplace_back(code.value_or(0), payload.value_or(Value()));
         return true;
     }
     std::size_t count(std::uint32_t code) const

@@ -1,6 +1,7 @@
 #pragma once
 
-#include "Telephony/RoutedCode.h"
+#include "Records/Frame.h"
+#include "Telephony/Encoders/RecordWriter.h"
 #include "Telephony/Simulator/Baseband.h"
 #include "Tests/Telephony/RecordBytes.h"
 #include "Values/PropertyList/PropertyList.h"
@@ -56,9 +57,9 @@ protected:
 private:
     void keep(ByteView record)
     {
-        std::uint32_t code = 0;
-        ASSERT_TRUE(routedCode(record, code));
-        records[code].emplace_back(record.begin(), record.end());
+        const auto code = routedCode(record);
+        ASSERT_TRUE(code);
+        records[*code].emplace_back(record.begin(), record.end());
     }
 
     Technology _technology;

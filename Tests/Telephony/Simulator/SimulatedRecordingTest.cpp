@@ -16,8 +16,7 @@ protected:
     std::string write(Technology technology, Scene scene, std::uint32_t seed, std::chrono::milliseconds duration)
     {
         const auto baseband = makeBaseband(technology, scene, seed);
-        std::string reason;
-        EXPECT_TRUE(writeSimulatedRecording(*baseband, path, duration, reason)) << reason;
+        EXPECT_TRUE(writeSimulatedRecording(*baseband, path, duration));
         std::ifstream file(path, std::ios::binary);
         return {std::istreambuf_iterator<char>(file), {}};
     }
@@ -46,9 +45,7 @@ TEST_F(SimulatedRecordingTest, SameOptionsGiveTheSameBytesForUTRANToo)
 TEST_F(SimulatedRecordingTest, ItCoversItsDurationFromTheFixedStart)
 {
     write(Technology::LTE, Scene::Drive, 1, 60s);
-    std::string reason;
-    const auto reader = openRecording(path, reason);
-    ASSERT_TRUE(reader) << reason;
+    const auto reader = *openRecording(path);
     EXPECT_EQ(reader->technology(), Technology::LTE);
     RecordedMessage message;
     ASSERT_TRUE(reader->next(message));
@@ -68,9 +65,9 @@ TEST_F(SimulatedRecordingTest, StressSendsEveryRecordAtEveryStep)
 TEST_F(SimulatedRecordingTest, FileThatCannotBeMadeIsReported)
 {
     const auto baseband = makeBaseband(Technology::LTE, Scene::Drive, 1);
-    std::string reason;
-    EXPECT_FALSE(writeSimulatedRecording(*baseband, folder.path() / "no/such/folder", 1s, reason));
-    EXPECT_EQ(reason, "No such file or directory");
+    const auto written = writeSimulatedRecording(*baseband, folder.path() / "no/such/folder", 1s);
+    ASSERT_FALSE(written);
+    EXPECT_EQ(written.failure().text, "No such file or directory");
 }
 
 } // namespace

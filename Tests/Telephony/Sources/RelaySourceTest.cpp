@@ -33,9 +33,8 @@ protected:
     /// The bytes of a capture of these messages, byte 12 of each its number.
     Bytes capture(int first, int count, Technology technology = Technology::LTE)
     {
-        std::string reason;
         const std::string path = scratch.file("x.pcap");
-        const auto writer = createRecording(path, technology, reason);
+        const auto writer = *createRecording(path, technology);
         for (int number = first; number < first + count; ++number)
             writer->write(Moment(std::chrono::seconds(1000 + number)), message(number));
         writer->flush();

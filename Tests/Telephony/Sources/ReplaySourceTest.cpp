@@ -21,16 +21,20 @@ protected:
     std::string recordingOf(int count, Technology technology = Technology::LTE, int start = 1000)
     {
         std::string path = folder + "/" + std::to_string(++_files) + ".pcap";
-        const auto writer = createRecording(path, technology, reason);
+        const auto writer = *createRecording(path, technology);
         for (int number = 0; number < count; ++number)
             writer->write(Moment(std::chrono::seconds(start + number)),
                 RecordBuilder(0xB0C2, 13).u8(12, static_cast<std::uint32_t>(number)));
         writer->flush();
         return path;
     }
-    std::unique_ptr<ReplaySource> open(ReplayOptions options)
+    std::unique_ptr<LogSource> open(ReplayOptions options)
     {
-        return ReplaySource::open(loop, loop, std::move(options), reason);
+        auto opened = ReplaySource::open(loop, loop, std::move(options));
+        if (opened)
+            return *std::move(opened);
+        reason = opened.failure().text;
+        return nullptr;
     }
 
     /// The numbers of what was delivered.

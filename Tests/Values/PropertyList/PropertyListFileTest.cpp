@@ -20,12 +20,17 @@ unsigned mode(const std::string& path)
 
 } // namespace
 
+std::string whyNotWritten(const Value& value, const std::string& path)
+{
+    const auto written = writePropertyListToFile(value, path);
+    return written ? "written" : written.failure().text;
+}
+
 TEST(PropertyListFileTest, WrittenFileReadsBack)
 {
     const ScratchFolder folder;
     const Value value = Dictionary::make({{"k", "v"}});
-    std::string reason;
-    ASSERT_TRUE(writePropertyListToFile(value, folder.file("x"), reason)) << reason;
+    ASSERT_TRUE(writePropertyListToFile(value, folder.file("x")));
     EXPECT_EQ(readPropertyListFile(folder.file("x")), value);
     EXPECT_EQ(folder.read("x"), serialisePropertyList(value));
 }
@@ -35,9 +40,8 @@ TEST(PropertyListFileTest, FileIsPrivateAlsoWhenItWasThere)
     const ScratchFolder folder;
     folder.write("old", std::string(5000, 'x'));
     ASSERT_EQ(::chmod(folder.file("old").c_str(), 0644), 0);
-    std::string reason;
     for (const char* name : {"old", "new"}) {
-        ASSERT_TRUE(writePropertyListToFile("text", folder.file(name), reason)) << reason;
+        ASSERT_TRUE(writePropertyListToFile("text", folder.file(name)));
         EXPECT_EQ(mode(folder.file(name)), 0600u) << name;
         EXPECT_EQ(folder.read(name), serialisePropertyList("text")) << name;
     }
@@ -46,19 +50,14 @@ TEST(PropertyListFileTest, FileIsPrivateAlsoWhenItWasThere)
 TEST(PropertyListFileTest, PlacesThatCannotBeWrittenAreReported)
 {
     const ScratchFolder folder;
-    std::string reason;
-    EXPECT_FALSE(writePropertyListToFile("text", folder.file("no/such/folder"), reason));
-    EXPECT_EQ(reason, "No such file or directory");
-    EXPECT_FALSE(writePropertyListToFile("text", folder.path().string(), reason));
-    EXPECT_EQ(reason, "Is a directory");
+    EXPECT_EQ(whyNotWritten("text", folder.file("no/such/folder")), "No such file or directory");
+    EXPECT_EQ(whyNotWritten("text", folder.path().string()), "Is a directory");
 }
 
 TEST(PropertyListFileTest, FullDiskIsReportedAndTheDeviceIsLeftAlone)
 {
     const unsigned before = mode("/dev/full");
-    std::string reason;
-    EXPECT_FALSE(writePropertyListToFile("text", "/dev/full", reason));
-    EXPECT_EQ(reason, "No space left on device");
+    EXPECT_EQ(whyNotWritten("text", "/dev/full"), "No space left on device");
     EXPECT_EQ(mode("/dev/full"), before);
 }
 
@@ -66,9 +65,7 @@ TEST(PropertyListFileTest, ValueThatCannotBeWrittenLeavesTheFileAsItWas)
 {
     const ScratchFolder folder;
     folder.write("x", "old");
-    std::string reason;
-    EXPECT_FALSE(writePropertyListToFile(Value(), folder.file("x"), reason));
-    EXPECT_EQ(reason, "the value cannot be written as a property list");
+    EXPECT_EQ(whyNotWritten(Value(), folder.file("x")), "the value cannot be written as a property list");
     EXPECT_EQ(folder.read("x"), "old");
 }
 

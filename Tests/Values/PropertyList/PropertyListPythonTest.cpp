@@ -126,8 +126,7 @@ TEST(PropertyListPythonTest, PythonReadsWhatWasWritten)
     for (int i = 0; i < Lists; ++i) {
         const Value value = values.value(0);
         const std::string name = std::to_string(i);
-        std::string reason;
-        ASSERT_TRUE(writePropertyListToFile(value, folder.file(name + ".plist"), reason)) << reason;
+        ASSERT_TRUE(writePropertyListToFile(value, folder.file(name + ".plist")));
         folder.write(name + ".txt", valueText(value));
         ASSERT_EQ(parsed(folder.file(name + ".plist")), valueText(value));
     }
