@@ -32,7 +32,6 @@ SpectrelModel::SpectrelModel(Services services, SpectrelModelObserver& observer,
     , _observer(observer)
     , _portPrefix(std::move(portPrefix))
     , _alive(std::make_shared<bool>(true))
-    , _state(Dictionary::make())
 {
 }
 
@@ -147,8 +146,8 @@ void SpectrelModel::configureGenerator()
         return;
     }
     _technology = technology.string() ? *technology.string() : std::string();
-    _logGenerator.replace(LogGenerator::generatorFromTechnology(technology), *_state, _updated);
-    SPECTREL_LOG(Priority::Error, "Got log generated: %p", static_cast<void*>(_logGenerator.get()));
+    _display.useTechnology(technology);
+    SPECTREL_LOG(Priority::Error, "Got log generated: %p", static_cast<void*>(_display.generator()));
 }
 
 bool SpectrelModel::startSession()
@@ -159,11 +158,11 @@ bool SpectrelModel::startSession()
         return false;
     }
     configureGenerator();
-    if (!_logGenerator) {
+    if (!_display.generator()) {
         fail("No log generator technology works");
         return false;
     }
-    const auto command = serialisePropertyList(_logGenerator->getStartCommand());
+    const auto command = serialisePropertyList(_display.generator()->getStartCommand());
     if (!command) {
         fail(" Could not generate PLIST");
         return false;
@@ -257,12 +256,7 @@ RunLoop::Job SpectrelModel::whileAlive(void (SpectrelModel::*operation)())
 
 void SpectrelModel::updateWithData(ByteView data)
 {
-    if (_logGenerator) {
-        _messageInProgress = data;
-        _logGenerator->updateState(*_state, data);
-        _messageInProgress = {};
-    }
-    _updated = true;
+    _display.apply(data, Clock::installed().now());
     _intake += data.size();
     if (_intake >= LargestIntake && _recvPort && _displayUpdateTimer)
         _recvPort->setPaused(true);
@@ -277,9 +271,8 @@ void SpectrelModel::refresh()
         const auto port = _recvPort; // the handler, still installed, restarts the session and lets go of the port
         port->invalidate();
     }
-    if (!_updated)
+    if (!_display.takeNews())
         return;
-    _updated = false;
     _nodes.reset();
     _nodesByPath.reset();
     _services.runLoop.async(whileAlive(&SpectrelModel::reloadScreens));
@@ -292,9 +285,9 @@ void SpectrelModel::reloadScreens()
 
 NodeRef SpectrelModel::topLevelNodes()
 {
-    if (_nodes || !_logGenerator)
+    if (_nodes || !_display.generator())
         return _nodes;
-    const Value display = _logGenerator->generateLogUsingState(*_state);
+    const Value display = _display.build();
     _nodesByPath = std::make_unique<PathIndex>();
     _nodes = SpectrelModelNode::makeTreeFromObject(display, *_nodesByPath);
     return _nodes;
@@ -309,17 +302,12 @@ NodeRef SpectrelModel::nodeAtPath(std::string_view path)
 
 ListRef SpectrelModel::getSaveContents()
 {
-    return _logGenerator ? _logGenerator->getSaveContentsFromState(*_state) : nullptr;
+    return _display.saveContents();
 }
 
 ListRef SpectrelModel::getLastContents()
 {
-    if (!_logGenerator)
-        return nullptr;
-    if (!_messageInProgress.empty())
-        _logGenerator->keepRawMessage(_messageInProgress);
-    _logGenerator->generateLogUsingState(*_state);
-    return getSaveContents();
+    return _display.lastContents();
 }
 
 } // namespace spectrel

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "LogGenerator/GeneratorSlot.h"
+#include "Monitor/DisplayState.h"
 #include "Monitor/MonitorModel.h"
 #include "Monitor/SpectrelModelNode.h"
 #include "Platform/MessagePort.h"
@@ -87,18 +87,23 @@ public:
     /// message being applied, if one is.
     ListRef getLastContents();
 
+    /// What the messages are decoded into; who wants to hear of the changes asks there.
+    DisplayState& displayState()
+    {
+        return _display;
+    }
     const Dictionary& state() const
     {
-        return *_state;
+        return _display.state();
     }
     const LogGenerator* logGenerator() const
     {
-        return _logGenerator.get();
+        return _display.generator();
     }
     /// The message being applied right now; empty otherwise.
     ByteView messageInProgress() const
     {
-        return _messageInProgress;
+        return _display.messageInProgress();
     }
     /// The technology value that the service answered last; empty before.
     const std::string& technology() const
@@ -125,16 +130,13 @@ private:
     bool _announcedConnected = false; // what the observer was told last
     std::string _announcedReason;
     std::string _technology;
-    ByteView _messageInProgress;
     std::shared_ptr<bool> _alive; // jobs on the queue hold it weakly: they end with the model
 
     std::shared_ptr<LocalMessagePort> _recvPort;
     std::shared_ptr<RemoteMessagePort> _sendPort;
     std::unique_ptr<Timer> _displayUpdateTimer;
-    bool _updated = false;
     std::size_t _intake = 0; // bytes applied since the last refresh
-    GeneratorSlot _logGenerator;
-    DictionaryRef _state;
+    DisplayState _display;
     NodeRef _nodes;
     std::unique_ptr<PathIndex> _nodesByPath; // set and cleared together with the tree
 };

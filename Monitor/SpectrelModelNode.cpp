@@ -10,7 +10,6 @@ namespace {
 
 constexpr const char* RootName = "Spectrel";
 constexpr const char* RootPath = "/";
-constexpr const char* UnknownValue = "(unknown)";
 
 /// Builds the node of one value after all its descendants, so that of two nodes with one path the later stays.
 class TreeBuilder {
@@ -30,7 +29,7 @@ public:
         else if (const auto& list = value.list())
             node = std::make_shared<SpectrelModelTreeNode>(std::move(name), childrenOf(*list, path));
         else
-            node = std::make_shared<SpectrelModelLeafNode>(std::move(name), UnknownValue);
+            node = std::make_shared<SpectrelModelLeafNode>(std::move(name), std::string(UnknownText));
         _index[path] = node;
         return node;
     }

@@ -23,6 +23,9 @@ NodeRef nodeInIndex(const PathIndex& index, std::string_view path);
 /// A path with one more component, joined by exactly one "/".
 std::string pathByAppending(std::string_view path, std::string_view component);
 
+/// What a leaf that is no text shows.
+inline constexpr std::string_view UnknownText = "(unknown)";
+
 /// One node of the display tree. Nodes never change; a rebuild makes a new tree.
 class SpectrelModelNode {
 public:

@@ -106,6 +106,8 @@ void Dictionary::set(std::string_view key, Value value)
     if (value.isAbsent())
         return remove(key);
     const std::size_t position = positionOf(key);
+    if (_observer)
+        _observer->willStore(key, position == NotFound ? NoValue : _entries[position].value, value);
     if (position == NotFound)
         append(key, std::move(value));
     else
@@ -115,6 +117,8 @@ void Dictionary::set(std::string_view key, Value value)
 void Dictionary::setText(std::string_view key, std::string_view text)
 {
     const std::size_t position = positionOf(key);
+    if (_observer)
+        _observer->willStoreText(key, position == NotFound ? NoValue : _entries[position].value, text);
     if (position == NotFound)
         append(key, text);
     else
@@ -126,6 +130,8 @@ void Dictionary::remove(std::string_view key)
     const std::size_t position = positionOf(key);
     if (position == NotFound)
         return;
+    if (_observer)
+        _observer->willRemove(key, _entries[position].value);
     _index.reset(); // positions behind the gap move up
     _entries.erase(_entries.begin() + static_cast<std::ptrdiff_t>(position));
     _next = position;
@@ -133,6 +139,10 @@ void Dictionary::remove(std::string_view key)
 
 void Dictionary::removeAll()
 {
+    if (_observer) {
+        for (const Entry& entry : _entries)
+            _observer->willRemove(entry.key, entry.value);
+    }
     _index.reset();
     _entries.clear();
     _next = 0;

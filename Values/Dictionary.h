@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Values/ContainerObserver.h"
 #include "Values/Value.h"
 
 #include <cstddef>
@@ -7,6 +8,7 @@
 #include <memory>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 namespace spectrel {
@@ -50,8 +52,18 @@ public:
     void remove(std::string_view key);
     void removeAll();
 
-    /// A new dictionary with the same entries; containers inside stay shared.
+    /// A new dictionary with the same entries and no observer; containers inside stay shared.
     DictionaryRef copy() const;
+
+    /// At most one observer; null takes it away.
+    void setObserver(std::unique_ptr<ContainerObserver> observer)
+    {
+        _observer = std::move(observer);
+    }
+    ContainerObserver* observer() const
+    {
+        return _observer.get();
+    }
 
 private:
     struct Index;
@@ -60,6 +72,7 @@ private:
     std::size_t append(std::string_view key, Value value);
 
     std::vector<Entry> _entries;
+    std::unique_ptr<ContainerObserver> _observer;
     mutable std::size_t _next = 0; // where the next search starts
     mutable std::unique_ptr<Index> _index; // positions in key order, only while large
 };

@@ -1,9 +1,12 @@
 #pragma once
 
+#include "Values/ContainerObserver.h"
 #include "Values/Value.h"
 
 #include <cstddef>
 #include <initializer_list>
+#include <memory>
+#include <utility>
 #include <vector>
 
 namespace spectrel {
@@ -38,14 +41,22 @@ public:
     void append(Value value);
     /// Removes `count` elements from the front, at most all.
     void removeFirst(std::size_t count);
-    void removeAll()
-    {
-        _elements.clear();
-    }
-    /// A new list with the same elements; containers inside stay shared.
+    void removeAll();
+    /// A new list with the same elements and no observer; containers inside stay shared.
     ListRef copy() const;
 
+    /// At most one observer; null takes it away.
+    void setObserver(std::unique_ptr<ContainerObserver> observer)
+    {
+        _observer = std::move(observer);
+    }
+    ContainerObserver* observer() const
+    {
+        return _observer.get();
+    }
+
 private:
+    std::unique_ptr<ContainerObserver> _observer;
     std::vector<Value> _elements;
 };
 

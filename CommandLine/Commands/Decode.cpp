@@ -17,6 +17,7 @@ public:
     explicit Decoding(const DecodeOptions& options)
         : _options(options)
         , _session(options.snapshotDirectory.has_value())
+        , _journal(printsChanges(options.format) ? &_session.displayState().followChanges() : nullptr)
         , _output(stdout, options.format)
     {
     }
@@ -87,8 +88,8 @@ private:
         }
         if (_options.each)
             _output.printNumberedJson(n, _session.display());
-        else
-            _output.printChanges(n, message.time, _session.display());
+        else if (_journal)
+            _output.printChanges(n, message.time, _session.display(), *_journal);
         return true;
     }
 
@@ -101,6 +102,7 @@ private:
 
     const DecodeOptions& _options;
     OfflineSession _session;
+    Journal* const _journal; // where changes are printed
     OutputWriter _output;
     std::uint64_t _n = 0;
     int _status = 0;

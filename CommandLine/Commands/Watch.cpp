@@ -17,6 +17,7 @@ public:
         : _options(options)
         , _output(stdout, options.format)
         , _model(_live.services(), *this, LiveServices::portPrefixFor("Watch"))
+        , _journal(printsChanges(options.format) ? &_model.displayState().followChanges() : nullptr)
     {
     }
     ~Watching() override
@@ -43,7 +44,8 @@ public:
         _output.printDisplay(display);
         if (_options.format == OutputFormat::Tree)
             _output.printLine("");
-        _output.printChanges(_refreshes, Clock::installed().now(), display);
+        if (_journal)
+            _output.printChanges(_refreshes, Clock::installed().now(), display, *_journal);
         if (!_output.flush()) {
             report("standard output: cannot be written");
             _status = 1;
@@ -64,6 +66,7 @@ private:
     LiveServices _live;
     OutputWriter _output;
     SpectrelModel _model;
+    Journal* const _journal; // where changes are printed
     std::uint64_t _refreshes = 0;
     int _status = 0;
 };

@@ -1,45 +1,64 @@
 #pragma once
 
+#include "Monitor/Journal.h"
 #include "Values/Value.h"
 
+#include <cstdint>
 #include <functional>
+#include <memory>
 #include <string>
 #include <string_view>
 #include <vector>
 
 namespace spectrel {
 
-/// Tells which leaves of the display have changed since it was looked at last.
+/// Reports which leaves of the display have changed since it was looked at last.
 ///
-/// Keeps a shadow of the display and walks both at once, so that an unchanged leaf costs a comparison and no path.
+/// Keeps a shadow of the display, and looks again only into the containers that the journal has seen change. The cost
+/// grows with what they and those above them hold, whatever the order of their keys.
 class DisplayChanges {
 public:
     /// A leaf's path as in the display tree, and its value; null for a leaf that went away.
     using Report = std::function<void(const std::string& path, const std::string* value)>;
 
     /// Reports new and changed leaves in display order, and within each container then those that went away.
-    /// Where leaves share a path (two fingers on one pilot), each change is told, and what the last one holds is told
-    /// last. An absent display has no leaves.
-    void update(const Value& display, const Report& report);
+    /// Where leaves share a path (two fingers on one pilot), each change is reported, and what the last one holds is
+    /// reported last. An absent display has no leaves. The journal follows the display.
+    void update(const Value& display, Journal& journal, const Report& report);
+
+    /// How many names were compared to find the shadows of containers' children so far: what the updates cost.
+    std::uint64_t comparisons() const
+    {
+        return _comparisons;
+    }
 
 private:
+    struct Shadow;
+    using ShadowRef = std::unique_ptr<Shadow>;
+    using ShadowList = std::vector<ShadowRef>;
+
     struct Shadow {
         std::string name;
         std::string value; // of a leaf
         bool isLeaf = false;
-        bool isTold = false; // in this update
-        std::vector<Shadow> children;
+        bool isReported = false; // in this update
+        std::uint64_t container = 0; // the journal's number of the container it was made from
+        ShadowList children;
     };
+    class FormerChildren;
 
     void updateNode(Shadow& shadow, bool isNew, const Value& value, const Report& report);
+    void updateContainer(Shadow& shadow, bool isNew, const Value& value, const Report& report);
+    void updateBelow(Shadow& shadow, const Value& value, const Report& report);
     void updateChildren(Shadow& shadow, const Value& value, const Report& report);
-    Shadow& shadowOf(Shadow& parent, std::size_t position, std::string_view name, bool& isNew);
-    void settleNamesakes(Shadow& parent, std::size_t count, const std::string& parentPath, const Report& report);
+    void settleNamesakes(Shadow& parent, std::size_t count, const Report& report);
     void reportGone(const Shadow& shadow, const Report& report);
 
     Shadow _root;
     bool _isShown = false;
-    std::string _path; // of the container being walked
+    std::string _path; // of the node being looked at
+    std::uint64_t _period = 0; // of the journal, since the last update
+    std::uint64_t _comparisons = 0;
 };
 
 } // namespace spectrel

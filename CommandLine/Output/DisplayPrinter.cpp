@@ -1,6 +1,7 @@
 #include "CommandLine/Output/DisplayPrinter.h"
 
 #include "Monitor/DisplayOrder.h"
+#include "Monitor/SpectrelModelNode.h"
 #include "Monitor/TreeText.h"
 #include "Values/List.h"
 
@@ -56,7 +57,7 @@ void appendNode(std::string_view name, const Value& value, std::size_t depth, st
         appendTreeLine(name, nullptr, depth, out);
         return appendChildren(value, depth + 1, out);
     }
-    const std::string_view text = value.string() ? std::string_view(*value.string()) : std::string_view(UnknownText);
+    const std::string_view text = value.string() ? std::string_view(*value.string()) : UnknownText;
     appendTreeLine(name, &text, depth, out);
 }
 
@@ -66,7 +67,7 @@ void appendTree(const Value& display, std::string& out)
 {
     if (display.dictionary() || display.list())
         return appendChildren(display, 0, out);
-    appendPlain(display.string() ? std::string_view(*display.string()) : std::string_view(UnknownText), out);
+    appendPlain(display.string() ? std::string_view(*display.string()) : UnknownText, out);
     out += '\n';
 }
 
@@ -90,7 +91,7 @@ void appendJson(const Value& display, std::string& out)
         }
         out += ']';
     } else {
-        appendJsonText(display.string() ? std::string_view(*display.string()) : std::string_view(UnknownText), out);
+        appendJsonText(display.string() ? std::string_view(*display.string()) : UnknownText, out);
     }
 }
 

@@ -6,9 +6,6 @@
 
 namespace spectrel {
 
-/// What is printed for an absent display, and for a value that is neither text nor container.
-inline constexpr const char* UnknownText = "(unknown)";
-
 /// Appends the display tree, indented, one line a node, for people. Control characters are shown escaped.
 void appendTree(const Value& display, std::string& out);
 

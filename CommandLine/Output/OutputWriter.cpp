@@ -82,11 +82,9 @@ void OutputWriter::printNumberedJson(std::uint64_t n, const Value& display)
     flushWhenLarge();
 }
 
-void OutputWriter::printChanges(std::uint64_t n, Moment time, const Value& display)
+void OutputWriter::printChanges(std::uint64_t n, Moment time, const Value& display, Journal& journal)
 {
-    if (_format != OutputFormat::Changes && _format != OutputFormat::Csv)
-        return;
-    _changes.update(display, [&](const std::string& path, const std::string* value) {
+    _changes.update(display, journal, [&](const std::string& path, const std::string* value) {
         if (_format == OutputFormat::Csv) {
             _gathered += std::to_string(n) + "," + timeText(time) + ",";
             appendCsvField(path, _gathered);

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CommandLine/Output/DisplayChanges.h"
+#include "Monitor/Journal.h"
 #include "Platform/Clock.h"
 #include "Values/Value.h"
 
@@ -17,6 +18,12 @@ enum class OutputFormat : std::uint8_t { Tree, Json, Changes, Csv, None };
 /// "tree", "json", "changes", "csv", "none".
 std::optional<OutputFormat> outputFormatNamed(std::string_view name);
 
+/// Whether displays are printed as their changes.
+constexpr bool printsChanges(OutputFormat format)
+{
+    return format == OutputFormat::Changes || format == OutputFormat::Csv;
+}
+
 /// Prints displays in one format to a stream, in large writes.
 class OutputWriter {
 public:
@@ -27,8 +34,8 @@ public:
     void printDisplay(const Value& display);
     /// {"n": N, "display": ...} on one line.
     void printNumberedJson(std::uint64_t n, const Value& display);
-    /// What has changed since the last call, in Changes or Csv form. Nothing for the other formats.
-    void printChanges(std::uint64_t n, Moment time, const Value& display);
+    /// What has changed since the last call, in Changes or Csv form; the journal follows the display.
+    void printChanges(std::uint64_t n, Moment time, const Value& display, Journal& journal);
     void printLine(std::string_view line);
     /// Writes out what has gathered. False once the stream has failed (a full disk, a closed pipe).
     bool flush();

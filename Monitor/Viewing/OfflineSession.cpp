@@ -19,10 +19,7 @@ OfflineSession::OfflineSession(bool keepsHistory)
 
 void OfflineSession::useTechnology(Technology technology)
 {
-    auto generator = LogGenerator::generatorFromTechnology(technologyConstant(technology));
-    if (_generator && generator && generator->className() == _generator->className())
-        return; // the session simply goes on
-    _generator.replace(std::move(generator), _state, _updated);
+    _display.useTechnology(technologyConstant(technology), DisplayState::SameClass::GoesOn);
 }
 
 void OfflineSession::apply(const RecordedMessage& message)
@@ -34,24 +31,23 @@ void OfflineSession::apply(const RecordedMessage& message)
         runTicksBefore(time);
     _last = time;
     _clock.set(time);
-    _updated = true;
-    _generator->updateState(_state, message.body);
+    try {
+        _display.apply(message.body, time);
+    } catch (...) {
+        _display.finishMessage();
+        throw;
+    }
     _rawBytes += message.body.size();
     if (!_keepsHistory && _rawBytes > RawLot) {
-        _generator->discardRawMessages();
+        _display.generator()->discardRawMessages();
         _rawBytes = 0;
     }
-}
-
-const Value& OfflineSession::display() const
-{
-    return _state[StateKey::Display];
 }
 
 /// Of the ticks up to the message only the first finds anything new; the others are idle.
 void OfflineSession::runTicksBefore(Moment time)
 {
-    if (!_updated)
+    if (!_display.hasNews())
         return;
     const auto interval = std::chrono::duration_cast<std::chrono::microseconds>(SpectrelModel::RefreshInterval);
     const auto elapsed = _last - _first;
@@ -64,8 +60,8 @@ void OfflineSession::runTicksBefore(Moment time)
 void OfflineSession::refresh(Moment time)
 {
     _clock.set(time);
-    _generator->generateLogUsingState(_state);
-    _updated = false;
+    _display.build();
+    _display.takeNews();
 }
 
 bool OfflineSession::saveSnapshot(const std::string& directory, std::string& reason)
@@ -75,7 +71,7 @@ bool OfflineSession::saveSnapshot(const std::string& directory, std::string& rea
         return false;
     }
     refresh(_last);
-    const auto snapshot = makeSnapshot(_last, _generator->getSaveContentsFromState(_state), "");
+    const auto snapshot = makeSnapshot(_last, _display.saveContents(), "");
     const std::string path = snapshotPath(directory, _last);
     if (writeSnapshot(snapshot, path, reason))
         return true;

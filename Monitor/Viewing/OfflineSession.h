@@ -1,9 +1,9 @@
 #pragma once
 
-#include "LogGenerator/GeneratorSlot.h"
+#include "Monitor/DisplayState.h"
 #include "Monitor/Viewing/RecordingClock.h"
 #include "Records/Recording.h"
-#include "Values/Dictionary.h"
+#include "Values/Value.h"
 
 #include <cstdint>
 #include <string>
@@ -24,7 +24,14 @@ public:
     /// Passes on what the message raises.
     void apply(const RecordedMessage& message);
     /// The display as it stands; absent when there is none.
-    const Value& display() const;
+    const Value& display() const
+    {
+        return _display.display();
+    }
+    DisplayState& displayState()
+    {
+        return _display;
+    }
 
     /// Refreshes once more and writes the snapshot file, both at the last message's time. False, with `reason`, when it
     /// cannot be written.
@@ -36,11 +43,9 @@ private:
 
     bool _keepsHistory;
     RecordingClock _clock;
-    Dictionary _state;
-    GeneratorSlot _generator;
+    DisplayState _display;
     std::uint64_t _messages = 0;
     std::size_t _rawBytes = 0; // kept by the generator since it last let go of them
-    bool _updated = false; // since the last refresh
     Moment _first {};
     Moment _last {};
 };

@@ -1,5 +1,6 @@
 #include "CommandLine/Output/DisplayChanges.h"
 
+#include "LogGenerator/LogGenerator.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
 
@@ -12,12 +13,26 @@ class DisplayChangesTest : public testing::Test {
 protected:
     std::string update(const Value& display)
     {
+        state->set(StateKey::Display, display);
+        journal.finishMessage();
         std::string text;
-        changes.update(display, [&text](const std::string& path, const std::string* value) {
-            text += path + (value ? "=" + *value : " gone") + "\n";
-        });
+        changes.update(
+            (*state)[StateKey::Display], journal, [&text](const std::string& path, const std::string* value) {
+                text += path + (value ? "=" + *value : " gone") + "\n";
+            });
         return text;
     }
+    /// The display of so many keys, in their order or the other way round.
+    static DictionaryRef numbered(int count, bool isReversed)
+    {
+        auto display = Dictionary::make();
+        for (int index = 0; index < count; ++index)
+            display->set(std::to_string(isReversed ? count - index : index + 1), "x");
+        return display;
+    }
+
+    const DictionaryRef state = Dictionary::make();
+    Journal journal {state};
     DisplayChanges changes;
 };
 
@@ -119,6 +134,42 @@ TEST_F(DisplayChangesTest, DisplayThatIsATextIsTheRootLeaf)
 {
     EXPECT_EQ(update("text"), "/=text\n");
     EXPECT_EQ(update("other"), "/=other\n");
+}
+
+TEST_F(DisplayChangesTest, ContainersThatHaveNotChangedAreNotLookedInto)
+{
+    const auto changing = Dictionary::make({{"a", "1"}, {"b", "2"}});
+    const auto display = Dictionary::make({{"Large", numbered(1000, false)}, {"Small", changing}});
+    update(display);
+    const std::uint64_t before = changes.comparisons();
+    changing->setText("a", "1");
+    EXPECT_EQ(update(display), "");
+    EXPECT_EQ(changes.comparisons(), before);
+    changing->setText("b", "3");
+    EXPECT_EQ(update(display), "/Small/b=3\n");
+    EXPECT_EQ(changes.comparisons(), before + 4);
+}
+
+TEST_F(DisplayChangesTest, ContainerAtTwoPlacesChangesAtBoth)
+{
+    const auto shared = Dictionary::make({{"a", "1"}});
+    const auto display = Dictionary::make({{"X", shared}, {"Y", Dictionary::make({{"Z", shared}})}});
+    update(display);
+    shared->setText("a", "2");
+    EXPECT_EQ(update(display), "/X/a=2\n/Y/Z/a=2\n");
+    display->set("X", "text");
+    shared->setText("a", "3");
+    EXPECT_EQ(update(display), "/X/a gone\n/X=text\n/Y/Z/a=3\n");
+}
+
+TEST_F(DisplayChangesTest, ReorderedKeysCostAFewComparisonsEach)
+{
+    constexpr int Keys = 20000;
+    for (int message = 0; message < 4; ++message) {
+        const std::uint64_t before = changes.comparisons();
+        EXPECT_EQ(update(numbered(Keys, message % 2 == 1)).empty(), message > 0);
+        EXPECT_LE(changes.comparisons() - before, 4 * Keys);
+    }
 }
 
 } // namespace
