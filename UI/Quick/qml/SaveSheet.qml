@@ -211,7 +211,7 @@ Popup {
                     elide: Text.ElideRight
                     Accessible.ignored: true
                 }
-                Glyph {
+                Icon {
                     id: mark
                     objectName: "checkmark"
                     anchors.right: parent.right
@@ -220,7 +220,7 @@ Popup {
                     width: 18
                     height: 18
                     visible: entry.isChecked
-                    shape: Glyph.Checkmark
+                    shape: Icon.Checkmark
                     color: Theme.accent
                     Accessible.ignored: true
                 }
