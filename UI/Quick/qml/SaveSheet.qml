@@ -58,10 +58,10 @@ Popup {
         Keys.onEscapePressed: sheet.save?.cancel()
         Keys.onBackPressed: sheet.save?.cancel()
         Keys.onPressed: event => {
-            if (event.key === Qt.Key_S && event.modifiers & Qt.ControlModifier) {
-                event.accepted = true;
+            const key = KeyMap.nameOf(event.key, event.modifiers, event.text);
+            event.accepted = KeyMap.actionOf(key) === KeyMap.Save;
+            if (event.accepted)
                 sheet.save?.save();
-            }
         }
 
         Item { id: nobody; focus: true } // has the focus while the description has not
