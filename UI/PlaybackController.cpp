@@ -57,6 +57,44 @@ std::string PlaybackController::messagesText() const
     return "message " + std::to_string(_playback.messagesApplied()) + " of " + std::to_string(_playback.messageCount());
 }
 
+bool PlaybackController::press(std::string_view key, KeyTaker taker)
+{
+    const auto action = actionOf(key, taker, KeyScope::Playing);
+    if (action)
+        perform(*action, key);
+    return action.has_value();
+}
+
+void PlaybackController::perform(KeyAction action, std::string_view key)
+{
+    switch (action) {
+    case KeyAction::PlayOrPause:
+        return togglePlaying();
+    case KeyAction::NextMessage:
+        return stepMessage(Direction::Forward);
+    case KeyAction::PreviousMessage:
+        return stepMessage(Direction::Backward);
+    case KeyAction::NextTick:
+        return stepTick(Direction::Forward);
+    case KeyAction::PreviousTick:
+        return stepTick(Direction::Backward);
+    case KeyAction::SeekForward:
+        return seekStep(Direction::Forward);
+    case KeyAction::SeekBackward:
+        return seekStep(Direction::Backward);
+    case KeyAction::SeekToTenth:
+        return seekToFraction((key.front() - '0') / 10.0);
+    case KeyAction::SeekToEnd:
+        return seekToFraction(1);
+    case KeyAction::Faster:
+        return changeSpeed(Direction::Forward);
+    case KeyAction::Slower:
+        return changeSpeed(Direction::Backward);
+    default:
+        return;
+    }
+}
+
 void PlaybackController::togglePlaying()
 {
     if (_playback.isPlaying())

@@ -1,9 +1,11 @@
 #pragma once
 
 #include "Monitor/Playback.h"
+#include "UI/KeyTable.h"
 
 #include <chrono>
 #include <string>
+#include <string_view>
 
 namespace spectrel {
 
@@ -39,6 +41,8 @@ public:
         return _playback.notice();
     }
 
+    /// A key of the time line; false when it is none.
+    bool press(std::string_view key, KeyTaker taker);
     void togglePlaying();
     void stepMessage(Direction direction)
     {
@@ -56,6 +60,8 @@ public:
     void changeSpeed(Direction direction);
 
 private:
+    void perform(KeyAction action, std::string_view key);
+
     Playback& _playback;
 };
 

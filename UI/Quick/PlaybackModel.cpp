@@ -51,6 +51,11 @@ QString PlaybackModel::messagesText() const
     return controller() ? shownText(controller()->messagesText()) : QString();
 }
 
+bool PlaybackModel::press(const QString& key)
+{
+    return controller() && controller()->press(key.toStdString(), KeyTaker::Window);
+}
+
 void PlaybackModel::togglePlaying()
 {
     if (controller())
@@ -61,12 +66,6 @@ void PlaybackModel::stepMessage(int by)
 {
     if (controller())
         controller()->stepMessage(direction(by));
-}
-
-void PlaybackModel::stepTick(int by)
-{
-    if (controller())
-        controller()->stepTick(direction(by));
 }
 
 void PlaybackModel::seekStep(int by)

@@ -32,10 +32,11 @@ public:
     QString timeText() const;
     QString messagesText() const;
 
+    /// A key of the time line; false when it is none, or nothing is played.
+    Q_INVOKABLE bool press(const QString& key);
     // `by` is -1 or 1.
     Q_INVOKABLE void togglePlaying();
     Q_INVOKABLE void stepMessage(int by);
-    Q_INVOKABLE void stepTick(int by);
     Q_INVOKABLE void seekStep(int by);
     Q_INVOKABLE void seekToFraction(double fraction);
     Q_INVOKABLE void changeSpeed(int by);

@@ -23,7 +23,7 @@ struct Style {
 
 /// One place on the screen.
 struct GridCell {
-    std::array<char32_t, 4> text {U' '}; // as in Glyph
+    std::array<char32_t, 4> text {U' '}; // as in TerminalGlyph
     std::uint8_t columns = 1; // 0: covered by the wide glyph to its left
     Style style;
     friend bool operator==(const GridCell&, const GridCell&) = default;

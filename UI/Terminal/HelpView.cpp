@@ -1,6 +1,7 @@
 #include "UI/Terminal/HelpView.h"
 
 #include "UI/AboutText.h"
+#include "UI/KeyTable.h"
 #include "UI/Terminal/Box.h"
 
 #include <algorithm>
@@ -9,30 +10,16 @@ namespace spectrel {
 
 namespace {
 
-const std::vector<std::string> BrowsingKeys {
-    "Up Down  j k      move",
-    "PgUp PgDn         move a page",
-    "Home End          first, last row",
-    "Enter Right       open",
-    "Backspace Left    back (also Esc)",
-    "Right  h l        scroll a long value",
-    "/                 find a name or value here and below",
-    "n N               next, last find",
-    "y Y               copy the value, the whole pane",
-    "s                 save a snapshot, if allowed",
-    "Control-L         draw again",
-    "?                 this list",
-    "q                 quit",
-};
+constexpr std::size_t KeysWidth = 18; // columns of the keys, before what they do
 
-const std::vector<std::string> PlayingKeys {
-    "Space             play, pause",
-    ". ,               next, last message",
-    "] [               next, last tick (2 s)",
-    "> <               10 s on, back",
-    "0 ... 9  $        to so many tenths, to the end",
-    "+ -               faster, slower",
-};
+void appendKeys(KeyScope scope, std::vector<std::string>& lines)
+{
+    for (const KeyLine& line : keyTable(scope)) {
+        std::string keys(line.keys);
+        keys.resize(KeysWidth, ' ');
+        lines.push_back(keys.append(line.help));
+    }
+}
 
 } // namespace
 
@@ -42,10 +29,10 @@ void HelpView::open(bool plays)
     _top = 0;
     _lines = {"Keys", ""};
     if (plays) {
-        _lines.insert(_lines.end(), PlayingKeys.begin(), PlayingKeys.end());
+        appendKeys(KeyScope::Playing, _lines);
         _lines.emplace_back();
     }
-    _lines.insert(_lines.end(), BrowsingKeys.begin(), BrowsingKeys.end());
+    appendKeys(KeyScope::Browsing, _lines);
     const AboutText about = AboutText::text();
     _lines.insert(_lines.end(), {"", about.name + " " + about.version, about.summary});
 }

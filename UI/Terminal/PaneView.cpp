@@ -104,59 +104,55 @@ bool PaneView::scrollSideways(SpectrelPaneController& pane, double columns) cons
 
 // ---- Input
 
-void PaneView::handle(const KeyEvent& event, int height, NavigationController& navigation)
+void PaneView::perform(KeyAction action, int height, NavigationController& navigation)
 {
     const auto pane = _pane.lock();
     if (!pane)
         return;
     const int rows = Layout(height).rows;
     settle(*pane, rows);
-    const NodeRef child = pane->childAtRow(_cursor);
-    const bool isLeaf = child && !child->childNodes();
     const std::ptrdiff_t page = std::max(rows - 1, 1);
-    switch (event.key) {
-    case Key::Up:
+    switch (action) {
+    case KeyAction::RowUp:
         return move(*pane, -1, rows);
-    case Key::Down:
+    case KeyAction::RowDown:
         return move(*pane, 1, rows);
-    case Key::PageUp:
+    case KeyAction::PageUp:
         return move(*pane, -page, rows);
-    case Key::PageDown:
+    case KeyAction::PageDown:
         return move(*pane, page, rows);
-    case Key::Home:
+    case KeyAction::FirstRow:
         return moveTo(*pane, 0, rows);
-    case Key::End:
+    case KeyAction::LastRow:
         return moveTo(*pane, pane->numberOfRows(), rows);
-    case Key::Enter:
+    case KeyAction::Open:
         return pane->tableView().selectRow(_cursor);
-    case Key::Right:
-        if (isLeaf)
-            scrollSideways(*pane, SidewaysStep);
+    case KeyAction::Back:
+        return navigation.popViewController(Animation::Animated);
+    default:
+        return performSideways(action, *pane, navigation);
+    }
+}
+
+void PaneView::performSideways(KeyAction action, SpectrelPaneController& pane, NavigationController& navigation) const
+{
+    const NodeRef child = pane.childAtRow(_cursor);
+    switch (action) {
+    case KeyAction::Forward:
+        if (child && !child->childNodes())
+            scrollSideways(pane, SidewaysStep);
         else
-            pane->tableView().selectRow(_cursor);
+            pane.tableView().selectRow(_cursor);
         return;
-    case Key::ShiftRight:
-        scrollSideways(*pane, SidewaysStep);
-        return;
-    case Key::ShiftLeft:
-        scrollSideways(*pane, -SidewaysStep);
-        return;
-    case Key::Left: // back to the value's beginning first, where Right has moved it
-        if (!scrollSideways(*pane, -SidewaysStep))
+    case KeyAction::Backward: // back to the value's beginning first, where Forward has moved it
+        if (!scrollSideways(pane, -SidewaysStep))
             navigation.popViewController(Animation::Animated);
         return;
-    case Key::Backspace:
-    case Key::Escape:
-        return navigation.popViewController(Animation::Animated);
-    case Key::Character:
-        if (event.character == U'j')
-            move(*pane, 1, rows);
-        else if (event.character == U'k')
-            move(*pane, -1, rows);
-        else if (event.character == U'l')
-            scrollSideways(*pane, SidewaysStep);
-        else if (event.character == U'h')
-            scrollSideways(*pane, -SidewaysStep);
+    case KeyAction::ScrollRight:
+        scrollSideways(pane, SidewaysStep);
+        return;
+    case KeyAction::ScrollLeft:
+        scrollSideways(pane, -SidewaysStep);
         return;
     default:
         return;

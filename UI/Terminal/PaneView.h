@@ -1,5 +1,6 @@
 #pragma once
 
+#include "UI/KeyTable.h"
 #include "UI/NavigationController.h"
 #include "UI/SpectrelPaneController.h"
 #include "UI/Terminal/Grid.h"
@@ -47,7 +48,7 @@ public:
     /// The row under the cursor; absent in an empty pane.
     std::optional<std::size_t> cursorRow(int height);
     /// `height` is as in `Surroundings`.
-    void handle(const KeyEvent& event, int height, NavigationController& navigation);
+    void perform(KeyAction action, int height, NavigationController& navigation);
     void handle(const MouseEvent& event, int height, NavigationController& navigation);
     /// Presses the toolbar's save button, where there is one.
     static void pressSaveButton(SpectrelPaneController& pane);
@@ -75,6 +76,7 @@ private:
     void moveTo(SpectrelPaneController& pane, std::size_t row, int rows);
     void move(SpectrelPaneController& pane, std::ptrdiff_t by, int rows);
     void scroll(SpectrelPaneController& pane, std::ptrdiff_t by, int rows);
+    void performSideways(KeyAction action, SpectrelPaneController& pane, NavigationController& navigation) const;
     bool scrollSideways(SpectrelPaneController& pane, double columns) const;
     void drawTitle(Grid& grid, const SpectrelPaneController& pane, bool isRoot) const;
     void drawRow(Grid& grid, int y, const SpectrelCell& cell) const;

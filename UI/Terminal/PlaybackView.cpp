@@ -34,50 +34,6 @@ void PlaybackView::draw(Grid& grid, int y, const PlaybackController& controller)
             column < done ? Style {.tint = Tint::Accent} : Style {.isFaint = true});
 }
 
-bool PlaybackView::handle(const KeyEvent& event, PlaybackController& controller)
-{
-    if (event.key != Key::Character)
-        return false;
-    switch (event.character) {
-    case U' ':
-        controller.togglePlaying();
-        return true;
-    case U'.':
-        controller.stepMessage(Direction::Forward);
-        return true;
-    case U',':
-        controller.stepMessage(Direction::Backward);
-        return true;
-    case U']':
-        controller.stepTick(Direction::Forward);
-        return true;
-    case U'[':
-        controller.stepTick(Direction::Backward);
-        return true;
-    case U'>':
-        controller.seekStep(Direction::Forward);
-        return true;
-    case U'<':
-        controller.seekStep(Direction::Backward);
-        return true;
-    case U'+':
-    case U'=': // the same key without Shift
-        controller.changeSpeed(Direction::Forward);
-        return true;
-    case U'$':
-        controller.seekToFraction(1);
-        return true;
-    case U'-':
-        controller.changeSpeed(Direction::Backward);
-        return true;
-    default:
-        if (event.character < U'0' || event.character > U'9')
-            return false;
-        controller.seekToFraction(static_cast<double>(event.character - U'0') / 10);
-        return true;
-    }
-}
-
 void PlaybackView::press(int x, PlaybackController& controller) const
 {
     if (x < _bar.left || x >= _bar.right)

@@ -2,7 +2,6 @@
 
 #include "UI/PlaybackController.h"
 #include "UI/Terminal/Grid.h"
-#include "UI/Terminal/TerminalInput.h"
 
 namespace spectrel {
 
@@ -10,8 +9,6 @@ namespace spectrel {
 class PlaybackView {
 public:
     void draw(Grid& grid, int y, const PlaybackController& controller);
-    /// False when the key is none of the time line's.
-    static bool handle(const KeyEvent& event, PlaybackController& controller);
     /// A press on the bar seeks, one beside it plays or pauses.
     void press(int x, PlaybackController& controller) const;
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <string>
 #include <variant>
 
 namespace spectrel {
@@ -32,6 +33,9 @@ struct KeyEvent {
     char32_t character = 0;
     friend bool operator==(const KeyEvent&, const KeyEvent&) = default;
 };
+
+/// The key's name in the key table; empty for a key without one.
+std::string keyName(const KeyEvent& event);
 
 struct MouseEvent {
     enum class Action { Press, WheelUp, WheelDown };

@@ -115,49 +115,51 @@ bool TerminalScreen::coverTakes(const MouseEvent& event)
     return true;
 }
 
-bool TerminalScreen::handleGlobally(SpectrelApp& app, PaneView& view, const KeyEvent& event)
+void TerminalScreen::handleOnPane(SpectrelApp& app, PaneView& view, const KeyEvent& event)
 {
-    if (event.key != Key::Character)
-        return false;
-    const SpectrelPaneController& pane = *app.navController()->topViewController();
-    switch (event.character) {
-    case U'q':
-        _terminal.quit();
-        return true;
-    case U'?':
-        _help.open(app.playback() != nullptr);
-        return true;
-    case U's':
-        PaneView::pressSaveButton(*app.navController()->topViewController());
-        return true;
-    case U'/':
-        app.find()->open();
-        return true;
-    case U'n':
+    const std::string key = keyName(event);
+    if (app.playback() && app.playback()->press(key, KeyTaker::Terminal))
+        return;
+    if (const auto action = actionOf(key, KeyTaker::Terminal, KeyScope::Browsing))
+        perform(*action, app, view);
+}
+
+/// What concerns the whole screen; the rest is the pane's.
+void TerminalScreen::perform(KeyAction action, SpectrelApp& app, PaneView& view)
+{
+    SpectrelPaneController& pane = *app.navController()->topViewController();
+    switch (action) {
+    case KeyAction::Quit:
+        return _terminal.quit();
+    case KeyAction::Help:
+        return _help.open(app.playback() != nullptr);
+    case KeyAction::Save:
+        return PaneView::pressSaveButton(pane);
+    case KeyAction::Find:
+        return app.find()->open();
+    case KeyAction::FindNext:
         app.find()->chooseNext();
-        return true;
-    case U'N':
+        return;
+    case KeyAction::FindPrevious:
         app.find()->choosePrevious();
-        return true;
-    case U'y':
+        return;
+    case KeyAction::CopyRow:
         if (const auto row = view.cursorRow(paneHeight(app)))
             app.copying()->copyRow(pane, *row);
-        return true;
-    case U'Y':
-        app.copying()->copyPane(pane);
-        return true;
+        return;
+    case KeyAction::CopyPane:
+        return app.copying()->copyPane(pane);
     default:
-        return app.playback() && PlaybackView::handle(event, *app.playback());
+        return view.perform(action, paneHeight(app), *app.navController());
     }
 }
 
-bool TerminalScreen::handleGlobally(SpectrelApp& app, PaneView&, const MouseEvent& event)
+void TerminalScreen::handleOnPane(SpectrelApp& app, PaneView& view, const MouseEvent& event)
 {
     if (event.y < paneHeight(app))
-        return false;
+        return view.handle(event, paneHeight(app), *app.navController());
     if (event.action == MouseEvent::Action::Press && app.playback())
         _playbackView.press(event.x, *app.playback());
-    return true;
 }
 
 template <typename Event> void TerminalScreen::dispatch(const Event& event)
@@ -173,8 +175,8 @@ template <typename Event> void TerminalScreen::dispatch(const Event& event)
         _saveView.handle(event, _grid.height(), *app->saveViewController());
     else if (app->find()->isOpen())
         _findView.handle(event, _grid.height(), *app->find());
-    else if (!handleGlobally(*app, *view, event))
-        view->handle(event, paneHeight(*app), *app->navController());
+    else
+        handleOnPane(*app, *view, event);
 }
 
 void TerminalScreen::handle(const InputEvent& event)

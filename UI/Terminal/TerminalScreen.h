@@ -1,5 +1,6 @@
 #pragma once
 
+#include "UI/KeyTable.h"
 #include "UI/ScreenToolkit.h"
 #include "UI/Terminal/FindView.h"
 #include "UI/Terminal/Grid.h"
@@ -55,8 +56,9 @@ private:
     template <typename Event> void dispatch(const Event& event);
     bool coverTakes(const KeyEvent& event);
     bool coverTakes(const MouseEvent& event);
-    bool handleGlobally(SpectrelApp& app, PaneView& view, const KeyEvent& event);
-    bool handleGlobally(SpectrelApp& app, PaneView& view, const MouseEvent& event);
+    void handleOnPane(SpectrelApp& app, PaneView& view, const KeyEvent& event);
+    void handleOnPane(SpectrelApp& app, PaneView& view, const MouseEvent& event);
+    void perform(KeyAction action, SpectrelApp& app, PaneView& view);
     int paneHeight(const SpectrelApp& app) const;
     void drawPane(SpectrelApp& app, PaneView& view);
 

@@ -80,7 +80,7 @@ char32_t shown(char32_t character)
 }
 
 /// Adds the marks that follow to the glyph and takes them off the text.
-void takeMarks(std::string_view& text, Glyph& glyph, std::size_t marks)
+void takeMarks(std::string_view& text, TerminalGlyph& glyph, std::size_t marks)
 {
     while (!text.empty()) {
         const Decoded next = decodeUTF8(text);
@@ -96,9 +96,9 @@ void takeMarks(std::string_view& text, Glyph& glyph, std::size_t marks)
 
 } // namespace
 
-std::optional<Glyph> takeGlyph(std::string_view& text)
+std::optional<TerminalGlyph> takeGlyph(std::string_view& text)
 {
-    Glyph glyph;
+    TerminalGlyph glyph;
     while (!text.empty()) {
         const Decoded first = decodeUTF8(text);
         if (isInvisible(first.character)) {

@@ -39,12 +39,12 @@ Popup {
         Keys.onReturnPressed: box.close()
         Keys.onEnterPressed: box.close()
 
-        Glyph {
+        Icon {
             objectName: "aboutMark"
             anchors.horizontalCenter: parent.horizontalCenter
             width: 48
             height: 48
-            shape: Glyph.Mark
+            shape: Icon.Mark
             color: Theme.accent
             Accessible.ignored: true
         }

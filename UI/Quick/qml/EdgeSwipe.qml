@@ -50,11 +50,11 @@ Item {
         border.width: edge.isFar ? 0 : 1
         border.color: Theme.line
 
-        Glyph {
+        Icon {
             anchors.centerIn: parent
             width: 24
             height: 24
-            shape: Glyph.Back
+            shape: Icon.Back
             color: edge.isFar ? Theme.accentText : Theme.accent
         }
     }

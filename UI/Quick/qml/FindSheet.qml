@@ -68,7 +68,7 @@ Popup {
             IconButton {
                 objectName: "findBack"
                 Layout.leftMargin: 4
-                shape: Glyph.Back
+                shape: Icon.Back
                 text: qsTr("Back")
                 onClicked: sheet.find.close()
             }
@@ -88,7 +88,7 @@ Popup {
             IconButton {
                 Layout.rightMargin: 4
                 enabled: field.text !== ""
-                shape: Glyph.Clear
+                shape: Icon.Clear
                 color: Theme.faint
                 size: 20
                 text: qsTr("Clear")
@@ -191,11 +191,11 @@ Popup {
                             elide: Text.ElideRight
                             Accessible.ignored: true
                         }
-                        Glyph {
+                        Icon {
                             visible: entry.isInner
                             implicitWidth: 15
                             implicitHeight: 15
-                            shape: Glyph.Disclosure
+                            shape: Icon.Disclosure
                             color: Theme.faint
                             Accessible.ignored: true
                         }

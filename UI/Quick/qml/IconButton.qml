@@ -26,7 +26,7 @@ T.AbstractButton {
         border.color: Theme.accent
     }
     contentItem: Item {
-        Glyph {
+        Icon {
             anchors.centerIn: parent
             width: button.size
             height: button.size

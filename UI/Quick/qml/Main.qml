@@ -90,24 +90,24 @@ ApplicationWindow {
     AlertBox { screen: window.screen }
 
     Shortcut {
-        sequences: [StandardKey.Save]
+        sequences: KeyMap.sequences(KeyMap.Save)
         onActivated: stack.currentItem?.pane.pressSaveButton()
     }
     Shortcut {
-        sequences: [StandardKey.Find]
+        sequences: KeyMap.sequences(KeyMap.Find)
         enabled: !window.screen.saveScreen
         onActivated: window.screen.find.open()
     }
     Shortcut {
-        sequences: [StandardKey.FindNext]
+        sequences: KeyMap.sequences(KeyMap.FindNext)
         onActivated: window.screen.find.chooseNext()
     }
     Shortcut {
-        sequences: [StandardKey.FindPrevious]
+        sequences: KeyMap.sequences(KeyMap.FindPrevious)
         onActivated: window.screen.find.choosePrevious()
     }
     Shortcut {
-        sequences: [StandardKey.Quit]
+        sequences: KeyMap.sequences(KeyMap.Quit)
         onActivated: window.screen.quit()
     }
 

@@ -106,59 +106,35 @@ FocusScope {
     }
 
     Keys.onPressed: event => {
-        if (event.matches(StandardKey.Copy)) {
-            event.accepted = true;
-            return copy();
-        }
-        if (event.modifiers & (Qt.ControlModifier | Qt.AltModifier | Qt.MetaModifier))
-            return;
-        event.accepted = true;
+        const key = KeyMap.nameOf(event.key, event.modifiers, event.text);
+        event.accepted = screen.playback.press(key) || perform(KeyMap.actionOf(key));
+    }
+
+    // False when the page does nothing at it.
+    function perform(action) {
         const perPage = Math.max(1, Math.floor(list.height / rowHeight) - 1);
-        switch (event.key) {
-        case Qt.Key_Up: return moveBy(-1);
-        case Qt.Key_Down: return moveBy(1);
-        case Qt.Key_PageUp: return moveBy(-perPage);
-        case Qt.Key_PageDown: return moveBy(perPage);
-        case Qt.Key_Home: return moveBy(-list.count);
-        case Qt.Key_End: return moveBy(list.count);
-        case Qt.Key_Return:
-        case Qt.Key_Enter: return open();
-        case Qt.Key_Space: return screen.playback.isThere ? screen.playback.togglePlaying() : open();
-        case Qt.Key_Right:
+        switch (action) {
+        case KeyMap.RowUp: moveBy(-1); break;
+        case KeyMap.RowDown: moveBy(1); break;
+        case KeyMap.PageUp: moveBy(-perPage); break;
+        case KeyMap.PageDown: moveBy(perPage); break;
+        case KeyMap.FirstRow: moveBy(-list.count); break;
+        case KeyMap.LastRow: moveBy(list.count); break;
+        case KeyMap.Open: open(); break;
+        case KeyMap.Forward:
             if (list.currentItem?.isInner)
                 open();
             else
                 pane.scrollSideways(list.currentIndex, sidewaysStep);
-            return;
-        case Qt.Key_Left:
+            break;
+        case KeyMap.Backward:
             if (!pane.scrollSideways(list.currentIndex, -sidewaysStep))
                 pane.goBack();
-            return;
-        case Qt.Key_Backspace:
-        case Qt.Key_Escape:
-        case Qt.Key_Back: return pane.goBack();
+            break;
+        case KeyMap.Back: pane.goBack(); break;
+        case KeyMap.Copy: copy(); break;
+        default: return false;
         }
-        event.accepted = screen.playback.isThere && playbackKey(event.text);
-    }
-
-    // The same keys as in the terminal.
-    function playbackKey(text) {
-        const playback = screen.playback;
-        switch (text) {
-        case ".": playback.stepMessage(1); return true;
-        case ",": playback.stepMessage(-1); return true;
-        case "]": playback.stepTick(1); return true;
-        case "[": playback.stepTick(-1); return true;
-        case ">": playback.seekStep(1); return true;
-        case "<": playback.seekStep(-1); return true;
-        case "+":
-        case "=": playback.changeSpeed(1); return true;
-        case "-": playback.changeSpeed(-1); return true;
-        case "$": playback.seekToFraction(1); return true;
-        }
-        if (text < "0" || text > "9")
-            return false;
-        playback.seekToFraction(parseInt(text) / 10);
         return true;
     }
 

@@ -145,7 +145,7 @@ Item {
             GradientStop { position: 1; color: Qt.rgba(card.shown.r, card.shown.g, card.shown.b, 0) }
         }
     }
-    Glyph {
+    Icon {
         id: disclosure
         objectName: "disclosure"
         visible: row.isInner
@@ -154,7 +154,7 @@ Item {
         anchors.verticalCenter: parent.verticalCenter
         width: 15
         height: 15
-        shape: Glyph.Disclosure
+        shape: Icon.Disclosure
         color: Theme.faint
         Accessible.ignored: true
     }

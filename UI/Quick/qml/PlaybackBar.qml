@@ -118,44 +118,44 @@ Rectangle {
 
         BarButton {
             objectName: "slower"
-            shape: Glyph.Minus
+            shape: Icon.Minus
             text: qsTr("Slower")
             onClicked: bar.playback.changeSpeed(-1)
         }
         BarButton {
             objectName: "seekBack"
-            shape: Glyph.SkipBack
+            shape: Icon.SkipBack
             text: qsTr("Ten seconds back")
             onClicked: bar.playback.seekStep(-1)
         }
         BarButton {
             objectName: "stepBack"
-            shape: Glyph.StepBack
+            shape: Icon.StepBack
             text: qsTr("One message back")
             onClicked: bar.playback.stepMessage(-1)
         }
         BarButton {
             objectName: "play"
-            shape: bar.playback.isPlaying ? Glyph.Pause : Glyph.Play
+            shape: bar.playback.isPlaying ? Icon.Pause : Icon.Play
             size: 26
             text: bar.playback.isPlaying ? qsTr("Pause") : qsTr("Play")
             onClicked: bar.playback.togglePlaying()
         }
         BarButton {
             objectName: "stepForward"
-            shape: Glyph.StepForward
+            shape: Icon.StepForward
             text: qsTr("One message on")
             onClicked: bar.playback.stepMessage(1)
         }
         BarButton {
             objectName: "seekForward"
-            shape: Glyph.SkipForward
+            shape: Icon.SkipForward
             text: qsTr("Ten seconds on")
             onClicked: bar.playback.seekStep(1)
         }
         BarButton {
             objectName: "faster"
-            shape: Glyph.Plus
+            shape: Icon.Plus
             text: qsTr("Faster")
             onClicked: bar.playback.changeSpeed(1)
         }

@@ -58,10 +58,10 @@ Popup {
         Keys.onEscapePressed: sheet.save?.cancel()
         Keys.onBackPressed: sheet.save?.cancel()
         Keys.onPressed: event => {
-            if (event.key === Qt.Key_S && event.modifiers & Qt.ControlModifier) {
-                event.accepted = true;
+            const key = KeyMap.nameOf(event.key, event.modifiers, event.text);
+            event.accepted = KeyMap.actionOf(key) === KeyMap.Save;
+            if (event.accepted)
                 sheet.save?.save();
-            }
         }
 
         Item { id: nobody; focus: true } // has the focus while the description has not
@@ -211,7 +211,7 @@ Popup {
                     elide: Text.ElideRight
                     Accessible.ignored: true
                 }
-                Glyph {
+                Icon {
                     id: mark
                     objectName: "checkmark"
                     anchors.right: parent.right
@@ -220,7 +220,7 @@ Popup {
                     width: 18
                     height: 18
                     visible: entry.isChecked
-                    shape: Glyph.Checkmark
+                    shape: Icon.Checkmark
                     color: Theme.accent
                     Accessible.ignored: true
                 }

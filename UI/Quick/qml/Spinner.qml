@@ -13,12 +13,12 @@ Item {
     Accessible.role: Accessible.Indicator
     Accessible.name: qsTr("Loading")
 
-    Glyph {
+    Icon {
         id: arc
         anchors.centerIn: parent
         width: 18
         height: 18
-        shape: Glyph.Arc
+        shape: Icon.Arc
         color: Theme.faint
 
         RotationAnimator on rotation {

@@ -57,7 +57,7 @@ Rectangle {
         IconButton {
             objectName: "save"
             visible: bar.pane.canSave
-            shape: Glyph.Save
+            shape: Icon.Save
             text: qsTr("Save snapshot")
             onClicked: bar.pane.pressSaveButton()
         }

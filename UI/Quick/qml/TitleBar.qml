@@ -22,15 +22,15 @@ Item {
         IconButton {
             objectName: "back"
             visible: !bar.pane.isRoot
-            shape: Glyph.Back
+            shape: Icon.Back
             text: qsTr("Back")
             onClicked: bar.backPressed()
         }
-        Glyph {
+        Icon {
             visible: bar.pane.isRoot
             implicitWidth: 26
             implicitHeight: 26
-            shape: Glyph.Mark
+            shape: Icon.Mark
             color: Theme.accent
             Accessible.ignored: true
         }
@@ -65,13 +65,13 @@ Item {
         }
         IconButton {
             objectName: "findButton"
-            shape: Glyph.Search
+            shape: Icon.Search
             text: qsTr("Find")
             onClicked: bar.findPressed()
         }
         IconButton {
             objectName: "menuButton"
-            shape: Glyph.More
+            shape: Icon.More
             text: qsTr("Menu")
             onClicked: bar.menuPressed()
         }

@@ -8,7 +8,7 @@
 namespace spectrel {
 
 /// A small sign in one colour, drawn as lines on a square of 24 by 24 units: crisp at any size and scale.
-class Glyph : public QQuickPaintedItem {
+class Icon : public QQuickPaintedItem {
     Q_OBJECT
     QML_ELEMENT
     Q_PROPERTY(Shape shape READ shape WRITE setShape NOTIFY changed)
@@ -36,7 +36,7 @@ public:
     };
     Q_ENUM(Shape)
 
-    explicit Glyph(QQuickItem* parent = nullptr);
+    explicit Icon(QQuickItem* parent = nullptr);
 
     Shape shape() const
     {

@@ -1,4 +1,4 @@
-#include "UI/Quick/Glyph.h"
+#include "UI/Quick/Icon.h"
 
 #include <QPainter>
 #include <QPolygonF>
@@ -54,9 +54,9 @@ struct Drawing {
     }
 };
 
-Drawing drawingOf(Glyph::Shape shape)
+Drawing drawingOf(Icon::Shape shape)
 {
-    using Shape = Glyph::Shape;
+    using Shape = Icon::Shape;
     Drawing drawing;
     switch (shape) {
     case Shape::Back:
@@ -101,13 +101,13 @@ Drawing drawingOf(Glyph::Shape shape)
 
 } // namespace
 
-Glyph::Glyph(QQuickItem* parent)
+Icon::Icon(QQuickItem* parent)
     : QQuickPaintedItem(parent)
 {
     setAntialiasing(true);
 }
 
-void Glyph::setShape(Shape shape)
+void Icon::setShape(Shape shape)
 {
     if (shape == _shape)
         return;
@@ -116,7 +116,7 @@ void Glyph::setShape(Shape shape)
     update();
 }
 
-void Glyph::setColor(const QColor& color)
+void Icon::setColor(const QColor& color)
 {
     if (color == _color)
         return;
@@ -125,7 +125,7 @@ void Glyph::setColor(const QColor& color)
     update();
 }
 
-void Glyph::paint(QPainter* painter)
+void Icon::paint(QPainter* painter)
 {
     const Drawing drawing = drawingOf(_shape);
     painter->setRenderHint(QPainter::Antialiasing);
