@@ -9,7 +9,7 @@ namespace spectrel::TelephonyProtocol {
 /// The service's well-known port.
 inline constexpr std::string_view ServicePort = "org.spectrel.Telephony";
 
-/// A wish for a log channel: {"CreateLogChannel": <local port name>} with this message id, answered by
+/// A request for a log channel: {"CreateLogChannel": <local port name>} with this message id, answered by
 /// {"Domain": integer, "Error": integer, "PortName": text}. The port name is the channel's, for requests of id 0.
 inline constexpr std::int32_t CreateLogChannelId = 1;
 inline constexpr const char* CreateLogChannelKey = "CreateLogChannel";
@@ -30,7 +30,7 @@ enum class ChannelError : std::int32_t {
 inline constexpr std::int32_t LogChannelId = 0;
 /// {"GetTechnology": "GetTechnology"}, answered by {"GetTechnology": <technology constant>}.
 inline constexpr const char* GetTechnologyKey = "GetTechnology";
-/// The start command: {"SetState": "Streaming"} with the wanted codes of the two streams, not answered.
+/// The start command: {"SetState": "Streaming"} with the codes to stream of either stream, not answered.
 inline constexpr const char* SetStateKey = "SetState";
 inline constexpr const char* StreamingState = "Streaming";
 inline constexpr const char* OrdinaryCodesKey = "SetZephyrLogCodes";

@@ -32,8 +32,8 @@ namespace UMTSThresholds {
 constexpr double QQualMin = -18; // dB
 constexpr double QRxLevMin = -115; // dBm
 constexpr double SearchGSMBelow = -14; // dB of Ec/No: Qqualmin + SsearchRAT
-constexpr double Hysteresis = 2; // dB, Qhyst1s
-constexpr double GSMOffset = 7; // dB, Qoffset1 of GSM neighbours
+constexpr double QHyst1s = 2; // dB
+constexpr double QOffset1 = 7; // dB, of GSM neighbours
 } // namespace UMTSThresholds
 
 } // namespace spectrel

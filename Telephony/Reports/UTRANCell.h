@@ -21,7 +21,7 @@ struct UTRANCell {
 namespace UTRANThresholds {
 constexpr double QRxLevMin = -103; // dBm
 constexpr double SInterSearch = 50; // dB of Srxlev
-constexpr double Hysteresis = 4; // dB, Qhyst1s
+constexpr double QHyst1s = 4; // dB
 } // namespace UTRANThresholds
 
 /// One GSM cell beside the UTRAN ones.

@@ -12,13 +12,13 @@ using namespace std::chrono_literals;
 constexpr auto SearchTime = 2500ms; // from power-on until a cell is found
 constexpr double SelectableEcno = -14; // dB
 
-constexpr auto ReselectionTime = 2s; // to GSM, Treselections
+constexpr auto TReselection = 2s; // to GSM
 constexpr auto RankedTogether = 600ms; // until the report shows both systems
 constexpr double WeakEcno = -14; // dB, event 2d in a connection
 constexpr auto WeakTime = 600ms;
 constexpr double LostEcno = -22; // dB: nothing gets through
 
-constexpr double ReturnEcno = -10; // dB, FDD_Qmin (3GPP TS 45.008, 6.6.5)
+constexpr double FDDQMin = -10; // dB (3GPP TS 45.008, 6.6.5)
 constexpr double ReturnRscp = -103; // dBm
 constexpr auto ReturnTime = 5s;
 constexpr auto ReturnTimeInCall = 2s;
@@ -114,14 +114,14 @@ bool GSMUMTSWorld::isUMTSTooWeak() const
         return cell.ecno < WeakEcno;
     if (cell.ecno < UMTSThresholds::QQualMin || cell.rscp < UMTSThresholds::QRxLevMin)
         return true;
-    return measuresGSM() && _gsm.strongestCell().rssi - UMTSThresholds::GSMOffset > _umts.servingRank();
+    return measuresGSM() && _gsm.strongestCell().rssi - UMTSThresholds::QOffset1 > _umts.servingRank();
 }
 
 void GSMUMTSWorld::considerGSM(std::chrono::milliseconds step)
 {
     keepTime(_leaving, isUMTSTooWeak(), step);
     const bool hasOwnChannel = _umts.state() == RRCState::CellDCH;
-    if (_leaving < (hasOwnChannel ? WeakTime : std::chrono::milliseconds(ReselectionTime)))
+    if (_leaving < (hasOwnChannel ? WeakTime : std::chrono::milliseconds(TReselection)))
         return;
     if (_mobility.isSignalling() && _umts.servingCell().ecno > LostEcno)
         return; // the procedure is let finish
@@ -136,7 +136,7 @@ void GSMUMTSWorld::considerUMTS(std::chrono::milliseconds step)
     if (_departing > 0ms)
         return moveToUMTS(step);
     const UMTSCell& cell = _umts.strongestCell();
-    const bool isGood = cell.ecno > ReturnEcno && cell.rscp > ReturnRscp;
+    const bool isGood = cell.ecno > FDDQMin && cell.rscp > ReturnRscp;
     keepTime(_leaving, isGood && !_gsm.isChanging(), step);
     const bool inCall = _gsm.isDedicated();
     const bool isBusy = _mobility.isSignalling() || (_mobility.isCalling() && !inCall);
@@ -162,7 +162,7 @@ std::vector<RankedGSMCell> GSMUMTSWorld::gsmRanking() const
 {
     std::vector<RankedGSMCell> ranked;
     for (const GSMCell* cell : _gsm.neighbours()) {
-        const double rank = cell->rssi - UMTSThresholds::GSMOffset;
+        const double rank = cell->rssi - UMTSThresholds::QOffset1;
         ranked.push_back({cell->arfcn, cell->bsic, cell->rssi, rank});
     }
     return ranked;

@@ -20,7 +20,7 @@ constexpr double ReplacingMargin = 2; // dB over the weakest: event 1c
 constexpr auto TimeToEnter = 300ms;
 constexpr auto TimeToLeave = 600ms;
 
-constexpr auto ReselectionTime = 1s; // Treselections
+constexpr auto TReselection = 1s;
 constexpr auto AveragingTime = 400ms; // of the level that cells are ranked by
 
 constexpr auto ShortAverage = 200ms; // until a cell's energy has been averaged
@@ -96,7 +96,7 @@ void UMTSReceiver::reselect(std::chrono::milliseconds step)
     const bool isBetter = best != _serving && _timers[best].averageRscp > servingRank();
     keepTime(_candidateFor, isBetter && best == _candidate, step);
     _candidate = best;
-    if (_candidateFor >= ReselectionTime)
+    if (_candidateFor >= TReselection)
         serveOnly(best);
 }
 
@@ -269,7 +269,7 @@ CellSetsReport UMTSReceiver::cellSets() const
 
 double UMTSReceiver::servingRank() const
 {
-    return _timers[_serving].averageRscp + UMTSThresholds::Hysteresis;
+    return _timers[_serving].averageRscp + UMTSThresholds::QHyst1s;
 }
 
 std::vector<RankedUMTSCell> UMTSReceiver::ranking() const

@@ -53,7 +53,7 @@ std::optional<std::size_t> LTEIdleMode::cycle()
         if (const auto cell = strongestSuitable())
             return cell;
     }
-    return bestOf(ReselectionTime + Cycle); // seen at both ends of the time
+    return bestOf(TReselection + Cycle); // seen at both ends of the time
 }
 
 void LTEIdleMode::judgeServing()
@@ -113,7 +113,7 @@ bool LTEIdleMode::isCandidate(const LTECell& cell) const
     if (to.priority > from.priority)
         return cell.srxlev() > to.threshHigh;
     if (&to == &from)
-        return cell.srxlev() > 0 && cell.average.rsrp > servingCell().average.rsrp + Hysteresis;
+        return cell.srxlev() > 0 && cell.average.rsrp > servingCell().average.rsrp + QHyst;
     return servingCell().srxlev() < from.threshServingLow && cell.srxlev() > to.threshLow;
 }
 

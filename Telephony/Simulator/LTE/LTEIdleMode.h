@@ -23,8 +23,8 @@ class LTEIdleMode {
 public:
     /// The paging cycle: near the usual 1.28 s, in whole steps of the simulation.
     static constexpr std::chrono::milliseconds Cycle {1200};
-    static constexpr double Hysteresis = 4; // dB, Q-Hyst
-    static constexpr std::chrono::milliseconds ReselectionTime {2400}; // Treselection, in whole cycles
+    static constexpr double QHyst = 4; // dB
+    static constexpr std::chrono::milliseconds TReselection {2400}; // in whole cycles
     static constexpr unsigned CyclesUntilLost = 4; // with Srxlev below 0, until any suitable cell will do
 
     explicit LTEIdleMode(const LTERoad& road);

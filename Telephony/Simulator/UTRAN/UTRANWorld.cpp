@@ -19,7 +19,7 @@ constexpr double Power = 33; // dBm, common control channel
 constexpr double GSMPower = 43;
 constexpr double Noise = -106; // dBm in 1.28 MHz, noise figure 7 dB
 constexpr double TargetSignal = 5; // dB, of the power control
-constexpr auto ReselectionTime = 1s; // Treselection
+constexpr auto TReselection = 1s;
 
 constexpr std::array<std::uint16_t, 3> Channels {10054, 10062, 10071};
 
@@ -142,7 +142,7 @@ void UTRANWorld::reselect(std::chrono::milliseconds step)
     const auto others = otherCells();
     const auto best = std::ranges::find_if(others, [this](const UTRANCell* cell) { return isMeasured(*cell); });
     const bool isRankedAbove = best != others.end() && (*best)->rscp > UTRANThresholds::QRxLevMin
-        && (*best)->rscp > servingCell().rscp + UTRANThresholds::Hysteresis;
+        && (*best)->rscp > servingCell().rscp + UTRANThresholds::QHyst1s;
     if (!isRankedAbove) {
         _candidateFor = 0ms;
         return;
@@ -150,7 +150,7 @@ void UTRANWorld::reselect(std::chrono::milliseconds step)
     const auto index = static_cast<std::size_t>(*best - _cells.data());
     _candidateFor = index == _candidate ? _candidateFor + step : step;
     _candidate = index;
-    if (_candidateFor >= ReselectionTime) {
+    if (_candidateFor >= TReselection) {
         _serving = index;
         _candidateFor = 0ms;
     }

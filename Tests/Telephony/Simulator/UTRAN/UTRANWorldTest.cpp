@@ -52,7 +52,7 @@ TEST(UTRANWorldTest, PhoneMovesByTheRankingOnly)
         if (&world.servingCell() == &previous)
             continue;
         ++moves;
-        EXPECT_GT(world.servingCell().rscp, previous.rscp + UTRANThresholds::Hysteresis);
+        EXPECT_GT(world.servingCell().rscp, previous.rscp + UTRANThresholds::QHyst1s);
         EXPECT_GT(world.servingCell().rscp, UTRANThresholds::QRxLevMin);
         if (mode != RRCMode::CellDCH && world.servingCell().channel != previous.channel) {
             EXPECT_LE(previous.rscp - UTRANThresholds::QRxLevMin, UTRANThresholds::SInterSearch);
