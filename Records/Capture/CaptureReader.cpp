@@ -39,10 +39,7 @@ public:
         : _capture(std::move(capture))
         , _isClassic(isClassic)
     {
-        const int number = pcap_datalink(_capture.get());
-        const auto known = std::ranges::find(LinkTypes, number, &LinkType::number);
-        if (known != LinkTypes.end())
-            _technology = known->technology;
+        _technology = technologyOfLinkType(pcap_datalink(_capture.get()));
         _place = _isClassic ? FileHeaderLength : currentPlace();
     }
 

@@ -185,8 +185,8 @@ StreamCutter::Found CaptureStream::takeHeader(StreamBuffer& buffer)
     _isSwapped = !isMagic(magic);
     _hasNanoseconds = (_isSwapped ? swapped(magic) : magic) == Nanoseconds;
     const int linkType = static_cast<int>(u32(bytes, 20) & 0x0FFFFFFF); // the rest tells of check sums
-    const auto known = std::ranges::find(LinkTypes, linkType, &LinkType::number);
-    _technology = known != LinkTypes.end() ? known->technology : _fallback;
+    const auto told = technologyOfLinkType(linkType);
+    _technology = told ? told : _fallback;
     take(buffer, FileHeaderLength);
     return Found::Begin;
 }

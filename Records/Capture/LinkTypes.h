@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Records/Recording.h"
+#include "Values/Table.h"
 
 #include <array>
 #include <optional>
@@ -20,5 +21,12 @@ constexpr std::array<LinkType, 5> LinkTypes {{
     {150, Technology::LTE},
     {151, Technology::UTRAN},
 }};
+
+/// None for a number of another use.
+constexpr std::optional<Technology> technologyOfLinkType(int number)
+{
+    const auto* type = findRow(LinkTypes, number, &LinkType::number);
+    return type ? std::optional(type->technology) : std::nullopt;
+}
 
 } // namespace spectrel
