@@ -1,5 +1,7 @@
 #include "CommandLine/Commands/RecordingFiles.h"
 
+#include "Records/Capture/CaptureFormat.h"
+
 #include <algorithm>
 #include <cerrno>
 #include <charconv>
@@ -16,8 +18,6 @@ namespace {
 
 constexpr std::string_view FolderPrefix = "spectrel-";
 constexpr std::string_view Extension = ".pcap";
-constexpr std::uint64_t FileHeaderLength = 24;
-constexpr std::uint64_t PacketHeaderLength = 16;
 
 /// The number in "spectrel-000001-lte.pcap"; 0 in any other name.
 std::uint64_t numberOf(const std::string& name)
@@ -102,15 +102,15 @@ bool RecordingFiles::write(Technology technology, Moment time, ByteView message)
         return false;
     if (!_writer->write(time, message))
         return failed(_path, _writer->error());
-    _bytes += PacketHeaderLength + message.size();
+    _bytes += PacketHeaderSize + message.size();
     return true;
 }
 
 /// A file holds at least one message, however large.
 bool RecordingFiles::isFull(std::size_t message, Moment time) const
 {
-    if (_options.largestFile && _bytes > FileHeaderLength
-        && _bytes + PacketHeaderLength + message > *_options.largestFile)
+    if (_options.largestFile && _bytes > CaptureHeaderSize
+        && _bytes + PacketHeaderSize + message > *_options.largestFile)
         return true;
     return _options.longestFile && time - _begun >= *_options.longestFile;
 }
@@ -125,7 +125,7 @@ bool RecordingFiles::beginNext(Technology technology, Moment time)
         return false;
     ++_count;
     _technology = technology;
-    _bytes = FileHeaderLength;
+    _bytes = CaptureHeaderSize;
     _begun = time;
     removeOldest();
     return true;

@@ -1,5 +1,5 @@
+#include "Records/Capture/CaptureFormat.h"
 #include "Records/Capture/CaptureOutput.h"
-#include "Records/Capture/LinkTypes.h"
 #include "Records/Recording.h"
 #include "Values/Bytes.h"
 
@@ -29,11 +29,10 @@ struct CaptureCloser {
 using Capture = std::unique_ptr<pcap_t, CaptureCloser>;
 using Dumper = std::unique_ptr<pcap_dumper_t, CaptureCloser>;
 
-constexpr std::size_t PacketHeaderLength = 16;
 /// Of the file's buffer. Only whole packets leave it, so that a program that is killed leaves a file that ends with
 /// one, unless it is killed in the midst of a write, which the system breaks off between two pages.
 constexpr std::size_t BufferSize = 512 * 1024;
-static_assert(BufferSize > LargestMessage + PacketHeaderLength);
+static_assert(BufferSize > LargestMessage + PacketHeaderSize);
 
 class CaptureWriter final : public RecordingWriter {
 public:
@@ -79,7 +78,7 @@ bool CaptureWriter::write(Moment time, ByteView body)
     header.ts.tv_usec = (time - second).count();
     header.caplen = static_cast<std::uint32_t>(body.size());
     header.len = header.caplen;
-    const std::size_t length = PacketHeaderLength + body.size();
+    const std::size_t length = PacketHeaderSize + body.size();
     if (_buffered + length > BufferSize && !flush())
         return false;
     _buffered += length;

@@ -4,9 +4,14 @@
 #include "Values/Table.h"
 
 #include <array>
+#include <cstddef>
 #include <optional>
 
 namespace spectrel {
+
+/// A classic capture (pcap): the file's header, then packets, each behind a header of its own.
+constexpr std::size_t CaptureHeaderSize = 24;
+constexpr std::size_t PacketHeaderSize = 16;
 
 /// A capture's link type tells the technology.
 struct LinkType {
