@@ -44,10 +44,8 @@ Result<std::unique_ptr<RecordingReader>> openRecording(const std::string& path);
 class RecordingWriter {
 public:
     virtual ~RecordingWriter() = default;
-    /// False when the message cannot be written; `error` tells why.
-    virtual bool write(Moment time, ByteView body) = 0;
-    virtual bool flush() = 0;
-    virtual const std::string& error() const = 0;
+    virtual Outcome write(Moment time, ByteView body) = 0;
+    virtual Outcome flush() = 0;
 };
 
 /// Makes a capture file, or overwrites one; "-" is standard output.

@@ -1,5 +1,6 @@
 #include "Records/Technology.h"
 #include "Records/TelephonyConstants.h"
+#include "Values/Table.h"
 
 #include <array>
 
@@ -23,11 +24,8 @@ constexpr std::array<TechnologyNames, 5> Technologies {{
 
 std::optional<Technology> technologyWith(std::string_view TechnologyNames::*member, std::string_view text)
 {
-    for (const TechnologyNames& names : Technologies) {
-        if (names.*member == text)
-            return names.technology;
-    }
-    return std::nullopt;
+    const auto* names = findRow(Technologies, text, member);
+    return names ? std::optional(names->technology) : std::nullopt;
 }
 
 } // namespace

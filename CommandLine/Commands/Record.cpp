@@ -23,8 +23,8 @@ public:
 
     int run()
     {
-        if (!_files.prepare()) {
-            fail(_files.error());
+        if (const auto prepared = _files.prepare(); !prepared) {
+            fail(prepared.failure().text);
             return _status;
         }
         const TerminationSignals terminationSignals([this](int) { _live.runLoop().quit(); });
@@ -71,15 +71,17 @@ private:
     void begin()
     {
         const auto technology = technologyOfConstant(_model.technology());
-        if (technology && _status == 0 && !_files.begin(*technology, Clock::installed().now()))
-            fail(_files.error());
+        if (!technology || _status != 0)
+            return;
+        if (const auto begun = _files.begin(*technology, Clock::installed().now()); !begun)
+            fail(begun.failure().text);
     }
 
     void write(Technology technology, ByteView body)
     {
         const std::size_t before = _files.count();
-        if (!_files.write(technology, Clock::installed().now(), body))
-            return fail(_files.error());
+        if (const auto written = _files.write(technology, Clock::installed().now(), body); !written)
+            return fail(written.failure().text);
         if (before > 0 && _files.count() > before)
             report("recording into " + _files.path());
         if (!_flushIsDue) {
@@ -93,8 +95,8 @@ private:
     void flush()
     {
         _flushIsDue = false;
-        if (!_files.flush() && _status == 0)
-            fail(_files.error());
+        if (const auto flushed = _files.flush(); !flushed && _status == 0)
+            fail(flushed.failure().text);
     }
 
     const RecordOptions& _options;

@@ -1,10 +1,11 @@
 #include "CommandLine/Commands/RecordingFiles.h"
 
+#include "Records/Capture/CaptureFormat.h"
+
 #include <algorithm>
 #include <cerrno>
 #include <charconv>
 #include <cstdio>
-#include <cstring>
 #include <filesystem>
 #include <unistd.h>
 
@@ -16,8 +17,6 @@ namespace {
 
 constexpr std::string_view FolderPrefix = "spectrel-";
 constexpr std::string_view Extension = ".pcap";
-constexpr std::uint64_t FileHeaderLength = 24;
-constexpr std::uint64_t PacketHeaderLength = 16;
 
 /// The number in "spectrel-000001-lte.pcap"; 0 in any other name.
 std::uint64_t numberOf(const std::string& name)
@@ -63,13 +62,7 @@ std::string RecordingFiles::spoken(const std::string& path)
     return path == "-" ? "standard output" : path;
 }
 
-bool RecordingFiles::failed(const std::string& path, const std::string& reason)
-{
-    _error = spoken(path) + ": " + reason;
-    return false;
-}
-
-bool RecordingFiles::prepare()
+Outcome RecordingFiles::prepare()
 {
     const std::string& target = _options.target;
     std::error_code error;
@@ -77,12 +70,12 @@ bool RecordingFiles::prepare()
     if (_isFolder) {
         fs::create_directories(target, error);
         if (error)
-            return failed(target, error.message());
+            return Failure {error.message()}.of(target);
     }
     const std::string folder = _isFolder ? target : fs::path(target).parent_path().string();
     if (target != "-" && ::access(folder.empty() ? "." : folder.c_str(), W_OK) != 0)
-        return failed(target, std::strerror(errno));
-    return true;
+        return Failure::ofSystem().of(target);
+    return Done();
 }
 
 std::uint64_t RecordingFiles::latestNumber() const
@@ -91,48 +84,50 @@ std::uint64_t RecordingFiles::latestNumber() const
     return files.empty() ? 0 : files.back().first;
 }
 
-bool RecordingFiles::begin(Technology technology, Moment time)
+Outcome RecordingFiles::begin(Technology technology, Moment time)
 {
-    return _writer || beginNext(technology, time);
+    return _writer ? Done() : beginNext(technology, time);
 }
 
-bool RecordingFiles::write(Technology technology, Moment time, ByteView message)
+Outcome RecordingFiles::write(Technology technology, Moment time, ByteView message)
 {
-    if ((!_writer || technology != _technology || isFull(message.size(), time)) && !beginNext(technology, time))
-        return false;
-    if (!_writer->write(time, message))
-        return failed(_path, _writer->error());
-    _bytes += PacketHeaderLength + message.size();
-    return true;
+    if (!_writer || technology != _technology || isFull(message.size(), time)) {
+        if (auto begun = beginNext(technology, time); !begun)
+            return begun;
+    }
+    if (const auto written = _writer->write(time, message); !written)
+        return written.failure().of(spoken(_path));
+    _bytes += PacketHeaderSize + message.size();
+    return Done();
 }
 
 /// A file holds at least one message, however large.
 bool RecordingFiles::isFull(std::size_t message, Moment time) const
 {
-    if (_options.largestFile && _bytes > FileHeaderLength
-        && _bytes + PacketHeaderLength + message > *_options.largestFile)
+    if (_options.largestFile && _bytes > CaptureHeaderSize
+        && _bytes + PacketHeaderSize + message > *_options.largestFile)
         return true;
     return _options.longestFile && time - _begun >= *_options.longestFile;
 }
 
-bool RecordingFiles::beginNext(Technology technology, Moment time)
+Outcome RecordingFiles::beginNext(Technology technology, Moment time)
 {
     if (_writer && _options.target == "-")
-        return failed("standard output", "one stream cannot tell of another technology; the recording ends");
-    if (!flush())
-        return false;
-    if (!createNext(technology))
-        return false;
+        return Failure {"standard output: one stream cannot tell of another technology; the recording ends"};
+    if (auto flushed = flush(); !flushed)
+        return flushed;
+    if (auto created = createNext(technology); !created)
+        return created;
     ++_count;
     _technology = technology;
-    _bytes = FileHeaderLength;
+    _bytes = CaptureHeaderSize;
     _begun = time;
     removeOldest();
-    return true;
+    return Done();
 }
 
 /// Two recorders never share a file, for a number that is taken is passed over.
-bool RecordingFiles::createNext(Technology technology)
+Outcome RecordingFiles::createNext(Technology technology)
 {
     if (_isFolder)
         _number = latestNumber();
@@ -143,11 +138,11 @@ bool RecordingFiles::createNext(Technology technology)
         auto created = (isTarget ? createRecording : createNewRecording)(_path, technology);
         if (created) {
             _writer = *std::move(created);
-            return true;
+            return Done();
         }
         if (created.failure().code != Failure::Code::Exists) {
             _writer.reset();
-            return failed(_path, created.failure().text);
+            return created.failure().of(spoken(_path));
         }
     }
 }
@@ -182,9 +177,10 @@ void RecordingFiles::removeOldest()
     }
 }
 
-bool RecordingFiles::flush()
+Outcome RecordingFiles::flush()
 {
-    return !_writer || _writer->flush() || failed(_path, _writer->error());
+    const Outcome flushed = _writer ? _writer->flush() : Done();
+    return flushed ? flushed : flushed.failure().of(spoken(_path));
 }
 
 } // namespace spectrel

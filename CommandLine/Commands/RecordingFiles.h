@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Records/Recording.h"
+#include "Values/Result.h"
 
 #include <chrono>
 #include <cstdint>
@@ -28,12 +29,13 @@ class RecordingFiles {
 public:
     explicit RecordingFiles(RecordingFilesOptions options);
 
-    /// Makes the folder at need. False, with `error`, when there is no place to write.
-    bool prepare();
+    // Failures name the file.
+    /// Makes the folder at need. Fails when there is no place to write.
+    Outcome prepare();
     /// Begins the first file, so that it is there before the first message.
-    bool begin(Technology technology, Moment time);
-    bool write(Technology technology, Moment time, ByteView message);
-    bool flush();
+    Outcome begin(Technology technology, Moment time);
+    Outcome write(Technology technology, Moment time, ByteView message);
+    Outcome flush();
 
     /// A file's name as messages tell it; "-" is standard output.
     static std::string spoken(const std::string& path);
@@ -46,20 +48,14 @@ public:
     {
         return _count;
     }
-    /// Names the file.
-    const std::string& error() const
-    {
-        return _error;
-    }
 
 private:
     bool isFull(std::size_t message, Moment time) const;
-    bool beginNext(Technology technology, Moment time);
-    bool createNext(Technology technology);
+    Outcome beginNext(Technology technology, Moment time);
+    Outcome createNext(Technology technology);
     std::string numberedPath(Technology technology) const;
     std::uint64_t latestNumber() const;
     void removeOldest();
-    bool failed(const std::string& path, const std::string& reason);
 
     RecordingFilesOptions _options;
     bool _isFolder = false;
@@ -71,7 +67,6 @@ private:
     std::uint64_t _bytes = 0; // of the current file
     Moment _begun {}; // the current file
     std::vector<std::string> _written; // outside of folders: the files begun, oldest first
-    std::string _error;
 };
 
 } // namespace spectrel

@@ -1,34 +1,16 @@
 #include "CommandLine/Output/DisplayPrinter.h"
 
+#include "CommandLine/Output/JsonText.h"
 #include "Monitor/DisplayOrder.h"
 #include "Monitor/SpectrelModelNode.h"
 #include "Monitor/TreeText.h"
 #include "Values/List.h"
 
-#include <rapidjson/writer.h>
 #include <utility>
 
 namespace spectrel {
 
 namespace {
-
-/// Lets RapidJSON's writer append to a string.
-class StringSink {
-public:
-    using Ch = char;
-    explicit StringSink(std::string& out)
-        : _out(out)
-    {
-    }
-    void Put(char character)
-    {
-        _out += character;
-    }
-    void Flush() { }
-
-private:
-    std::string& _out;
-};
 
 /// Appends a child's separator, and so begins every child but the first.
 void separate(bool& isFirst, std::string& out)
@@ -93,13 +75,6 @@ void appendJson(const Value& display, std::string& out)
     } else {
         appendJsonText(display.string() ? std::string_view(*display.string()) : UnknownText, out);
     }
-}
-
-void appendJsonText(std::string_view text, std::string& out)
-{
-    StringSink sink(out);
-    rapidjson::Writer<StringSink> writer(sink);
-    writer.String(text.data(), static_cast<rapidjson::SizeType>(text.size()));
 }
 
 } // namespace spectrel

@@ -13,7 +13,4 @@ void appendTree(const Value& display, std::string& out);
 /// order and under the names that the tree shows, list → array, text → string, anything else → "(unknown)".
 void appendJson(const Value& display, std::string& out);
 
-/// Appends a text as a JSON string, quotes included.
-void appendJsonText(std::string_view text, std::string& out);
-
 } // namespace spectrel

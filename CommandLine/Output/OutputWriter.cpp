@@ -1,9 +1,10 @@
 #include "CommandLine/Output/OutputWriter.h"
 
 #include "CommandLine/Output/DisplayPrinter.h"
+#include "CommandLine/Output/JsonText.h"
+#include "Values/Table.h"
 
 #include <array>
-#include <utility>
 
 namespace spectrel {
 
@@ -41,18 +42,19 @@ void appendCsvField(std::string_view field, std::string& out)
 
 std::optional<OutputFormat> outputFormatNamed(std::string_view name)
 {
-    static constexpr std::array<std::pair<std::string_view, OutputFormat>, 5> Formats {{
+    struct NamedFormat {
+        std::string_view name;
+        OutputFormat format;
+    };
+    static constexpr std::array<NamedFormat, 5> Formats {{
         {"tree", OutputFormat::Tree},
         {"json", OutputFormat::Json},
         {"changes", OutputFormat::Changes},
         {"csv", OutputFormat::Csv},
         {"none", OutputFormat::None},
     }};
-    for (const auto& [known, format] : Formats) {
-        if (known == name)
-            return format;
-    }
-    return std::nullopt;
+    const auto* known = findRow(Formats, name, &NamedFormat::name);
+    return known ? std::optional(known->format) : std::nullopt;
 }
 
 OutputWriter::OutputWriter(std::FILE* stream, OutputFormat format)

@@ -1,5 +1,7 @@
 #include "Records/Capture/CaptureOutput.h"
 
+#include "Records/Capture/CaptureFormat.h"
+
 #include <cerrno>
 #include <fcntl.h>
 #include <filesystem>
@@ -10,8 +12,6 @@
 namespace spectrel {
 
 namespace {
-
-constexpr off_t HeadLength = 24;
 
 /// Beside the file, so that it can be renamed; the number keeps two programs apart.
 std::string hiddenName(const std::filesystem::path& path)
@@ -24,8 +24,8 @@ int openEmptied(const std::string& path)
 {
     const int file = ::open(path.c_str(), O_WRONLY | O_CLOEXEC);
     struct stat state { };
-    if (file >= 0 && ::fstat(file, &state) == 0 && S_ISREG(state.st_mode) && state.st_size > HeadLength
-        && ::ftruncate(file, HeadLength) != 0) {
+    if (file >= 0 && ::fstat(file, &state) == 0 && S_ISREG(state.st_mode) && state.st_size > off_t {CaptureHeaderSize}
+        && ::ftruncate(file, CaptureHeaderSize) != 0) {
         ::close(file);
         return -1;
     }

@@ -1,6 +1,6 @@
 #include "Records/Capture/CaptureReader.h"
 
-#include "Records/Capture/LinkTypes.h"
+#include "Records/Capture/CaptureFormat.h"
 
 #include <algorithm>
 #include <array>
@@ -13,9 +13,6 @@ namespace {
 
 constexpr std::uint32_t PcapngMagic = 0x0A0D0D0A; // the same in either byte order
 constexpr std::array<std::uint32_t, 5> Magics {0xA1B2C3D4, 0xD4C3B2A1, 0xA1B23C4D, 0x4D3CB2A1, PcapngMagic};
-
-constexpr std::int64_t FileHeaderLength = 24;
-constexpr std::int64_t PacketHeaderLength = 16;
 
 std::uint32_t magicOf(ByteView bytes)
 {
@@ -39,11 +36,8 @@ public:
         : _capture(std::move(capture))
         , _isClassic(isClassic)
     {
-        const int number = pcap_datalink(_capture.get());
-        const auto known = std::ranges::find(LinkTypes, number, &LinkType::number);
-        if (known != LinkTypes.end())
-            _technology = known->technology;
-        _place = _isClassic ? FileHeaderLength : currentPlace();
+        _technology = technologyOfLinkType(pcap_datalink(_capture.get()));
+        _place = _isClassic ? std::int64_t {CaptureHeaderSize} : currentPlace();
     }
 
     std::optional<Technology> technology() const override
@@ -90,7 +84,7 @@ bool CaptureReader::next(RecordedMessage& message)
     message.time = timeOf(*header);
     message.body = {bytes, header->caplen};
     ++_count;
-    _place = _isClassic ? _place + PacketHeaderLength + header->caplen : currentPlace();
+    _place = _isClassic ? _place + std::int64_t {PacketHeaderSize} + header->caplen : currentPlace();
     return true;
 }
 

@@ -1,6 +1,6 @@
 #include "Records/Capture/CaptureStream.h"
 
-#include "Records/Capture/LinkTypes.h"
+#include "Records/Capture/CaptureFormat.h"
 #include "Records/Frame.h"
 #include "Values/Bytes.h"
 
@@ -12,11 +12,9 @@ namespace spectrel {
 
 namespace {
 
-constexpr std::size_t FileHeaderLength = 24;
-constexpr std::size_t PacketHeaderLength = 16;
 /// What tells that a body is a log message.
 constexpr std::size_t LongestFrame = WrapperSize + RecordTypeSize + ItemLengthSize;
-constexpr std::size_t LeastEvidence = PacketHeaderLength + LongestFrame; // no place is confirmed by fewer bytes
+constexpr std::size_t LeastEvidence = PacketHeaderSize + LongestFrame; // no place is confirmed by fewer bytes
 constexpr std::uint32_t Microseconds = 0xA1B2C3D4;
 constexpr std::uint32_t Nanoseconds = 0xA1B23C4D;
 constexpr std::array<std::uint8_t, 8> Version {2, 0, 4, 0, 0, 0, 0, 0}; // 2.4, and no time zone
@@ -82,10 +80,10 @@ CaptureStream::Verdict CaptureStream::judge(const StreamBuffer& buffer, std::siz
 {
     const ByteView bytes = buffer.bytes();
     if (startsCapture(bytes.subspan(place))) {
-        const std::size_t end = place + FileHeaderLength;
+        const std::size_t end = place + CaptureHeaderSize;
         return {place, bytes.size() < end ? Start::Possible : Start::Capture, end};
     }
-    const std::size_t body = place + PacketHeaderLength;
+    const std::size_t body = place + PacketHeaderSize;
     if (bytes.size() < body)
         return {place, Start::Possible, body};
     const PacketHeader header = headerAt(bytes, place);
@@ -107,7 +105,7 @@ CaptureStream::Verdict CaptureStream::judgeWhatFollows(
     const ByteView bytes = buffer.bytes();
     if (bytes.size() == end && (buffer.isFinished || (buffer.isSettled && _isInStep && place == 0)))
         return {place, Start::Packet, end};
-    const std::size_t needed = end + PacketHeaderLength;
+    const std::size_t needed = end + PacketHeaderSize;
     if (bytes.size() < needed)
         return {place, buffer.isFinished ? Start::Unlikely : Start::Possible, needed};
     const bool follows = startsCapture(bytes.subspan(end)) || canBeTrue(headerAt(bytes, end), false);
@@ -159,7 +157,7 @@ StreamCutter::Found CaptureStream::takePacket(StreamBuffer& buffer, RecordedMess
 {
     const ByteView bytes = buffer.bytes();
     const PacketHeader header = headerAt(bytes, 0);
-    const std::size_t end = PacketHeaderLength + header.captured;
+    const std::size_t end = PacketHeaderSize + header.captured;
     if (bytes.size() < end && buffer.isFinished)
         return skipPacket(buffer, bytes.size(), "the stream ended within a packet", damage);
     if (bytes.size() < end) {
@@ -173,7 +171,7 @@ StreamCutter::Found CaptureStream::takePacket(StreamBuffer& buffer, RecordedMess
         return skipPacket(buffer, end, "a packet that was captured only in part", damage);
     const std::int64_t fraction = _hasNanoseconds ? header.fraction / 1000 : header.fraction;
     message.time = Moment(std::chrono::seconds(header.seconds) + std::chrono::microseconds(fraction));
-    message.body = bytes.subspan(PacketHeaderLength, header.captured);
+    message.body = bytes.subspan(PacketHeaderSize, header.captured);
     take(buffer, end);
     return Found::Message;
 }
@@ -185,9 +183,9 @@ StreamCutter::Found CaptureStream::takeHeader(StreamBuffer& buffer)
     _isSwapped = !isMagic(magic);
     _hasNanoseconds = (_isSwapped ? swapped(magic) : magic) == Nanoseconds;
     const int linkType = static_cast<int>(u32(bytes, 20) & 0x0FFFFFFF); // the rest tells of check sums
-    const auto known = std::ranges::find(LinkTypes, linkType, &LinkType::number);
-    _technology = known != LinkTypes.end() ? known->technology : _fallback;
-    take(buffer, FileHeaderLength);
+    const auto told = technologyOfLinkType(linkType);
+    _technology = told ? told : _fallback;
+    take(buffer, CaptureHeaderSize);
     return Found::Begin;
 }
 

@@ -1,13 +1,13 @@
+#include "Records/Capture/CaptureFormat.h"
 #include "Records/Capture/CaptureOutput.h"
-#include "Records/Capture/LinkTypes.h"
 #include "Records/Recording.h"
 #include "Values/Bytes.h"
 
 #include <algorithm>
 #include <cerrno>
 #include <cstdio>
-#include <cstring>
 #include <limits>
+#include <optional>
 #include <pcap/pcap.h>
 
 namespace spectrel {
@@ -29,11 +29,10 @@ struct CaptureCloser {
 using Capture = std::unique_ptr<pcap_t, CaptureCloser>;
 using Dumper = std::unique_ptr<pcap_dumper_t, CaptureCloser>;
 
-constexpr std::size_t PacketHeaderLength = 16;
 /// Of the file's buffer. Only whole packets leave it, so that a program that is killed leaves a file that ends with
 /// one, unless it is killed in the midst of a write, which the system breaks off between two pages.
 constexpr std::size_t BufferSize = 512 * 1024;
-static_assert(BufferSize > LargestMessage + PacketHeaderLength);
+static_assert(BufferSize > LargestMessage + PacketHeaderSize);
 
 class CaptureWriter final : public RecordingWriter {
 public:
@@ -42,60 +41,59 @@ public:
         , _dumper(std::move(dumper))
     {
     }
-    bool write(Moment time, ByteView body) override;
-    bool flush() override;
-    const std::string& error() const override
-    {
-        return _error;
-    }
+    Outcome write(Moment time, ByteView body) override;
+    Outcome flush() override;
 
 private:
-    bool failed(std::string why)
-    {
-        _error = std::move(why);
-        return false;
-    }
+    Outcome doneUnless(bool isBroken);
 
     std::unique_ptr<char[]> _buffer; // the file's, so that it ends after it
     Dumper _dumper;
     std::size_t _buffered = 0; // bytes since the last flush
-    bool _isBroken = false; // the file holds a part of a packet, perhaps; nothing may follow
-    std::string _error;
+    std::optional<Failure> _broken; // the file holds a part of a packet, perhaps; nothing may follow
 };
 
-bool CaptureWriter::write(Moment time, ByteView body)
+Outcome CaptureWriter::write(Moment time, ByteView body)
 {
-    if (_isBroken)
-        return false;
+    if (_broken)
+        return *_broken;
     if (body.empty() || body.size() > LargestMessage)
-        return failed("a message has 1 to " + std::to_string(LargestMessage) + " bytes, this one has "
-            + std::to_string(body.size()));
+        return Failure {"a message has 1 to " + std::to_string(LargestMessage) + " bytes, this one has "
+            + std::to_string(body.size())};
     const auto second = std::chrono::floor<std::chrono::seconds>(time);
     const std::int64_t seconds = second.time_since_epoch().count();
     if (seconds < 0 || seconds > std::numeric_limits<std::uint32_t>::max())
-        return failed("the time " + defaultDateForm(time) + " is outside what a capture can tell");
+        return Failure {"the time " + defaultDateForm(time) + " is outside what a capture can tell"};
     pcap_pkthdr header {};
     header.ts.tv_sec = seconds;
     header.ts.tv_usec = (time - second).count();
     header.caplen = static_cast<std::uint32_t>(body.size());
     header.len = header.caplen;
-    const std::size_t length = PacketHeaderLength + body.size();
-    if (_buffered + length > BufferSize && !flush())
-        return false;
+    const std::size_t length = PacketHeaderSize + body.size();
+    if (_buffered + length > BufferSize) {
+        if (auto flushed = flush(); !flushed)
+            return flushed;
+    }
     _buffered += length;
     errno = 0;
     pcap_dump(reinterpret_cast<std::uint8_t*>(_dumper.get()), &header, body.data());
-    _isBroken = std::ferror(pcap_dump_file(_dumper.get())) != 0;
-    return !_isBroken || failed(std::strerror(errno));
+    return doneUnless(std::ferror(pcap_dump_file(_dumper.get())) != 0);
 }
 
-bool CaptureWriter::flush()
+Outcome CaptureWriter::flush()
 {
-    if (_isBroken)
-        return false;
+    if (_broken)
+        return *_broken;
     _buffered = 0;
-    _isBroken = pcap_dump_flush(_dumper.get()) != 0;
-    return !_isBroken || failed(std::strerror(errno));
+    return doneUnless(pcap_dump_flush(_dumper.get()) != 0);
+}
+
+Outcome CaptureWriter::doneUnless(bool isBroken)
+{
+    if (!isBroken)
+        return Done();
+    _broken = Failure::ofSystem();
+    return *_broken;
 }
 
 Result<std::unique_ptr<RecordingWriter>> create(
@@ -112,8 +110,8 @@ Result<std::unique_ptr<RecordingWriter>> create(
     if (!dumper)
         return Failure {pcap_geterr(capture.get())};
     auto writer = std::make_unique<CaptureWriter>(std::move(buffer), std::move(dumper));
-    if (!writer->flush()) // the head stands in the file from the start
-        return Failure {writer->error()};
+    if (const auto flushed = writer->flush(); !flushed) // the head stands in the file from the start
+        return flushed.failure();
     if (const auto published = output->publish(); !published)
         return published.failure();
     return writer;

@@ -1,5 +1,7 @@
 #include "Telephony/Simulator/Journey.h"
 
+#include "Values/Table.h"
+
 #include <algorithm>
 #include <array>
 #include <cmath>
@@ -31,11 +33,10 @@ const Pace& paceOf(Scene scene)
 
 bool sceneNamed(std::string_view name, Scene& scene)
 {
-    const auto pace = std::ranges::find(Paces, name, &Pace::name);
-    if (pace == Paces.end())
-        return false;
-    scene = pace->scene;
-    return true;
+    const auto* pace = findRow(Paces, name, &Pace::name);
+    if (pace)
+        scene = pace->scene;
+    return pace != nullptr;
 }
 
 Journey::Journey(Scene scene, double length, Dice& dice)

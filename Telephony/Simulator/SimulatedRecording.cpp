@@ -8,17 +8,18 @@ Outcome writeSimulatedRecording(Baseband& baseband, const std::string& path, std
     if (!created)
         return created.failure();
     RecordingWriter& writer = **created;
-    bool isWritten = true;
+    Outcome written = Done();
     Moment now = SimulatedRecordingStart;
-    const auto write = [&](ByteView record) { isWritten = isWritten && writer.write(now, record); };
+    const auto write = [&](ByteView record) {
+        if (written)
+            written = writer.write(now, record);
+    };
     baseband.greet(now, write);
-    while (isWritten && now + Baseband::Step <= SimulatedRecordingStart + duration) {
+    while (written && now + Baseband::Step <= SimulatedRecordingStart + duration) {
         now += Baseband::Step;
         baseband.advance(now, write);
     }
-    if (!isWritten || !writer.flush())
-        return Failure {writer.error()};
-    return Done();
+    return written ? writer.flush() : written;
 }
 
 } // namespace spectrel

@@ -18,14 +18,14 @@ protected:
     RecordingFiles open(RecordingFilesOptions options)
     {
         RecordingFiles files(std::move(options));
-        EXPECT_TRUE(files.prepare()) << files.error();
+        EXPECT_TRUE(files.prepare());
         return files;
     }
     /// One message of 13 bytes a second: 29 bytes in the file, behind 24 bytes of its head.
     void write(RecordingFiles& files, int count, Technology technology = Technology::LTE)
     {
         for (int number = 0; number < count; ++number)
-            EXPECT_TRUE(files.write(technology, time += 1s, RecordBuilder(0xB0C2, 13))) << files.error();
+            EXPECT_TRUE(files.write(technology, time += 1s, RecordBuilder(0xB0C2, 13)));
         EXPECT_TRUE(files.flush());
     }
     /// The files of a folder with the number of messages in each: "a.pcap: 3".
@@ -138,8 +138,9 @@ TEST_F(RecordingFilesTest, OfNamedFilesOnlyThisRecordingsAreRemoved)
 TEST_F(RecordingFilesTest, PlaceThatCannotBeWrittenIsToldBeforehand)
 {
     RecordingFiles files({scratch.file("nowhere/a.pcap"), {}, {}, {}});
-    EXPECT_FALSE(files.prepare());
-    EXPECT_EQ(files.error(), scratch.file("nowhere/a.pcap") + ": No such file or directory");
+    const auto prepared = files.prepare();
+    ASSERT_FALSE(prepared);
+    EXPECT_EQ(prepared.failure().text, scratch.file("nowhere/a.pcap") + ": No such file or directory");
     scratch.write("file", "");
     RecordingFiles folder({scratch.file("file/folder/"), {}, {}, {}});
     EXPECT_FALSE(folder.prepare());

@@ -1,5 +1,7 @@
 #include "UI/Terminal/Grid.h"
 
+#include "Values/UTF8.h"
+
 #include <algorithm>
 
 namespace spectrel {

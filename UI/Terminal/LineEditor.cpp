@@ -1,5 +1,7 @@
 #include "UI/Terminal/LineEditor.h"
 
+#include "Values/UTF8.h"
+
 #include <algorithm>
 
 namespace spectrel {

@@ -1,5 +1,7 @@
 #include "UI/Terminal/TerminalText.h"
 
+#include "Values/UTF8.h"
+
 #include <clocale>
 #include <cwchar>
 #include <locale.h>
@@ -8,36 +10,14 @@ namespace spectrel {
 
 namespace {
 
-constexpr char32_t Replacement = 0xFFFD;
 constexpr char32_t ControlPictures = 0x2400;
 constexpr char32_t DeletePicture = 0x2421;
 
-struct Decoded {
-    char32_t character = Replacement;
-    std::size_t bytes = 1;
-};
-
-/// The first character of a text that is not empty. Strict: a byte that does not begin a well-formed character stands
-/// for itself alone, as the replacement.
-Decoded decodeUTF8(std::string_view text)
+/// The first character of a text that is not empty. A byte that does not begin a well-formed character stands for
+/// itself alone, as the replacement.
+UTF8Character firstCharacter(std::string_view text)
 {
-    const auto byte = [text](std::size_t at) { return static_cast<unsigned char>(text[at]); };
-    const unsigned lead = byte(0);
-    if (lead < 0x80)
-        return {lead, 1};
-    const std::size_t length = lead >= 0xF0 ? 4 : lead >= 0xE0 ? 3 : 2;
-    if (lead < 0xC2 || lead > 0xF4 || text.size() < length)
-        return {};
-    char32_t character = lead & (0x7FU >> length);
-    for (std::size_t at = 1; at < length; ++at) {
-        if ((byte(at) & 0xC0U) != 0x80)
-            return {};
-        character = (character << 6) | (byte(at) & 0x3FU);
-    }
-    const char32_t least = length == 4 ? 0x10000 : length == 3 ? 0x800 : 0x80;
-    if (character < least || character > 0x10FFFF || (character >= 0xD800 && character <= 0xDFFF))
-        return {};
-    return {character, length};
+    return decodeUTF8(text).value_or(UTF8Character {ReplacementCharacter, 1});
 }
 
 /// The width by the tables of a UTF-8 locale, whichever locale the program runs in; -1 when it is not known.
@@ -75,7 +55,7 @@ char32_t shown(char32_t character)
     if (character == 0x7F)
         return DeletePicture;
     if (isDirectionControl(character) || widthOf(character) < 0)
-        return Replacement;
+        return ReplacementCharacter;
     return character;
 }
 
@@ -83,7 +63,7 @@ char32_t shown(char32_t character)
 void takeMarks(std::string_view& text, TerminalGlyph& glyph, std::size_t marks)
 {
     while (!text.empty()) {
-        const Decoded next = decodeUTF8(text);
+        const UTF8Character next = firstCharacter(text);
         const bool skips = isInvisible(next.character);
         if (!skips && (widthOf(next.character) != 0 || shown(next.character) != next.character))
             return;
@@ -100,7 +80,7 @@ std::optional<TerminalGlyph> takeGlyph(std::string_view& text)
 {
     TerminalGlyph glyph;
     while (!text.empty()) {
-        const Decoded first = decodeUTF8(text);
+        const UTF8Character first = firstCharacter(text);
         if (isInvisible(first.character)) {
             glyph.bytes += first.bytes;
             text.remove_prefix(first.bytes);
@@ -128,28 +108,6 @@ int columnsOf(std::string_view text)
     while (const auto glyph = takeGlyph(text))
         columns += glyph->columns;
     return columns;
-}
-
-void appendUTF8(std::string& text, char32_t character)
-{
-    if (character > 0x10FFFF || (character >= 0xD800 && character <= 0xDFFF))
-        character = Replacement;
-    const auto append = [&text](char32_t byte) { text += static_cast<char>(static_cast<unsigned char>(byte)); };
-    if (character < 0x80) {
-        append(character);
-        return;
-    }
-    if (character < 0x800) {
-        append(0xC0 | (character >> 6));
-    } else if (character < 0x10000) {
-        append(0xE0 | (character >> 12));
-        append(0x80 | ((character >> 6) & 0x3F));
-    } else {
-        append(0xF0 | (character >> 18));
-        append(0x80 | ((character >> 12) & 0x3F));
-        append(0x80 | ((character >> 6) & 0x3F));
-    }
-    append(0x80 | (character & 0x3F));
 }
 
 } // namespace spectrel

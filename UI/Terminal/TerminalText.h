@@ -3,7 +3,6 @@
 #include <array>
 #include <cstddef>
 #include <optional>
-#include <string>
 #include <string_view>
 
 namespace spectrel {
@@ -24,8 +23,5 @@ std::optional<TerminalGlyph> takeGlyph(std::string_view& text);
 
 /// The columns that the text takes on one line.
 int columnsOf(std::string_view text);
-
-/// One character as UTF-8; U+FFFD for what is none.
-void appendUTF8(std::string& text, char32_t character);
 
 } // namespace spectrel

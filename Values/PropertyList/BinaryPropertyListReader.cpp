@@ -3,6 +3,7 @@
 #include "Values/Dictionary.h"
 #include "Values/List.h"
 #include "Values/PropertyList/PropertyListBudget.h"
+#include "Values/UTF8.h"
 
 #include <bit>
 #include <cmath>
@@ -32,29 +33,6 @@ constexpr std::uint8_t FalseObject = 0x08;
 constexpr std::uint8_t TrueObject = 0x09;
 constexpr std::uint8_t DateMarker = 0x33;
 constexpr std::uint8_t CountFollows = 0xF;
-
-bool appendUTF8(std::string& text, std::uint32_t point)
-{
-    const auto tail = [&](int shift) { text += static_cast<char>(0x80 | (point >> shift & 0x3F)); };
-    if (point < 0x80) {
-        text += static_cast<char>(point);
-    } else if (point < 0x800) {
-        text += static_cast<char>(0xC0 | point >> 6);
-        tail(0);
-    } else if (point < 0x10000) {
-        if (point >= 0xD800 && point < 0xE000)
-            return false; // half of a pair
-        text += static_cast<char>(0xE0 | point >> 12);
-        tail(6);
-        tail(0);
-    } else {
-        text += static_cast<char>(0xF0 | point >> 18);
-        tail(12);
-        tail(6);
-        tail(0);
-    }
-    return true;
-}
 
 class BinaryReader {
 public:
@@ -312,8 +290,9 @@ std::optional<std::string> BinaryReader::textOfUnits(const Object& object) const
             point = 0x10000 + ((point & 0x3FF) << 10 | (second & 0x3FF));
             ++i;
         }
-        if (!appendUTF8(converted, point))
+        if (!isCharacter(point)) // half of a pair
             return std::nullopt;
+        appendUTF8(converted, point);
     }
     return converted;
 }

@@ -3,6 +3,7 @@
 #include "Values/List.h"
 #include "Values/PropertyList/PropertyList.h"
 #include "Values/PropertyList/PropertyListScalars.h"
+#include "Values/UTF8.h"
 
 #include <algorithm>
 #include <array>
@@ -24,27 +25,12 @@ constexpr std::size_t BytesPerDataLine = 57; // 76 characters
 /// The length of the well-formed UTF-8 character at the front that XML can carry; 0 when there is none.
 std::size_t characterLength(std::string_view text)
 {
-    const auto byte = [&](std::size_t place) {
-        return place < text.size() ? static_cast<std::uint8_t>(text[place]) : 0u;
-    };
-    const auto isTail = [&](std::size_t place) { return (byte(place) & 0xC0) == 0x80; };
-    const unsigned first = byte(0);
-    if (first >= 0x20 && first < 0x80)
-        return 1;
-    if (first < 0x20)
-        return first == '\t' || first == '\n' || first == '\r' ? 1 : 0;
-    if (first >= 0xC2 && first < 0xE0)
-        return isTail(1) ? 2 : 0;
-    if (first >= 0xE0 && first < 0xF0) {
-        const unsigned point = (first & 0xF) << 12 | (byte(1) & 0x3F) << 6 | (byte(2) & 0x3F);
-        const bool isSurrogate = point >= 0xD800 && point < 0xE000;
-        return isTail(1) && isTail(2) && point >= 0x800 && !isSurrogate && point < 0xFFFE ? 3 : 0;
-    }
-    if (first >= 0xF0 && first < 0xF5) {
-        const unsigned upper = (first & 0x7) << 6 | (byte(1) & 0x3F); // the point's bits above the lowest twelve
-        return isTail(1) && isTail(2) && isTail(3) && upper >= 0x10 && upper < 0x110 ? 4 : 0;
-    }
-    return 0;
+    const auto first = decodeUTF8(text);
+    if (!first)
+        return 0;
+    const char32_t character = first->character;
+    const bool isControl = character < 0x20 && character != '\t' && character != '\n' && character != '\r';
+    return isControl || character == 0xFFFE || character == 0xFFFF ? 0 : first->bytes;
 }
 
 /// How a character must be written; empty when it stands for itself.

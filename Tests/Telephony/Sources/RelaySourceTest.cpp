@@ -36,8 +36,8 @@ protected:
         const std::string path = scratch.file("x.pcap");
         const auto writer = *createRecording(path, technology);
         for (int number = first; number < first + count; ++number)
-            writer->write(Moment(std::chrono::seconds(1000 + number)), message(number));
-        writer->flush();
+            EXPECT_TRUE(writer->write(Moment(std::chrono::seconds(1000 + number)), message(number)));
+        EXPECT_TRUE(writer->flush());
         std::ifstream file(path, std::ios::binary);
         return {std::istreambuf_iterator<char>(file), {}};
     }

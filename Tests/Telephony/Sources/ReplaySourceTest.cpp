@@ -23,9 +23,9 @@ protected:
         std::string path = folder + "/" + std::to_string(++_files) + ".pcap";
         const auto writer = *createRecording(path, technology);
         for (int number = 0; number < count; ++number)
-            writer->write(Moment(std::chrono::seconds(start + number)),
-                RecordBuilder(0xB0C2, 13).u8(12, static_cast<std::uint32_t>(number)));
-        writer->flush();
+            EXPECT_TRUE(writer->write(Moment(std::chrono::seconds(start + number)),
+                RecordBuilder(0xB0C2, 13).u8(12, static_cast<std::uint32_t>(number))));
+        EXPECT_TRUE(writer->flush());
         return path;
     }
     std::unique_ptr<LogSource> open(ReplayOptions options)

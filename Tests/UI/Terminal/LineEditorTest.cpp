@@ -1,5 +1,7 @@
 #include "UI/Terminal/LineEditor.h"
 
+#include "Values/UTF8.h"
+
 #include <gtest/gtest.h>
 
 namespace spectrel {
