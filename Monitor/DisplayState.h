@@ -8,6 +8,7 @@
 #include "Values/List.h"
 #include "Values/Value.h"
 
+#include <chrono>
 #include <cstdint>
 #include <memory>
 #include <vector>
@@ -34,6 +35,9 @@ public:
 /// who listen, the journal of the display's changes.
 class DisplayState {
 public:
+    /// Between two refresh ticks, at which the display is built when messages have come.
+    static constexpr std::chrono::milliseconds RefreshInterval {2000};
+
     DisplayState()
         : _state(Dictionary::make())
     {

@@ -3,6 +3,7 @@
 #include "CommandLine/Program/CrashReport.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/LiveServices.h"
+#include "Monitor/SpectrelModel.h"
 #include "Platform/Qt/TerminationSignals.h"
 
 #include <cstdio>
@@ -27,7 +28,7 @@ public:
 
     int run()
     {
-        Ending::install(_model, {});
+        Ending::install(_model.displayState(), {});
         const TerminationSignals terminationSignals([this](int) { _live.runLoop().quit(); });
         _live.runLoop().async([this] { _model.restartMonitor(); });
         if (_options.duration)
@@ -40,7 +41,7 @@ public:
     void updateViewControllerFromModel() override
     {
         _model.topLevelNodes(); // builds the display, and the history entry of this refresh
-        const Value& display = _model.state()[StateKey::Display];
+        const Value& display = _model.displayState().display();
         _output.printDisplay(display);
         if (_options.format == OutputFormat::Tree)
             _output.printLine("");

@@ -2,6 +2,7 @@
 
 #include "CommandLine/Program/CrashReport.h"
 #include "Monitor/Snapshot.h"
+#include "Monitor/SpectrelModel.h"
 #include "Platform/Places.h"
 #include "Platform/Qt/QtPreferences.h"
 #include "UI/SpectrelApp.h"
@@ -32,7 +33,7 @@ void runLiveApplication(LiveServices& live, ScreenToolkit& toolkit, const std::f
     const auto makeModel = [&](SpectrelModelObserver& observer) -> std::unique_ptr<MonitorModel> {
         auto model =
             std::make_unique<SpectrelModel>(live.services(), observer, std::string(SpectrelModel::ApplicationPrefix));
-        Ending::install(*model, restoreScreen);
+        Ending::install(model->displayState(), restoreScreen);
         return model;
     };
     SpectrelApp application(

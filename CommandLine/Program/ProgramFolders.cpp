@@ -1,7 +1,7 @@
 #include "CommandLine/Program/ProgramFolders.h"
 
 #include "CommandLine/Program/ErrorLine.h"
-#include "Monitor/SpectrelModel.h"
+#include "Monitor/Session.h"
 #include "Platform/Places.h"
 #include "Platform/Sockets/SocketMessagePorts.h"
 
@@ -23,7 +23,7 @@ std::optional<std::string> templates(const std::optional<std::string>& named)
 bool preparePorts(std::string_view portPrefix)
 {
     std::string reason;
-    const std::string name = std::string(portPrefix) + std::string(SpectrelModel::PortSuffix);
+    const std::string name = std::string(portPrefix) + std::string(Session::PortSuffix);
     if (SocketMessagePorts::prepareDirectory(Places::portDirectory(), name, reason))
         return true;
     report("the message ports' folder cannot be had: " + reason);

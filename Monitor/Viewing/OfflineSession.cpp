@@ -1,7 +1,6 @@
 #include "Monitor/Viewing/OfflineSession.h"
 
 #include "Monitor/Snapshot.h"
-#include "Monitor/SpectrelModel.h"
 
 #include <algorithm>
 
@@ -49,7 +48,7 @@ void OfflineSession::runTicksBefore(Moment time)
 {
     if (!_display.hasNews())
         return;
-    const auto interval = std::chrono::duration_cast<std::chrono::microseconds>(SpectrelModel::RefreshInterval);
+    const auto interval = std::chrono::duration_cast<std::chrono::microseconds>(DisplayState::RefreshInterval);
     const auto elapsed = _last - _first;
     const auto ticks = std::max<std::int64_t>(1, (elapsed + interval - std::chrono::microseconds(1)) / interval);
     const Moment tick = _first + ticks * interval;

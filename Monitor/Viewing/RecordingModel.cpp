@@ -1,5 +1,6 @@
 #include "Monitor/Viewing/RecordingModel.h"
 
+#include "Monitor/DisplayState.h"
 #include "Monitor/MessageText.h"
 
 #include <algorithm>
@@ -13,7 +14,7 @@ namespace {
 
 constexpr std::uint64_t AllMessages = std::numeric_limits<std::uint64_t>::max();
 constexpr Playback::Time AnyTime = Playback::Time::max();
-constexpr Playback::Time Tick = SpectrelModel::RefreshInterval;
+constexpr Playback::Time Tick = DisplayState::RefreshInterval;
 
 } // namespace
 
