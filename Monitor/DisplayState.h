@@ -11,6 +11,7 @@
 #include <chrono>
 #include <cstdint>
 #include <memory>
+#include <utility>
 #include <vector>
 
 namespace spectrel {
@@ -38,8 +39,9 @@ public:
     /// Between two refresh ticks, at which the display is built when messages have come.
     static constexpr std::chrono::milliseconds RefreshInterval {2000};
 
-    DisplayState()
-        : _state(Dictionary::make())
+    explicit DisplayState(GeneratorFactory makeGenerator)
+        : _makeGenerator(std::move(makeGenerator))
+        , _state(Dictionary::make())
     {
     }
     DisplayState(const DisplayState&) = delete;
@@ -96,6 +98,7 @@ public:
     void removeReader(JournalReader& reader);
 
 private:
+    GeneratorFactory _makeGenerator;
     DictionaryRef _state;
     GeneratorSlot _generator;
     bool _hasNews = false;

@@ -6,10 +6,12 @@
 
 namespace spectrel {
 
-SpectrelModel::SpectrelModel(Services services, SpectrelModelObserver& observer, std::string portPrefix)
+SpectrelModel::SpectrelModel(
+    Services services, GeneratorFactory makeGenerator, SpectrelModelObserver& observer, std::string portPrefix)
     : _runLoop(services.runLoop)
     , _observer(observer)
     , _alive(std::make_shared<bool>(true))
+    , _display(std::move(makeGenerator))
     , _session(services, *this, std::move(portPrefix))
 {
 }

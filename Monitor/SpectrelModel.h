@@ -42,7 +42,8 @@ public:
     static constexpr std::string_view ApplicationPrefix = "org.spectrel.Spectrel";
 
     /// Opens nothing.
-    SpectrelModel(Services services, SpectrelModelObserver& observer, std::string portPrefix);
+    SpectrelModel(
+        Services services, GeneratorFactory makeGenerator, SpectrelModelObserver& observer, std::string portPrefix);
 
     // The session.
     bool isConnected() const override

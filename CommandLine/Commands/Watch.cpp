@@ -3,6 +3,7 @@
 #include "CommandLine/Program/CrashReport.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/LiveServices.h"
+#include "LogGenerator/LogGenerator.h"
 #include "Monitor/SpectrelModel.h"
 #include "Platform/Qt/TerminationSignals.h"
 
@@ -17,7 +18,7 @@ public:
     explicit Watching(const WatchOptions& options)
         : _options(options)
         , _output(stdout, options.format)
-        , _model(_live.services(), *this, LiveServices::portPrefixFor("Watch"))
+        , _model(_live.services(), &LogGenerator::generatorFromTechnology, *this, LiveServices::portPrefixFor("Watch"))
         , _journal(printsChanges(options.format) ? &_model.displayState().followChanges() : nullptr)
     {
     }

@@ -3,6 +3,7 @@
 #include "Monitor/Snapshot.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace spectrel {
 
@@ -11,8 +12,9 @@ namespace {
 constexpr std::size_t RawLot = 1024 * 1024;
 } // namespace
 
-OfflineSession::OfflineSession(bool keepsHistory)
+OfflineSession::OfflineSession(GeneratorFactory makeGenerator, bool keepsHistory)
     : _keepsHistory(keepsHistory)
+    , _display(std::move(makeGenerator))
 {
 }
 

@@ -17,7 +17,7 @@ class OfflineSession {
 public:
     /// `keepsHistory`: run the refresh ticks and keep the raw messages, as a snapshot needs them; otherwise the raw
     /// messages are forgotten, so that memory does not grow with the recording.
-    explicit OfflineSession(bool keepsHistory);
+    OfflineSession(GeneratorFactory makeGenerator, bool keepsHistory);
 
     /// A recording of another technology replaces the generator, as a baseband that changes its technology does.
     void useTechnology(Technology technology);

@@ -18,16 +18,17 @@ constexpr Playback::Time Tick = DisplayState::RefreshInterval;
 
 } // namespace
 
-RecordingModel::RecordingModel(
-    RunLoop& runLoop, SpectrelModelObserver& observer, ViewedClock& clock, RecordingTrack track, Report report)
+RecordingModel::RecordingModel(RunLoop& runLoop, GeneratorFactory makeGenerator, SpectrelModelObserver& observer,
+    ViewedClock& clock, RecordingTrack track, Report report)
     : _runLoop(runLoop)
+    , _makeGenerator(std::move(makeGenerator))
     , _observer(observer)
     , _clock(clock)
     , _track(std::move(track))
     , _report(std::move(report))
     , _alive(std::make_shared<bool>(true))
 {
-    _session.emplace(false);
+    _session.emplace(_makeGenerator, false);
     _session->useTechnology(_track.technology());
     _clock.set(_track.momentAt(Time::zero()));
 }
@@ -141,7 +142,7 @@ bool RecordingModel::rewind()
         return false;
     }
     _session.reset(); // before the next one, which installs its clock
-    _session.emplace(false);
+    _session.emplace(_makeGenerator, false);
     _session->useTechnology(_track.technology());
     _isTreeOld = true;
     return true;

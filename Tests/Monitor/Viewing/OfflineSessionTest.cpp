@@ -50,7 +50,7 @@ protected:
     FakeResources resources;
     const ScratchFolder scratch;
     const std::string folder = scratch.path().string();
-    OfflineSession session {true};
+    OfflineSession session {&LogGenerator::generatorFromTechnology, true};
 };
 
 TEST_F(OfflineSessionTest, MessageAtTheVeryTimeOfATickComesBeforeIt)
