@@ -96,9 +96,10 @@ private:
 
     void saveSnapshot()
     {
-        std::string reason;
-        if (_options.snapshotDirectory && !_session.saveSnapshot(*_options.snapshotDirectory, reason))
-            fail("cannot write the snapshot: " + reason);
+        if (!_options.snapshotDirectory)
+            return;
+        if (const Outcome saved = _session.saveSnapshot(*_options.snapshotDirectory); !saved)
+            fail("cannot write the snapshot: " + saved.failure().text);
     }
 
     const DecodeOptions& _options;

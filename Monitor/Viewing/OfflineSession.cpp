@@ -65,19 +65,17 @@ void OfflineSession::refresh(Moment time)
     _display.takeNews();
 }
 
-bool OfflineSession::saveSnapshot(const std::string& directory, std::string& reason)
+Outcome OfflineSession::saveSnapshot(const std::string& directory)
 {
-    if (_messages == 0) {
-        reason = "there is no message to save";
-        return false;
-    }
+    if (_messages == 0)
+        return Failure {"there is no message to save"};
     refresh(_last);
     const auto snapshot = makeSnapshot(_last, _display.saveContents(), "");
     const std::string path = snapshotPath(directory, _last);
-    if (writeSnapshot(snapshot, path, reason))
-        return true;
-    reason = path + ": " + reason;
-    return false;
+    std::string reason;
+    if (!writeSnapshot(snapshot, path, reason))
+        return Failure {path + ": " + reason};
+    return Done {};
 }
 
 } // namespace spectrel

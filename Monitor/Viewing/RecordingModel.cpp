@@ -134,9 +134,8 @@ void RecordingModel::moveTo(Goal goal)
 /// False when the file is no longer there; everything stays as it is.
 bool RecordingModel::rewind()
 {
-    std::string reason;
-    if (!_track.rewind(reason)) {
-        _notice = "cannot go back: " + reason;
+    if (const Outcome atStart = _track.rewind(); !atStart) {
+        _notice = "cannot go back: " + atStart.failure().text;
         _goal = {_track.lastTime(), _track.taken()};
         pause();
         return false;

@@ -31,9 +31,12 @@ std::unique_ptr<ViewedFile> ViewedFile::open(
             file->_clock.set(moment);
         return file;
     }
-    file->_recording = RecordingTrack::open(path, std::move(reader), technology, reason);
-    if (!file->_recording)
+    auto track = RecordingTrack::open(path, std::move(reader), technology);
+    if (!track) {
+        reason = track.failure().text;
         return nullptr;
+    }
+    file->_recording = std::move(*track);
     file->_damage = file->_recording->damage();
     return file;
 }
