@@ -5,6 +5,7 @@
 #include "CommandLine/Program/LiveServices.h"
 #include "CommandLine/Program/Logging.h"
 #include "CommandLine/Program/ProgramFolders.h"
+#include "Monitor/SpectrelModel.h"
 #include "Platform/Console.h"
 #include "Platform/Resources.h"
 

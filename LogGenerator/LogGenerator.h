@@ -5,6 +5,7 @@
 #include "Values/List.h"
 
 #include <cstddef>
+#include <functional>
 #include <memory>
 #include <string_view>
 
@@ -48,7 +49,8 @@ public:
     /// Keeps a message that could not be applied among the raw messages, for a snapshot written at the program's end.
     virtual void keepRawMessage(ByteView data);
 
-    /// A new generator for the telephony service's technology value; null for any other value.
+    /// A new generator for the telephony service's technology value; null for any other value. The factory of the
+    /// programs; what is handed a factory does not know it.
     static std::unique_ptr<LogGenerator> generatorFromTechnology(const Value& technology);
     /// Appends one history entry, built from the state's current values, keeping the newest five.
     static void updateHistoryInState(Dictionary& state);
@@ -59,5 +61,8 @@ protected:
     /// uninitialised for want of a template.
     void init();
 };
+
+/// Makes a new generator for the telephony service's technology value; null for a value that it does not know.
+using GeneratorFactory = std::function<std::unique_ptr<LogGenerator>(const Value& technology)>;
 
 } // namespace spectrel

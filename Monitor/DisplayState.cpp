@@ -6,7 +6,7 @@ namespace spectrel {
 
 void DisplayState::useTechnology(const Value& technology, SameClass same)
 {
-    auto successor = LogGenerator::generatorFromTechnology(technology);
+    auto successor = _makeGenerator(technology);
     if (same == SameClass::GoesOn && _generator && successor && successor->className() == _generator->className())
         return;
     _generator.replace(std::move(successor), *_state, _hasNews);

@@ -8,8 +8,10 @@
 #include "Values/List.h"
 #include "Values/Value.h"
 
+#include <chrono>
 #include <cstdint>
 #include <memory>
+#include <utility>
 #include <vector>
 
 namespace spectrel {
@@ -34,8 +36,12 @@ public:
 /// who listen, the journal of the display's changes.
 class DisplayState {
 public:
-    DisplayState()
-        : _state(Dictionary::make())
+    /// Between two refresh ticks, at which the display is built when messages have come.
+    static constexpr std::chrono::milliseconds RefreshInterval {2000};
+
+    explicit DisplayState(GeneratorFactory makeGenerator)
+        : _makeGenerator(std::move(makeGenerator))
+        , _state(Dictionary::make())
     {
     }
     DisplayState(const DisplayState&) = delete;
@@ -92,6 +98,7 @@ public:
     void removeReader(JournalReader& reader);
 
 private:
+    GeneratorFactory _makeGenerator;
     DictionaryRef _state;
     GeneratorSlot _generator;
     bool _hasNews = false;

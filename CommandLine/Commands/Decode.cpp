@@ -1,6 +1,7 @@
 #include "CommandLine/Commands/Decode.h"
 
 #include "CommandLine/Program/ErrorLine.h"
+#include "LogGenerator/LogGenerator.h"
 #include "Monitor/MessageText.h"
 #include "Monitor/Viewing/OfflineSession.h"
 
@@ -16,7 +17,7 @@ class Decoding {
 public:
     explicit Decoding(const DecodeOptions& options)
         : _options(options)
-        , _session(options.snapshotDirectory.has_value())
+        , _session(&LogGenerator::generatorFromTechnology, options.snapshotDirectory.has_value())
         , _journal(printsChanges(options.format) ? &_session.displayState().followChanges() : nullptr)
         , _output(stdout, options.format)
     {
@@ -95,9 +96,10 @@ private:
 
     void saveSnapshot()
     {
-        std::string reason;
-        if (_options.snapshotDirectory && !_session.saveSnapshot(*_options.snapshotDirectory, reason))
-            fail("cannot write the snapshot: " + reason);
+        if (!_options.snapshotDirectory)
+            return;
+        if (const Outcome saved = _session.saveSnapshot(*_options.snapshotDirectory); !saved)
+            fail("cannot write the snapshot: " + saved.failure().text);
     }
 
     const DecodeOptions& _options;

@@ -2,8 +2,12 @@
 
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/LiveServices.h"
+#include "LogGenerator/LogGenerator.h"
+#include "Monitor/Session.h"
 #include "Platform/Qt/TerminationSignals.h"
 #include "Records/Recording.h"
+
+#include <memory>
 
 namespace spectrel {
 
@@ -12,12 +16,12 @@ namespace {
 /// Messages reach the file at the latest this long after they came.
 constexpr std::chrono::milliseconds FlushDelay {500};
 
-class Recorder final : public SpectrelModelObserver {
+class Recorder final : public SessionSink {
 public:
     explicit Recorder(const RecordOptions& options)
         : _options(options)
         , _files(options.files)
-        , _model(_live.services(), *this, LiveServices::portPrefixFor("Record"))
+        , _session(_live.services(), *this, LiveServices::portPrefixFor("Record"))
     {
     }
 
@@ -28,11 +32,11 @@ public:
             return _status;
         }
         const TerminationSignals terminationSignals([this](int) { _live.runLoop().quit(); });
-        _live.runLoop().async([this] { _model.restartMonitor(); });
+        _live.runLoop().async([this] { _session.restart(); });
         if (_options.duration)
             _live.runLoop().after(*_options.duration, [this] { _live.runLoop().quit(); });
         _live.runLoop().run();
-        _model.destroyPorts();
+        _session.destroyPorts();
         flush();
         if (_files.count() == 0 && _status == 0)
             fail(RecordingFiles::spoken(_options.files.target) + ": nothing was recorded, for no session was opened");
@@ -43,20 +47,26 @@ public:
         return _status;
     }
 
-    bool modelShouldApply(ByteView body) override
+    void useTechnology(const Value& technology) override
     {
-        if (const auto technology = technologyOfConstant(_model.technology());
+        _generator = LogGenerator::generatorFromTechnology(technology);
+    }
+    LogGenerator* generator() override
+    {
+        return _generator.get();
+    }
+    void receive(ByteView body) override
+    {
+        if (const auto technology = technologyOfConstant(_session.technology());
             technology && _status == 0 && _messages != _options.count)
             write(*technology, body);
-        return false;
     }
-    void updateViewControllerFromModel() override { }
     void sessionDidChange() override
     {
-        if (_model.isConnected())
+        if (_session.isConnected())
             begin();
-        else if (!_model.lostReason().empty())
-            report("Connecting... (" + _model.lostReason() + ")");
+        else if (!_session.loss().text.empty())
+            report("Connecting... (" + _session.loss().text + ")");
     }
 
 private:
@@ -70,7 +80,7 @@ private:
     /// The file is there from the session's start on, before the first message.
     void begin()
     {
-        const auto technology = technologyOfConstant(_model.technology());
+        const auto technology = technologyOfConstant(_session.technology());
         if (!technology || _status != 0)
             return;
         if (const auto begun = _files.begin(*technology, Clock::installed().now()); !begun)
@@ -102,7 +112,8 @@ private:
     const RecordOptions& _options;
     RecordingFiles _files;
     LiveServices _live;
-    SpectrelModel _model;
+    std::unique_ptr<LogGenerator> _generator; // for its start command: nothing is decoded
+    Session _session;
     std::uint64_t _messages = 0;
     bool _flushIsDue = false;
     int _status = 0;

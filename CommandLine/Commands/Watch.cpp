@@ -3,6 +3,8 @@
 #include "CommandLine/Program/CrashReport.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/LiveServices.h"
+#include "LogGenerator/LogGenerator.h"
+#include "Monitor/SpectrelModel.h"
 #include "Platform/Qt/TerminationSignals.h"
 
 #include <cstdio>
@@ -16,7 +18,7 @@ public:
     explicit Watching(const WatchOptions& options)
         : _options(options)
         , _output(stdout, options.format)
-        , _model(_live.services(), *this, LiveServices::portPrefixFor("Watch"))
+        , _model(_live.services(), &LogGenerator::generatorFromTechnology, *this, LiveServices::portPrefixFor("Watch"))
         , _journal(printsChanges(options.format) ? &_model.displayState().followChanges() : nullptr)
     {
     }
@@ -27,7 +29,7 @@ public:
 
     int run()
     {
-        Ending::install(_model, {});
+        Ending::install(_model.displayState(), {});
         const TerminationSignals terminationSignals([this](int) { _live.runLoop().quit(); });
         _live.runLoop().async([this] { _model.restartMonitor(); });
         if (_options.duration)
@@ -40,7 +42,7 @@ public:
     void updateViewControllerFromModel() override
     {
         _model.topLevelNodes(); // builds the display, and the history entry of this refresh
-        const Value& display = _model.state()[StateKey::Display];
+        const Value& display = _model.displayState().display();
         _output.printDisplay(display);
         if (_options.format == OutputFormat::Tree)
             _output.printLine("");

@@ -1,9 +1,9 @@
 #include "CommandLine/Program/CrashReport.h"
 
 #include "CommandLine/Program/ErrorLine.h"
+#include "Monitor/DisplayState.h"
 #include "Monitor/MessageText.h"
 #include "Monitor/Snapshot.h"
-#include "Monitor/SpectrelModel.h"
 #include "Platform/Clock.h"
 #include "Platform/Places.h"
 #include "Platform/SystemLog.h"
@@ -19,7 +19,7 @@ namespace spectrel {
 
 namespace {
 
-SpectrelModel* endingModel = nullptr;
+DisplayState* endingDisplay = nullptr;
 std::function<void()> giveScreenBack;
 std::string reasonOfEnding = "unknown reason";
 
@@ -56,16 +56,16 @@ void tellEverywhere(const std::string& line)
 
 } // namespace
 
-void Ending::install(SpectrelModel& model, std::function<void()> restoreScreen)
+void Ending::install(DisplayState& display, std::function<void()> restoreScreen)
 {
-    endingModel = &model;
+    endingDisplay = &display;
     giveScreenBack = std::move(restoreScreen);
     std::set_terminate(&Ending::terminate);
 }
 
 void Ending::remove()
 {
-    endingModel = nullptr;
+    endingDisplay = nullptr;
     giveScreenBack = {};
 }
 
@@ -84,7 +84,7 @@ void Ending::terminate() noexcept
 void Ending::tell()
 {
     reasonOfEnding = "ended by " + currentExceptionName();
-    const ByteView message = endingModel ? endingModel->messageInProgress() : ByteView();
+    const ByteView message = endingDisplay ? endingDisplay->messageInProgress() : ByteView();
     if (message.empty())
         return tellEverywhere(reasonOfEnding);
     tellEverywhere(reasonOfEnding + ", raised by a message of " + std::to_string(message.size()) + " bytes, "
@@ -93,9 +93,9 @@ void Ending::tell()
 
 void Ending::saveWhatIsLeft()
 {
-    if (!endingModel)
+    if (!endingDisplay)
         return;
-    const ListRef contents = std::exchange(endingModel, nullptr)->getLastContents();
+    const ListRef contents = std::exchange(endingDisplay, nullptr)->lastContents();
     if (!contents)
         return;
     const Moment now = Clock::installed().now();

@@ -1,7 +1,9 @@
 #include "CommandLine/Program/LiveApplication.h"
 
 #include "CommandLine/Program/CrashReport.h"
+#include "LogGenerator/LogGenerator.h"
 #include "Monitor/Snapshot.h"
+#include "Monitor/SpectrelModel.h"
 #include "Platform/Places.h"
 #include "Platform/Qt/QtPreferences.h"
 #include "UI/SpectrelApp.h"
@@ -30,9 +32,9 @@ void runLiveApplication(LiveServices& live, ScreenToolkit& toolkit, const std::f
 {
     QtPreferences preferences(Places::preferencesDirectory());
     const auto makeModel = [&](SpectrelModelObserver& observer) -> std::unique_ptr<MonitorModel> {
-        auto model =
-            std::make_unique<SpectrelModel>(live.services(), observer, std::string(SpectrelModel::ApplicationPrefix));
-        Ending::install(*model, restoreScreen);
+        auto model = std::make_unique<SpectrelModel>(live.services(), &LogGenerator::generatorFromTechnology, observer,
+            std::string(SpectrelModel::ApplicationPrefix));
+        Ending::install(model->displayState(), restoreScreen);
         return model;
     };
     SpectrelApp application(

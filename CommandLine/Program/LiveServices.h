@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Monitor/SpectrelModel.h"
+#include "Monitor/Session.h"
 #include "Platform/Qt/QtClock.h"
 #include "Platform/Qt/QtRunLoop.h"
 #include "Platform/Sockets/SocketMessagePorts.h"
@@ -27,7 +27,7 @@ public:
     {
         return _clock;
     }
-    SpectrelModel::Services services()
+    Session::Services services()
     {
         return {_runLoop, _ports, _telephony};
     }

@@ -1,7 +1,7 @@
 #include "CommandLine/Program/ProgramFolders.h"
 
 #include "CommandLine/Program/ErrorLine.h"
-#include "Monitor/SpectrelModel.h"
+#include "Monitor/Session.h"
 #include "Platform/Places.h"
 #include "Platform/Sockets/SocketMessagePorts.h"
 
@@ -22,7 +22,7 @@ std::optional<std::string> templates(const std::optional<std::string>& named)
 
 bool preparePorts(std::string_view portPrefix)
 {
-    const std::string name = std::string(portPrefix) + std::string(SpectrelModel::PortSuffix);
+    const std::string name = std::string(portPrefix) + std::string(Session::PortSuffix);
     const auto prepared = SocketMessagePorts::prepareDirectory(Places::portDirectory(), name);
     if (!prepared)
         report(prepared.failure().of("the message ports' folder cannot be had").text);

@@ -2,6 +2,7 @@
 
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/ExitStatus.h"
+#include "LogGenerator/LogGenerator.h"
 #include "Monitor/Snapshot.h"
 #include "Platform/Preferences.h"
 #include "UI/SpectrelApp.h"
@@ -15,8 +16,10 @@ int runViewingApplication(ViewedFile& file, const std::string& path, QtRunLoop& 
         tell(file.damage());
     NoPreferences preferences;
     SpectrelApp application({runLoop, file.clock(), preferences, toolkit,
-        [&](SpectrelModelObserver& observer) { return file.makeModel(runLoop, observer, tell); }, writeSnapshot, {},
-        false});
+        [&](SpectrelModelObserver& observer) {
+            return file.makeModel(runLoop, &LogGenerator::generatorFromTechnology, observer, tell);
+        },
+        writeSnapshot, {}, false});
     application.applicationDidFinishLaunching();
     runLoop.run();
     application.applicationWillTerminate();

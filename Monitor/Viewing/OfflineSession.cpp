@@ -1,9 +1,9 @@
 #include "Monitor/Viewing/OfflineSession.h"
 
 #include "Monitor/Snapshot.h"
-#include "Monitor/SpectrelModel.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace spectrel {
 
@@ -12,8 +12,9 @@ namespace {
 constexpr std::size_t RawLot = 1024 * 1024;
 } // namespace
 
-OfflineSession::OfflineSession(bool keepsHistory)
+OfflineSession::OfflineSession(GeneratorFactory makeGenerator, bool keepsHistory)
     : _keepsHistory(keepsHistory)
+    , _display(std::move(makeGenerator))
 {
 }
 
@@ -49,7 +50,7 @@ void OfflineSession::runTicksBefore(Moment time)
 {
     if (!_display.hasNews())
         return;
-    const auto interval = std::chrono::duration_cast<std::chrono::microseconds>(SpectrelModel::RefreshInterval);
+    const auto interval = std::chrono::duration_cast<std::chrono::microseconds>(DisplayState::RefreshInterval);
     const auto elapsed = _last - _first;
     const auto ticks = std::max<std::int64_t>(1, (elapsed + interval - std::chrono::microseconds(1)) / interval);
     const Moment tick = _first + ticks * interval;
@@ -64,19 +65,17 @@ void OfflineSession::refresh(Moment time)
     _display.takeNews();
 }
 
-bool OfflineSession::saveSnapshot(const std::string& directory, std::string& reason)
+Outcome OfflineSession::saveSnapshot(const std::string& directory)
 {
-    if (_messages == 0) {
-        reason = "there is no message to save";
-        return false;
-    }
+    if (_messages == 0)
+        return Failure {"there is no message to save"};
     refresh(_last);
     const auto snapshot = makeSnapshot(_last, _display.saveContents(), "");
     const std::string path = snapshotPath(directory, _last);
-    if (writeSnapshot(snapshot, path, reason))
-        return true;
-    reason = path + ": " + reason;
-    return false;
+    std::string reason;
+    if (!writeSnapshot(snapshot, path, reason))
+        return Failure {path + ": " + reason};
+    return Done {};
 }
 
 } // namespace spectrel

@@ -3,6 +3,7 @@
 #include "Monitor/DisplayState.h"
 #include "Monitor/Viewing/RecordingClock.h"
 #include "Records/Recording.h"
+#include "Values/Result.h"
 #include "Values/Value.h"
 
 #include <cstdint>
@@ -17,7 +18,7 @@ class OfflineSession {
 public:
     /// `keepsHistory`: run the refresh ticks and keep the raw messages, as a snapshot needs them; otherwise the raw
     /// messages are forgotten, so that memory does not grow with the recording.
-    explicit OfflineSession(bool keepsHistory);
+    OfflineSession(GeneratorFactory makeGenerator, bool keepsHistory);
 
     /// A recording of another technology replaces the generator, as a baseband that changes its technology does.
     void useTechnology(Technology technology);
@@ -33,9 +34,8 @@ public:
         return _display;
     }
 
-    /// Refreshes once more and writes the snapshot file, both at the last message's time. False, with `reason`, when it
-    /// cannot be written.
-    bool saveSnapshot(const std::string& directory, std::string& reason);
+    /// Refreshes once more and writes the snapshot file, both at the last message's time.
+    Outcome saveSnapshot(const std::string& directory);
 
 private:
     void runTicksBefore(Moment time);

@@ -1,5 +1,6 @@
 #include "Monitor/Viewing/RecordingModel.h"
 
+#include "Monitor/DisplayState.h"
 #include "Monitor/MessageText.h"
 
 #include <algorithm>
@@ -13,19 +14,20 @@ namespace {
 
 constexpr std::uint64_t AllMessages = std::numeric_limits<std::uint64_t>::max();
 constexpr Playback::Time AnyTime = Playback::Time::max();
-constexpr Playback::Time Tick = SpectrelModel::RefreshInterval;
+constexpr Playback::Time Tick = DisplayState::RefreshInterval;
 
 } // namespace
 
-RecordingModel::RecordingModel(
-    RunLoop& runLoop, SpectrelModelObserver& observer, ViewedClock& clock, RecordingTrack track, Report report)
+RecordingModel::RecordingModel(RunLoop& runLoop, GeneratorFactory makeGenerator, SpectrelModelObserver& observer,
+    ViewedClock& clock, RecordingTrack track, Report report)
     : _runLoop(runLoop)
+    , _makeGenerator(std::move(makeGenerator))
     , _observer(observer)
     , _clock(clock)
     , _track(std::move(track))
     , _report(std::move(report))
 {
-    _session.emplace(false);
+    _session.emplace(_makeGenerator, false);
     _session->useTechnology(_track.technology());
     _clock.set(_track.momentAt(Time::zero()));
 }
@@ -131,15 +133,14 @@ void RecordingModel::moveTo(Goal goal)
 /// False when the file is no longer there; everything stays as it is.
 bool RecordingModel::rewind()
 {
-    std::string reason;
-    if (!_track.rewind(reason)) {
-        _notice = "cannot go back: " + reason;
+    if (const Outcome atStart = _track.rewind(); !atStart) {
+        _notice = "cannot go back: " + atStart.failure().text;
         _goal = {_track.lastTime(), _track.taken()};
         pause();
         return false;
     }
     _session.reset(); // before the next one, which installs its clock
-    _session.emplace(false);
+    _session.emplace(_makeGenerator, false);
     _session->useTechnology(_track.technology());
     _isTreeOld = true;
     return true;

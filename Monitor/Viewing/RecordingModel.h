@@ -33,8 +33,8 @@ public:
     static constexpr std::uint64_t Slice = 4096; // messages a turn of the run loop
 
     /// `runLoop`, `observer` and `clock` outlive the model; the clock is set to the moment shown.
-    RecordingModel(
-        RunLoop& runLoop, SpectrelModelObserver& observer, ViewedClock& clock, RecordingTrack track, Report report);
+    RecordingModel(RunLoop& runLoop, GeneratorFactory makeGenerator, SpectrelModelObserver& observer,
+        ViewedClock& clock, RecordingTrack track, Report report);
 
     bool isConnected() const override
     {
@@ -110,6 +110,7 @@ private:
     void playOn();
 
     RunLoop& _runLoop;
+    GeneratorFactory _makeGenerator;
     SpectrelModelObserver& _observer;
     ViewedClock& _clock;
     RecordingTrack _track;

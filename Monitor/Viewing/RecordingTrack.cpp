@@ -5,23 +5,19 @@
 
 namespace spectrel {
 
-std::optional<RecordingTrack> RecordingTrack::open(std::string path, std::unique_ptr<RecordingReader> reader,
-    std::optional<Technology> technology, std::string& reason)
+Result<RecordingTrack> RecordingTrack::open(
+    std::string path, std::unique_ptr<RecordingReader> reader, std::optional<Technology> technology)
 {
     if (reader->technology())
         technology = reader->technology();
-    if (!technology) {
-        reason = "does not tell its technology; name it with --technology";
-        return std::nullopt;
-    }
+    if (!technology)
+        return Failure {"does not tell its technology; name it with --technology"};
     RecordingTrack track(std::move(path), *technology);
     track.measure(*reader);
-    if (track._messageCount == 0) {
-        reason = track._damage.empty() ? "the recording holds no message" : track._damage;
-        return std::nullopt;
-    }
-    if (!track.rewind(reason))
-        return std::nullopt;
+    if (track._messageCount == 0)
+        return Failure {track._damage.empty() ? "the recording holds no message" : track._damage};
+    if (const Outcome atStart = track.rewind(); !atStart)
+        return atStart.failure();
     return track;
 }
 
@@ -40,18 +36,16 @@ void RecordingTrack::measure(RecordingReader& reader)
         _duration = static_cast<std::int64_t>(_messageCount - 1) * StepWithoutTimes;
 }
 
-bool RecordingTrack::rewind(std::string& reason)
+Outcome RecordingTrack::rewind()
 {
     auto opened = openRecording(_path);
-    if (!opened) {
-        reason = opened.failure().text;
-        return false;
-    }
+    if (!opened)
+        return opened.failure();
     _reader = *std::move(opened);
     _taken = 0;
     _lastTime = {};
     readNext();
-    return true;
+    return Done {};
 }
 
 void RecordingTrack::take()

@@ -2,6 +2,7 @@
 
 #include "Monitor/Playback.h"
 #include "Records/Recording.h"
+#include "Values/Result.h"
 
 #include <cstdint>
 #include <memory>
@@ -21,10 +22,10 @@ public:
     static constexpr Time StepWithoutTimes {std::chrono::milliseconds(100)};
 
     /// Takes a reader that has just opened the file at `path`, which must be there for as long as the track is used.
-    /// `technology` counts where the file tells none. None, with `reason`, when the technology stays open or there is
-    /// not one message.
-    static std::optional<RecordingTrack> open(std::string path, std::unique_ptr<RecordingReader> reader,
-        std::optional<Technology> technology, std::string& reason);
+    /// `technology` counts where the file tells none. Fails when the technology stays open or there is not one
+    /// message.
+    static Result<RecordingTrack> open(
+        std::string path, std::unique_ptr<RecordingReader> reader, std::optional<Technology> technology);
 
     Technology technology() const
     {
@@ -68,8 +69,8 @@ public:
         return _taken;
     }
     void take();
-    /// Back to the start. False, with `reason`, when the file cannot be opened any more; the track stays where it is.
-    bool rewind(std::string& reason);
+    /// Back to the start. Fails when the file cannot be opened any more; the track stays where it is.
+    Outcome rewind();
 
 private:
     RecordingTrack(std::string path, Technology technology)

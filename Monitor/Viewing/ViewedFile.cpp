@@ -34,19 +34,23 @@ std::unique_ptr<ViewedFile> ViewedFile::open(
             file->_clock.set(moment);
         return file;
     }
-    file->_recording = RecordingTrack::open(path, std::move(reader), technology, reason);
-    if (!file->_recording)
+    auto track = RecordingTrack::open(path, std::move(reader), technology);
+    if (!track) {
+        reason = track.failure().text;
         return nullptr;
+    }
+    file->_recording = std::move(*track);
     file->_damage = file->_recording->damage();
     return file;
 }
 
-std::unique_ptr<MonitorModel> ViewedFile::makeModel(RunLoop& runLoop, SpectrelModelObserver& observer, Report report)
+std::unique_ptr<MonitorModel> ViewedFile::makeModel(
+    RunLoop& runLoop, GeneratorFactory makeGenerator, SpectrelModelObserver& observer, Report report)
 {
     if (_snapshot)
         return std::make_unique<SnapshotModel>(runLoop, observer, *_snapshot);
-    return std::make_unique<RecordingModel>(
-        runLoop, observer, _clock, std::move(*std::exchange(_recording, std::nullopt)), std::move(report));
+    return std::make_unique<RecordingModel>(runLoop, std::move(makeGenerator), observer, _clock,
+        std::move(*std::exchange(_recording, std::nullopt)), std::move(report));
 }
 
 } // namespace spectrel

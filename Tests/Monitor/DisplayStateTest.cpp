@@ -41,7 +41,7 @@ protected:
 
     LogRecorder log;
     FakeResources resources;
-    DisplayState display;
+    DisplayState display {&LogGenerator::generatorFromTechnology};
     Listener listener;
 };
 
@@ -64,6 +64,21 @@ TEST_F(DisplayStateTest, NothingIsFollowedUntilSomebodyListens)
     EXPECT_EQ(display.display().dictionary()->observer(), nullptr);
     display.followChanges();
     EXPECT_NE(display.display().dictionary()->observer(), nullptr);
+}
+
+TEST_F(DisplayStateTest, GeneratorsComeFromTheFactory)
+{
+    std::string asked;
+    DisplayState other([&asked](const Value& technology) {
+        asked += *technology.string() + " ";
+        return *technology.string() == "ours" ? LogGenerator::generatorFromTechnology(kRKLogChannelTechnology_IFX)
+                                              : nullptr;
+    });
+    other.useTechnology("ours");
+    EXPECT_EQ(other.generator()->className(), "GSMLogGenerator");
+    other.useTechnology("theirs");
+    EXPECT_EQ(other.generator(), nullptr);
+    EXPECT_EQ(asked, "ours theirs ");
 }
 
 TEST_F(DisplayStateTest, NewsAreTakenOnce)

@@ -29,8 +29,8 @@ protected:
     /// How many messages each history entry of the saved snapshot holds, and when it was made.
     std::string history()
     {
-        std::string reason;
-        EXPECT_TRUE(session.saveSnapshot(folder, reason)) << reason;
+        const Outcome saved = session.saveSnapshot(folder);
+        EXPECT_TRUE(saved) << (saved ? "" : saved.failure().text);
         std::string text;
         for (const auto& file : std::filesystem::directory_iterator(folder)) {
             const auto snapshot = readPropertyListFile(file.path().string());
@@ -50,7 +50,7 @@ protected:
     FakeResources resources;
     const ScratchFolder scratch;
     const std::string folder = scratch.path().string();
-    OfflineSession session {true};
+    OfflineSession session {&LogGenerator::generatorFromTechnology, true};
 };
 
 TEST_F(OfflineSessionTest, MessageAtTheVeryTimeOfATickComesBeforeIt)
@@ -94,9 +94,9 @@ TEST_F(OfflineSessionTest, RecordingOfAnotherTechnologyReplacesTheDisplayAndKeep
 
 TEST_F(OfflineSessionTest, NothingToSaveIsSaid)
 {
-    std::string reason;
-    EXPECT_FALSE(session.saveSnapshot(folder, reason));
-    EXPECT_EQ(reason, "there is no message to save");
+    const Outcome saved = session.saveSnapshot(folder);
+    ASSERT_FALSE(saved);
+    EXPECT_EQ(saved.failure().text, "there is no message to save");
 }
 
 } // namespace

@@ -81,7 +81,8 @@ protected:
         file = ViewedFile::open(path, technology, loop, reason);
         if (!file)
             return false;
-        model = file->makeModel(loop, screens, [this](const std::string& line) { reported += line + "\n"; });
+        model = file->makeModel(loop, &LogGenerator::generatorFromTechnology, screens,
+            [this](const std::string& line) { reported += line + "\n"; });
         model->restartMonitor();
         loop.runQueued();
         return true;
