@@ -11,6 +11,8 @@ namespace spectrel {
 namespace {
 
 constexpr std::string_view SourceName = "LogGenerator/GSM/GSMLogGenerator";
+// Shown in the log as places in this file. They are fixed texts, which the lines of today do not match: on purpose, as
+// logs are searched for them.
 constexpr int UnknownObjectLine = 78;
 constexpr int UndecodableLine = 90;
 
