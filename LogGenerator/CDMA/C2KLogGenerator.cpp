@@ -4,6 +4,7 @@
 #include "LogGenerator/CDMA/Lookup.h"
 #include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
+#include "Platform/TelephonyProtocol.h"
 #include "Records/Frame.h"
 #include "Records/RecordView.h"
 #include "Values/List.h"
@@ -58,7 +59,10 @@ DictionaryRef C2KLogGenerator::getStartCommand()
     auto codes = List::make();
     for (const Decoder& decoder : Decoders)
         codes->append(Value::integer(decoder.code));
-    return Dictionary::make({{"SetState", "Streaming"}, {"SetZephyrLogCodes", codes}});
+    return Dictionary::make({
+        {std::string(TelephonyProtocol::SetStateKey), TelephonyProtocol::StreamingState},
+        {std::string(TelephonyProtocol::OrdinaryCodesKey), codes},
+    });
 }
 
 void C2KLogGenerator::updateState(Dictionary& state, ByteView data)

@@ -1,6 +1,7 @@
 #include "LogGenerator/GSM/GSMLogGenerator.h"
 
 #include "Platform/SystemLog.h"
+#include "Platform/TelephonyProtocol.h"
 #include "Values/PropertyList/PropertyList.h"
 
 #include <array>
@@ -63,7 +64,7 @@ Value GSMLogGenerator::generateLogUsingState(Dictionary& state)
 
 DictionaryRef GSMLogGenerator::getStartCommand()
 {
-    return Dictionary::make({{"SetState", "Streaming"}});
+    return Dictionary::make({{std::string(TelephonyProtocol::SetStateKey), TelephonyProtocol::StreamingState}});
 }
 
 ListRef GSMLogGenerator::getSaveContentsFromState(const Dictionary& state)

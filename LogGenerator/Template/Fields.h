@@ -5,6 +5,7 @@
 #include "Values/TextBuffer.h"
 
 #include <algorithm>
+#include <array>
 #include <cstddef>
 #include <cstdint>
 #include <functional>
@@ -46,6 +47,15 @@ struct Field {
     std::string_view key;
     Formatter format;
 };
+
+/// Tables one behind the other, as one.
+template <std::size_t... Counts> constexpr auto joined(const std::array<Field, Counts>&... tables)
+{
+    std::array<Field, (Counts + ...)> all {};
+    auto end = all.begin();
+    ((end = std::ranges::copy(tables, end).out), ...);
+    return all;
+}
 
 /// "%d": a 32-bit field shows its bits as a signed number.
 std::string_view decimal(std::uint32_t value, TextBuffer& buffer);

@@ -61,8 +61,6 @@ public:
     std::vector<std::uint32_t> getLogCodeArray() const final;
     void updateWithData(RecordView record, std::uint32_t logCode) final;
 
-    using Base::clearList;
-
 protected:
     /// `description` and `registry` outlive the section.
     RecordSection(const SectionDescription& description, SectionRegistry& registry);
@@ -129,8 +127,5 @@ template <typename Section, void (Section::*Method)(RecordView)> struct HookTo<M
 };
 /// A section's own operation as a hook: `hook<&BLER::storeChannels>`.
 template <auto Method> inline constexpr Hook hook = &HookTo<Method>::call;
-
-/// Empties the section's list.
-inline constexpr Hook emptyList = [](RecordSection& section, RecordView) { section.clearList(); };
 
 } // namespace spectrel

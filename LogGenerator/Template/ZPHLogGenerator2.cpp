@@ -3,6 +3,7 @@
 #include "LogGenerator/Template/Base.h"
 #include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
+#include "Platform/TelephonyProtocol.h"
 #include "Records/Frame.h"
 
 #include <algorithm>
@@ -135,9 +136,9 @@ DictionaryRef ZPHLogGenerator2::getStartCommand()
             ordinary->append(Value::integer(code));
     }
     return Dictionary::make({
-        {"SetState", "Streaming"},
-        {"SetZephyrLogCodes", ordinary},
-        {"SetRkExtraCodes", extra},
+        {std::string(TelephonyProtocol::SetStateKey), TelephonyProtocol::StreamingState},
+        {std::string(TelephonyProtocol::OrdinaryCodesKey), ordinary},
+        {std::string(TelephonyProtocol::ExtraCodesKey), extra},
     });
 }
 

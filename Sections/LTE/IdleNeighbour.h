@@ -43,15 +43,21 @@ class NeighborCellsList final : public SectionOf<NeighborCellsList> {
     static constexpr Formatter Power = fineLevel<2, -140, LevelUnit::dBm>;
     static constexpr Formatter RSRQ = fineLevel<4, -30, LevelUnit::dB>;
 
-    /// A neighbour, 20 bytes; 10, 11 and 16 to 19 are not read. The second antenna shows the first one's fields: kept
-    /// on purpose.
-    static constexpr std::array<Field, 12> EntryFields {{
+    // A neighbour, 20 bytes; 10, 11 and 16 to 19 are not read. The second antenna shows the first one's fields: kept on
+    // purpose.
+    static constexpr std::array<Field, 1> CellFields {{
         {0, bits(0, 9), "Physical Cell ID", decimal},
+    }};
+    static constexpr std::array<Field, 3> PowerFields {{
         {1, bits(1, 8), "Measured RSSI", Power},
         {2, bits(1, 9), "Measured RSRP", Power},
         {4, bits(0, 9), "Average RSRP", Power},
+    }};
+    static constexpr std::array<Field, 2> QualityFields {{
         {5, bits(1, 7), "Measured RSRQ", RSRQ},
         {6, bits(0, 7), "Average RSRQ", RSRQ},
+    }};
+    static constexpr std::array<Field, 6> FurtherFields {{
         {6, bits(7, 7), "Srxlev", Srxlev},
         {8, Width::U16, "Frequency Offset", decimal},
         {12, bits(0, 11), "Ant 0 Frame Offset", decimal},
@@ -59,6 +65,7 @@ class NeighborCellsList final : public SectionOf<NeighborCellsList> {
         {12, bits(0, 11), "Ant 1 Frame Offset", decimal},
         {13, bits(3, 19), "Ant 1 Sample Offset", decimal},
     }};
+    static constexpr auto EntryFields = joined(CellFields, PowerFields, QualityFields, FurtherFields);
 
     void logNeighbours(RecordView record)
     {
@@ -68,18 +75,16 @@ class NeighborCellsList final : public SectionOf<NeighborCellsList> {
         for (std::size_t index = 0; index < neighbours.count; ++index)
             logNeighbour(record, neighbours.entry(index));
     }
-    /// The cell and its five levels, which share one label: kept on purpose.
+    /// One label for all five levels: kept on purpose.
     static void logNeighbour(RecordView record, std::size_t start)
     {
-        for (const Field& field : EntryFields) {
-            const std::uint32_t value = fieldValue(record, field, start);
-            if (field.key == "Physical Cell ID")
-                SPECTREL_LOG(Priority::Warning, "Physical Cell ID: %d\n", static_cast<int>(value));
-            else if (field.format == Power)
-                SPECTREL_LOG(Priority::Warning, "Measured RSSI: %lf\n", level<2, -140>(value));
-            else if (field.format == RSRQ)
-                SPECTREL_LOG(Priority::Warning, "Measured RSSI: %lf\n", level<4, -30>(value));
-        }
+        for (const Field& field : CellFields)
+            SPECTREL_LOG(
+                Priority::Warning, "Physical Cell ID: %d\n", static_cast<int>(fieldValue(record, field, start)));
+        for (const Field& field : PowerFields)
+            SPECTREL_LOG(Priority::Warning, "Measured RSSI: %lf\n", level<2, -140>(fieldValue(record, field, start)));
+        for (const Field& field : QualityFields)
+            SPECTREL_LOG(Priority::Warning, "Measured RSSI: %lf\n", level<4, -30>(fieldValue(record, field, start)));
     }
 
     static constexpr std::array<RecordLayout, 1> Layouts {{

@@ -102,9 +102,14 @@ public:
     static constexpr SectionDescription Description {.name = "Active Set", .trace = "ActiveSet", .layouts = Layouts};
 };
 
-/// A list that every cell-set record empties and no record ever fills.
+// The other sets: lists that every cell-set record empties and no record ever fills, although it has their cells. Kept
+// on purpose.
+constexpr RepeatedGroup noCells(RecordView)
+{
+    return {0, 0, 0};
+}
 inline constexpr std::array<RecordLayout, 1> EmptiedByCellSets {{
-    {.code = UMTSCellSets::Code, .minimumLength = UMTSCellSets::MinimumLength, .hook = emptyList},
+    {.code = UMTSCellSets::Code, .minimumLength = UMTSCellSets::MinimumLength, .entries = {noCells, {}}},
 }};
 using DetectedSet = PlainSection<"Detected Set", "DetectedSet", EmptiedByCellSets>;
 using MonitoredSet = PlainSection<"Monitored Set", "MonitoredSet", EmptiedByCellSets>;
