@@ -4,6 +4,7 @@
 #include "Monitor/MonitorModel.h"
 #include "Monitor/Session.h"
 #include "Monitor/SpectrelModelNode.h"
+#include "Platform/Lifetime.h"
 #include "Values/Bytes.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
@@ -121,7 +122,7 @@ private:
 
     RunLoop& _runLoop;
     SpectrelModelObserver& _observer;
-    std::shared_ptr<bool> _alive; // jobs on the queue hold it weakly: they end with the model
+    Lifetime _lifetime;
     std::size_t _intake = 0; // bytes applied since the last refresh
     DisplayState _display;
     NodeRef _nodes;

@@ -12,6 +12,8 @@ namespace spectrel {
 namespace {
 
 constexpr std::string_view SourceName = "LogGenerator/GSM/GSMLogGenerator";
+// The lines that the log names for these two places. They are fixed, on purpose, so that the log's text stays the same
+// when this file changes; the lines of today are others.
 constexpr int UnknownObjectLine = 78;
 constexpr int UndecodableLine = 90;
 

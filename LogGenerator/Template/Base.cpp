@@ -121,6 +121,31 @@ void Base::removeKey(std::string_view key)
         section->remove(key);
 }
 
+void Base::storeFields(RecordView record, std::span<const Field> fields)
+{
+    if (const auto& section = sectionRef.dictionary())
+        spectrel::storeFields(record, fields, *section);
+}
+
+void Base::storeCellFields(const Dictionary& cell, std::span<const CellField> fields)
+{
+    Dictionary lost; // takes the values of a section that has no dictionary
+    const auto& section = sectionRef.dictionary();
+    storeCell(cell, fields, section ? *section : lost);
+}
+
+void Base::clearList()
+{
+    if (const auto& list = sectionRef.list())
+        clearElementsInArray(*list);
+}
+
+void Base::replaceList(const List& elements)
+{
+    if (const auto& list = sectionRef.list())
+        replaceArray(*list, elements);
+}
+
 void Base::logUnknownMessage(std::uint32_t logCode)
 {
     SPECTREL_LOG(Priority::Error, "Received an unknown log message: %d", static_cast<int>(logCode));

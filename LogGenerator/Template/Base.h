@@ -1,12 +1,15 @@
 #pragma once
 
+#include "LogGenerator/Template/CellFields.h"
 #include "LogGenerator/Template/CodeDictionary.h"
+#include "LogGenerator/Template/Fields.h"
 #include "Records/Frame.h"
 #include "Records/RecordView.h"
 #include "Values/List.h"
 #include "Values/Value.h"
 
 #include <cstdint>
+#include <span>
 #include <string_view>
 #include <vector>
 
@@ -14,7 +17,7 @@ namespace spectrel {
 
 /// A section: decodes the records of a few log codes into its own node of the display dictionary.
 ///
-/// A concrete section's constructor takes the index's two dictionaries and calls `enterInto` with them.
+/// Concrete sections derive from `SectionOf` (`RecordSection.h`), which decodes by a description.
 class Base {
 public:
     virtual ~Base() = default;
@@ -51,14 +54,28 @@ protected:
     Base() = default;
     void enterInto(ClassDictionary& dict, CodeDictionary& codeDict);
 
+    /// The node that the section shows its values in; absent until the display is built.
+    const Value& displayed() const
+    {
+        return sectionRef;
+    }
     /// Keyed stores into the section's dictionary; silently lost while there is none.
     void storeText(std::string_view key, std::string_view text);
     void store(std::string_view key, const Value& value);
     void removeKey(std::string_view key);
+    /// Stores the fields in table order.
+    void storeFields(RecordView record, std::span<const Field> fields);
+    /// Stores a cell's fields in table order; the failures are logged also when there is no dictionary.
+    void storeCellFields(const Dictionary& cell, std::span<const CellField> fields);
+
+    /// `clearElementsInArray` and `replaceArray` of the section's list; silently lost while there is none.
+    void clearList();
+    void replaceList(const List& elements);
 
     /// "Received an unknown log message: %d", priority 3.
     static void logUnknownMessage(std::uint32_t logCode);
 
+private:
     Value sectionRef; // a dictionary or a list of the current display; absent until the display is built
 };
 

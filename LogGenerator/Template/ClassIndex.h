@@ -1,6 +1,6 @@
 #pragma once
 
-#include "LogGenerator/Template/CodeDictionary.h"
+#include "LogGenerator/Template/SectionRegistry.h"
 
 #include <cstdint>
 #include <string>
@@ -12,8 +12,8 @@ namespace spectrel {
 /// The registry of one technology's sections: by section name, and by the log codes they subscribed to.
 ///
 /// A concrete index holds its sections as members, declared in the order of creation, which is the order of delivery:
-/// `SimInfo objSimInfo{classDict, codeDictionary};`
-class ClassIndex {
+/// `SimInfo objSimInfo {*this};`
+class ClassIndex : protected SectionRegistry {
 public:
     ClassIndex() = default;
     ClassIndex(const ClassIndex&) = delete;
@@ -32,10 +32,6 @@ public:
     std::vector<std::string> getAllLogCodes() const;
     /// A self-check that logs two lines and always tells 1 and 0.
     void status() const;
-
-protected:
-    ClassDictionary classDict;
-    CodeDictionary codeDictionary;
 };
 
 } // namespace spectrel

@@ -1,9 +1,5 @@
 #include "LogGenerator/Template/Fields.h"
 
-#include "Values/Dictionary.h"
-
-#include <algorithm>
-
 namespace spectrel {
 
 namespace {
@@ -15,15 +11,6 @@ std::uint32_t bytesOf(RecordView record, Width width, std::size_t offset)
     if (end <= 8)
         return record.u8(offset);
     return end <= 16 ? record.u16(offset) : record.u32(offset);
-}
-
-void storeInto(Dictionary& dictionary, RecordView record, std::span<const Field> fields, std::size_t start)
-{
-    TextBuffer buffer;
-    for (const Field& field : fields) {
-        buffer.clear();
-        dictionary.setText(field.key, field.format(fieldValue(record, field, start), buffer));
-    }
 }
 
 } // namespace
@@ -42,16 +29,19 @@ std::string_view decimal(std::uint32_t value, TextBuffer& buffer)
     return buffer.decimal(static_cast<std::int32_t>(value)).view();
 }
 
-void storeFields(RecordView record, std::span<const Field> fields, const Value& sectionRef, std::size_t start)
+void storeFields(RecordView record, std::span<const Field> fields, Dictionary& into, std::size_t start)
 {
-    if (const auto& section = sectionRef.dictionary())
-        storeInto(*section, record, fields, start);
+    TextBuffer buffer;
+    for (const Field& field : fields) {
+        buffer.clear();
+        into.setText(field.key, field.format(fieldValue(record, field, start), buffer));
+    }
 }
 
 DictionaryRef entryWithFields(RecordView record, std::span<const Field> fields, std::size_t start)
 {
     auto entry = std::make_shared<Dictionary>();
-    storeInto(*entry, record, fields, start);
+    storeFields(record, fields, *entry, start);
     return entry;
 }
 
@@ -68,17 +58,6 @@ std::string_view decimalDB(std::uint32_t value, TextBuffer& buffer)
 std::string_view decimalDBm(std::uint32_t value, TextBuffer& buffer)
 {
     return buffer.decimal(static_cast<std::int32_t>(value)).text(" dBm").view();
-}
-
-bool storeRecord(
-    RecordView record, std::uint32_t logCode, std::span<const RecordLayout> layouts, const Value& sectionRef)
-{
-    const auto layout = std::ranges::find(layouts, logCode, &RecordLayout::code);
-    if (layout == layouts.end())
-        return false;
-    if (record.size() >= layout->minimumLength)
-        storeFields(record, layout->fields, sectionRef);
-    return true;
 }
 
 } // namespace spectrel

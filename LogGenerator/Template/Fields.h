@@ -3,10 +3,12 @@
 #include "Records/RecordView.h"
 #include "Values/Dictionary.h"
 #include "Values/TextBuffer.h"
-#include "Values/Value.h"
 
+#include <algorithm>
+#include <array>
 #include <cstddef>
 #include <cstdint>
+#include <functional>
 #include <span>
 #include <string_view>
 
@@ -46,14 +48,23 @@ struct Field {
     Formatter format;
 };
 
+/// Tables one behind the other, as one.
+template <std::size_t... Counts> constexpr auto joined(const std::array<Field, Counts>&... tables)
+{
+    std::array<Field, (Counts + ...)> all {};
+    auto end = all.begin();
+    ((end = std::ranges::copy(tables, end).out), ...);
+    return all;
+}
+
 /// "%d": a 32-bit field shows its bits as a signed number.
 std::string_view decimal(std::uint32_t value, TextBuffer& buffer);
 
 /// A field's raw value; `start` is where the offsets count from.
 std::uint32_t fieldValue(RecordView record, const Field& field, std::size_t start = 0);
 
-/// Writes the fields in table order into a section's dictionary; a node that is none loses them.
-void storeFields(RecordView record, std::span<const Field> fields, const Value& sectionRef, std::size_t start = 0);
+/// Writes the fields in table order into a dictionary.
+void storeFields(RecordView record, std::span<const Field> fields, Dictionary& into, std::size_t start = 0);
 
 /// A new dictionary with the fields in table order: one entry of a section's list, which stands at `start`.
 DictionaryRef entryWithFields(RecordView record, std::span<const Field> fields, std::size_t start);
@@ -65,10 +76,35 @@ std::string_view decimalDB(std::uint32_t value, TextBuffer& buffer);
 /// "%d dBm".
 std::string_view decimalDBm(std::uint32_t value, TextBuffer& buffer);
 
-/// Shows a code's name in a table that is indexed by the code, and "Unknown" for a code past the table's end.
+/// Texts of codes that are not all the numbers from 0 on: ascending, and what any other code shows.
+struct CodeText {
+    std::uint32_t code;
+    std::string_view text;
+};
+template <std::size_t Count> struct CodeTexts {
+    CodeText texts[Count];
+    std::string_view anyOther = "Unknown";
+};
+
+template <std::size_t Count> constexpr bool isAscending(const CodeTexts<Count>& table)
+{
+    return std::ranges::is_sorted(table.texts, std::ranges::less_equal(), &CodeText::code);
+}
+template <std::size_t Count> constexpr std::string_view textOf(const CodeTexts<Count>& table, std::uint32_t code)
+{
+    const auto text = std::ranges::lower_bound(table.texts, code, {}, &CodeText::code);
+    return text != std::ranges::end(table.texts) && text->code == code ? text->text : table.anyOther;
+}
+
+/// Shows a code's name in a table of texts that is indexed by the code, "Unknown" past its end; or in a `CodeTexts`.
 template <const auto& Names> std::string_view named(std::uint32_t code, TextBuffer&)
 {
-    return code < Names.size() ? Names[code] : std::string_view("Unknown");
+    if constexpr (requires { Names.anyOther; }) {
+        static_assert(isAscending(Names));
+        return textOf(Names, code);
+    } else {
+        return code < Names.size() ? Names[code] : std::string_view("Unknown");
+    }
 }
 
 /// Shows the first text of two for zero, the second for anything else.
@@ -77,17 +113,5 @@ template <const auto& Texts> std::string_view flagged(std::uint32_t value, TextB
     static_assert(Texts.size() == 2);
     return Texts[value == 0 ? 0 : 1];
 }
-
-/// A record that is fields throughout: its log code, its least length in bytes (header included), its fields.
-struct RecordLayout {
-    std::uint32_t code;
-    std::size_t minimumLength;
-    std::span<const Field> fields;
-};
-
-/// Writes the fields of the layout with the record's log code; a record that is too short changes nothing. False when
-/// no layout has the code.
-bool storeRecord(
-    RecordView record, std::uint32_t logCode, std::span<const RecordLayout> layouts, const Value& sectionRef);
 
 } // namespace spectrel

@@ -7,29 +7,12 @@
 #include "Values/PropertyList/PropertyList.h"
 
 #include <algorithm>
-#include <optional>
-#include <span>
 
 namespace spectrel {
 
 namespace {
 
 const Value NoValue;
-
-/// The payload's property list; none when it does not parse. The latest is kept: several sections read the same
-/// record one after the other, and many a record tells what the one before it told. Whoever holds its nodes only reads
-/// them.
-const std::optional<Value>& parsedPayload(RecordView record)
-{
-    static Bytes latest;
-    static std::optional<Value> parsed;
-    const ByteView payload = recordPayload(record);
-    if (!std::ranges::equal(payload, latest)) {
-        parsed = parsePropertyList(payload);
-        latest.assign(payload.begin(), payload.end());
-    }
-    return parsed;
-}
 
 bool isText(const Value& value, std::string_view text)
 {
@@ -44,28 +27,40 @@ std::span<const Value> elementsOf(const Value& value)
     return list ? std::span<const Value>(list->elements()) : std::span<const Value>();
 }
 
-bool isCell(const Value& value, std::string_view technology, std::string_view type)
+bool isOfAny(const Dictionary& cell, std::span<const std::string_view> technologies)
 {
-    const auto& cell = value.dictionary();
-    return cell && isText((*cell)[kRKCellMonitorCellRadioAccessTechnology], technology)
-        && isText((*cell)[kRKCellMonitorCellType], type);
+    const Value& technology = cell[kRKCellMonitorCellRadioAccessTechnology];
+    return std::ranges::any_of(
+        technologies, [&technology](std::string_view wanted) { return !wanted.empty() && isText(technology, wanted); });
 }
 
-std::vector<DictionaryRef> cellsOf(const Value& value, std::string_view technology, std::string_view type)
+std::vector<DictionaryRef> cellsOf(
+    const Value& value, std::span<const std::string_view> technologies, std::string_view type)
 {
     std::vector<DictionaryRef> cells;
     for (const Value& element : elementsOf(value)) {
-        if (isCell(element, technology, type))
-            cells.push_back(element.dictionary());
+        const auto& cell = element.dictionary();
+        if (cell && isOfAny(*cell, technologies) && isText((*cell)[kRKCellMonitorCellType], type))
+            cells.push_back(cell);
     }
     return cells;
 }
 
 } // namespace
 
-LogCode_0xFF0000::LogCode_0xFF0000(RecordView record)
+const std::optional<Value>& PropertyListPayloads::of(RecordView record)
 {
-    const auto& files = parsedPayload(record);
+    const ByteView payload = record.payload();
+    if (!std::ranges::equal(payload, _latest)) {
+        _parsed = parsePropertyList(payload);
+        _latest.assign(payload.begin(), payload.end());
+    }
+    return _parsed;
+}
+
+LogCode_0xFF0000::LogCode_0xFF0000(RecordView record, PropertyListPayloads& payloads)
+{
+    const auto& files = payloads.of(record);
     if (!files) {
         SPECTREL_LOG(Priority::Error, "SIM File dictionary data could not be constructed");
         throw UnknownDataException();
@@ -79,40 +74,28 @@ const Value& LogCode_0xFF0000::operator[](std::string_view key) const
     return dictionary ? (*dictionary)[key] : NoValue;
 }
 
-ContextArrayReader::ContextArrayReader(RecordView record)
+ContextArrayReader::ContextArrayReader(RecordView record, PropertyListPayloads& payloads)
 {
-    if (const auto& contexts = parsedPayload(record))
+    if (const auto& contexts = payloads.of(record))
         _contexts = contexts->list();
 }
 
-CellInfoArrayReader::CellInfoArrayReader(RecordView record)
+CellInfoArrayReader::CellInfoArrayReader(RecordView record, PropertyListPayloads& payloads)
 {
-    if (const auto& cells = parsedPayload(record))
+    if (const auto& cells = payloads.of(record))
         _cells = *cells;
     else
         SPECTREL_LOG(Priority::Error, "Cell Info Array data could not be constructed");
 }
 
-DictionaryRef CellInfoArrayReader::firstServingCell(
-    std::initializer_list<std::string_view> radioAccessTechnologies) const
+std::vector<DictionaryRef> CellInfoArrayReader::servingCells(std::span<const std::string_view> technologies) const
 {
-    for (const Value& element : elementsOf(_cells)) {
-        for (const std::string_view technology : radioAccessTechnologies) {
-            if (isCell(element, technology, kRKCellMonitorCellTypeServing))
-                return element.dictionary();
-        }
-    }
-    return nullptr;
+    return cellsOf(_cells, technologies, kRKCellMonitorCellTypeServing);
 }
 
-std::vector<DictionaryRef> CellInfoArrayReader::servingCells(std::string_view radioAccessTechnology) const
+std::vector<DictionaryRef> CellInfoArrayReader::neighborCells(std::span<const std::string_view> technologies) const
 {
-    return cellsOf(_cells, radioAccessTechnology, kRKCellMonitorCellTypeServing);
-}
-
-std::vector<DictionaryRef> CellInfoArrayReader::neighborCells(std::string_view radioAccessTechnology) const
-{
-    return cellsOf(_cells, radioAccessTechnology, kRKCellMonitorCellTypeNeighbor);
+    return cellsOf(_cells, technologies, kRKCellMonitorCellTypeNeighbor);
 }
 
 } // namespace spectrel

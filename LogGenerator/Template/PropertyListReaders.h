@@ -1,18 +1,32 @@
 #pragma once
 
 #include "Records/RecordView.h"
+#include "Values/Bytes.h"
 #include "Values/List.h"
 #include "Values/Value.h"
 
 #include <cstdint>
 #include <exception>
-#include <initializer_list>
+#include <optional>
+#include <span>
 #include <string_view>
 #include <vector>
 
 /// Readers of the records whose payload is a property list that the telephony service supplies. Each owns the parsed
 /// object for the duration of one update.
 namespace spectrel {
+
+/// The payloads, parsed. The latest is kept, as several sections read the same record one after the other, and many a
+/// record says what the one before it said. Whoever holds its nodes only reads them.
+class PropertyListPayloads {
+public:
+    /// The payload's property list; none when it does not parse. Lives until the next call.
+    const std::optional<Value>& of(RecordView record);
+
+private:
+    Bytes _latest;
+    std::optional<Value> _parsed;
+};
 
 /// SIM files, code 0xFF0000: a dictionary.
 class LogCode_0xFF0000 {
@@ -22,7 +36,7 @@ public:
     /// Raised when the payload does not parse. Nothing catches it: the process ends.
     class UnknownDataException : public std::exception { };
 
-    explicit LogCode_0xFF0000(RecordView record);
+    LogCode_0xFF0000(RecordView record, PropertyListPayloads& payloads);
     /// The value under a key; absent when there is none.
     const Value& operator[](std::string_view key) const;
 
@@ -35,7 +49,7 @@ class ContextArrayReader {
 public:
     static constexpr std::uint32_t Code = 0xFF0002;
 
-    explicit ContextArrayReader(RecordView record);
+    ContextArrayReader(RecordView record, PropertyListPayloads& payloads);
     /// Null when nothing is held.
     const List* contexts() const
     {
@@ -52,18 +66,16 @@ public:
     static constexpr std::uint32_t Code = 0xFF0001;
 
     /// Logs "Cell Info Array data could not be constructed" when the payload does not parse.
-    explicit CellInfoArrayReader(RecordView record);
+    CellInfoArrayReader(RecordView record, PropertyListPayloads& payloads);
     /// False when the payload did not parse.
     bool holdsAnything() const
     {
         return !_cells.isAbsent();
     }
-    /// The first serving cell of any of the technologies, which has both a technology and a cell type. Null when there
-    /// is none; an object that is no list has no cells.
-    DictionaryRef firstServingCell(std::initializer_list<std::string_view> radioAccessTechnologies) const;
-    /// All serving cells of the technology, and all neighbour cells, in the list's order.
-    std::vector<DictionaryRef> servingCells(std::string_view radioAccessTechnology) const;
-    std::vector<DictionaryRef> neighborCells(std::string_view radioAccessTechnology) const;
+    /// The serving cells of any of the technologies (an empty one is none), and the neighbour cells, in the list's
+    /// order. An object that is no list has no cells.
+    std::vector<DictionaryRef> servingCells(std::span<const std::string_view> technologies) const;
+    std::vector<DictionaryRef> neighborCells(std::span<const std::string_view> technologies) const;
 
 private:
     Value _cells;

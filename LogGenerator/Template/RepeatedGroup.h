@@ -25,6 +25,15 @@ struct RepeatedGroup {
     }
 };
 
+/// A new list with what `make` makes of each entry's start.
+template <typename Make> ListRef eachEntry(const RepeatedGroup& group, Make make)
+{
+    auto entries = List::make();
+    for (std::size_t index = 0; index < group.count; ++index)
+        entries->append(make(group.entry(index)));
+    return entries;
+}
+
 /// A new list with one dictionary for each entry of the group, each with the fields in table order.
 ListRef entriesWithFields(RecordView record, const RepeatedGroup& group, std::span<const Field> fields);
 

@@ -12,6 +12,8 @@ namespace spectrel {
 
 namespace {
 
+// Not this program's name and not the day of its build: DLF files have always had these, and files of two builds are
+// the same byte for byte.
 constexpr const char* ExecutableName = "EXECUTABLE_NAME";
 constexpr const char* BuildDate = "Dec  9 2019 21:26:56";
 

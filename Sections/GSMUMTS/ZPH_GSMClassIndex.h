@@ -1,30 +1,21 @@
 #pragma once
 
 #include "LogGenerator/Template/ClassIndex.h"
-#include "Sections/GSMUMTS/GSM/CodingScheme.h"
 #include "Sections/GSMUMTS/GSM/GPRSInformation.h"
 #include "Sections/GSMUMTS/GSM/GSMRRInfo.h"
 #include "Sections/GSMUMTS/GSM/GSMServingCell.h"
 #include "Sections/GSMUMTS/GSM/GSMSet.h"
 #include "Sections/GSMUMTS/GSM/MobileAllocation.h"
 #include "Sections/GSMUMTS/GSM/NeighboringCells.h"
-#include "Sections/GSMUMTS/GSM/NonRankedGSMSet.h"
-#include "Sections/GSMUMTS/Mobility/CellChangeCounters.h"
 #include "Sections/GSMUMTS/Mobility/EquivalentPLMNList.h"
-#include "Sections/GSMUMTS/Mobility/ProcessCO.h"
-#include "Sections/GSMUMTS/Mobility/ProcessCS.h"
-#include "Sections/GSMUMTS/Mobility/ProcessPS.h"
+#include "Sections/GSMUMTS/Mobility/MobilityManagement.h"
 #include "Sections/GSMUMTS/Mobility/ServingPLMN.h"
-#include "Sections/GSMUMTS/UMTS/ActiveSet.h"
+#include "Sections/GSMUMTS/NameOnlySections.h"
 #include "Sections/GSMUMTS/UMTS/BLER.h"
-#include "Sections/GSMUMTS/UMTS/DetectedSet.h"
 #include "Sections/GSMUMTS/UMTS/HSDPAInformation.h"
-#include "Sections/GSMUMTS/UMTS/MonitoredSet.h"
-#include "Sections/GSMUMTS/UMTS/NonRankedUMTSSet.h"
+#include "Sections/GSMUMTS/UMTS/UMTSCellSets.h"
 #include "Sections/GSMUMTS/UMTS/UMTSRRInfo.h"
-#include "Sections/GSMUMTS/UMTS/UMTSRRMeasurement.h"
 #include "Sections/GSMUMTS/UMTS/UMTSSet.h"
-#include "Sections/GSMUMTS/UMTS/VirtualActiveSet.h"
 #include "Sections/Shared/PDPContextList.h"
 #include "Sections/Shared/SimInfo.h"
 
@@ -36,32 +27,32 @@ public:
     ~ZPH_GSMClassIndex() override;
 
 private:
-    ActiveSet objActiveSet {classDict, codeDictionary};
-    CodingScheme objCodingScheme {classDict, codeDictionary};
-    GPRSInformation objGPRSInformation {classDict, codeDictionary};
-    GSMServingCell objGSMServingCell {classDict, codeDictionary};
-    MobileAllocation objMobileAllocation {classDict, codeDictionary};
-    NeighboringCells objNeighboringCells {classDict, codeDictionary};
-    PDPContextList objPDPContextList {classDict, codeDictionary};
-    ProcessPS objProcessPS {classDict, codeDictionary};
-    UMTSRRMeasurement objUMTSRRMeasurement {classDict, codeDictionary};
-    CellChangeCounters objCellChangeCounter {classDict, codeDictionary};
-    DetectedSet objDetectedSet {classDict, codeDictionary};
-    GSMSet objGSMSet {classDict, codeDictionary};
-    NonRankedGSMSet objNonRankedGSMSet {classDict, codeDictionary};
-    ProcessCO objProcessCO {classDict, codeDictionary};
-    ServingPLMN objServingPLMN {classDict, codeDictionary};
-    UMTSSet objUMTSSet {classDict, codeDictionary};
-    EquivalentPLMNList objEquivalentPLMNList {classDict, codeDictionary};
-    GSMRRInfo objGSMRRInfo {classDict, codeDictionary};
-    MonitoredSet objMonitoredSet {classDict, codeDictionary};
-    NonRankedUMTSSet objNonRankedUMTSSet {classDict, codeDictionary};
-    ProcessCS objProcessCS {classDict, codeDictionary};
-    UMTSRRInfo objUMTSRRInfo {classDict, codeDictionary};
-    BLER objBLER {classDict, codeDictionary};
-    VirtualActiveSet objVirtualActiveSet {classDict, codeDictionary};
-    SimInfo objSimInfo {classDict, codeDictionary};
-    HSDPAInformation objHSDPAInformation {classDict, codeDictionary};
+    ActiveSet objActiveSet {*this};
+    CodingScheme objCodingScheme {*this};
+    GPRSInformation objGPRSInformation {*this};
+    GSMServingCell objGSMServingCell {*this};
+    MobileAllocation objMobileAllocation {*this};
+    NeighboringCells objNeighboringCells {*this};
+    PDPContextList objPDPContextList {*this};
+    ProcessPS objProcessPS {*this};
+    UMTSRRMeasurement objUMTSRRMeasurement {*this};
+    CellChangeCounters objCellChangeCounter {*this};
+    DetectedSet objDetectedSet {*this};
+    GSMSet objGSMSet {*this};
+    NonRankedGSMSet objNonRankedGSMSet {*this};
+    ProcessCO objProcessCO {*this};
+    ServingPLMN objServingPLMN {*this};
+    UMTSSet objUMTSSet {*this};
+    EquivalentPLMNList objEquivalentPLMNList {*this};
+    GSMRRInfo objGSMRRInfo {*this};
+    MonitoredSet objMonitoredSet {*this};
+    NonRankedUMTSSet objNonRankedUMTSSet {*this};
+    ProcessCS objProcessCS {*this};
+    UMTSRRInfo objUMTSRRInfo {*this};
+    BLER objBLER {*this};
+    VirtualActiveSet objVirtualActiveSet {*this};
+    SimInfo objSimInfo {*this};
+    HSDPAInformation objHSDPAInformation {*this};
 };
 
 } // namespace spectrel

@@ -1,14 +1,10 @@
 #pragma once
 
 #include "LogGenerator/Template/ClassIndex.h"
-#include "Sections/LTE/ConnectedModeMeasurementMisc.h"
-#include "Sections/LTE/DetectedCells.h"
+#include "Sections/LTE/ConnectedModeMeasurement.h"
+#include "Sections/LTE/IdleNeighbour.h"
 #include "Sections/LTE/LTEServingCellInfo.h"
-#include "Sections/LTE/MeasuredNeighborCells.h"
-#include "Sections/LTE/NeighborCellsList.h"
-#include "Sections/LTE/NeighborMeasurementMisc.h"
-#include "Sections/LTE/ReselectionCandidatesList.h"
-#include "Sections/LTE/ReselectionCandidatesMisc.h"
+#include "Sections/LTE/ReselectionCandidates.h"
 #include "Sections/LTE/ServingCellMeasurement.h"
 #include "Sections/Shared/PDPContextList.h"
 #include "Sections/Shared/SimInfo.h"
@@ -21,17 +17,17 @@ public:
     ~LTEClassIndex() override;
 
 private:
-    LTEServingCellInfo objLTEServingCellInfo {classDict, codeDictionary};
-    ConnectedModeMeasurementMisc objConnectedModeMeasurementMisc {classDict, codeDictionary};
-    MeasuredNeighborCells objMeasuredNeighborCells {classDict, codeDictionary};
-    DetectedCells objDetectedCells {classDict, codeDictionary};
-    ServingCellMeasurement objServingCellMeasurement {classDict, codeDictionary};
-    NeighborMeasurementMisc objNeighborMeasurementMisc {classDict, codeDictionary};
-    NeighborCellsList objNeighborCellsList {classDict, codeDictionary};
-    ReselectionCandidatesMisc objReselectionCandidatesMisc {classDict, codeDictionary};
-    ReselectionCandidatesList objReselectionCandidatesList {classDict, codeDictionary};
-    SimInfo objSimInfo {classDict, codeDictionary};
-    PDPContextList objPDPContextList {classDict, codeDictionary};
+    LTEServingCellInfo objLTEServingCellInfo {*this};
+    ConnectedModeMeasurementMisc objConnectedModeMeasurementMisc {*this};
+    MeasuredNeighborCells objMeasuredNeighborCells {*this};
+    DetectedCells objDetectedCells {*this};
+    ServingCellMeasurement objServingCellMeasurement {*this};
+    NeighborMeasurementMisc objNeighborMeasurementMisc {*this};
+    NeighborCellsList objNeighborCellsList {*this};
+    ReselectionCandidatesMisc objReselectionCandidatesMisc {*this};
+    ReselectionCandidatesList objReselectionCandidatesList {*this};
+    SimInfo objSimInfo {*this};
+    PDPContextList objPDPContextList {*this};
 };
 
 } // namespace spectrel

@@ -1,19 +1,31 @@
 #pragma once
 
-#include "LogGenerator/Template/Base.h"
+#include "LogGenerator/Template/RecordSection.h"
+
+#include <array>
 
 namespace spectrel {
 
-/// "PDP Context Info": the packet data contexts, code 0xFF0002, exactly as the telephony service sent them. Shared by
-/// every technology.
-class PDPContextList final : public Base {
-public:
-    PDPContextList(ClassDictionary& dict, CodeDictionary& codeDict);
-
-    std::string_view getSectionName() const override;
-    std::vector<std::uint32_t> getLogCodeArray() const override;
+/// The packet data contexts, exactly as the telephony service sent them. Shared by every technology.
+class PDPContextList final : public SectionOf<PDPContextList> {
     /// Replaces the list; a payload that is no list changes nothing.
-    void updateWithData(RecordView record, std::uint32_t logCode) override;
+    void listContexts(RecordView record)
+    {
+        const ContextArrayReader reader(record, payloads());
+        if (reader.contexts())
+            replaceList(*reader.contexts());
+    }
+
+    static constexpr std::array<RecordLayout, 1> Layouts {{
+        {.code = ContextArrayReader::Code, .hook = hook<&PDPContextList::listContexts>},
+    }};
+
+public:
+    using SectionOf::SectionOf;
+    static constexpr SectionDescription Description {.name = "PDP Context Info",
+        .trace = "PDPContextList",
+        .layouts = Layouts,
+        .unknownCode = UnknownCode::DecodedAsFirst};
 };
 
 } // namespace spectrel

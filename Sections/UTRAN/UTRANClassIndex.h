@@ -3,11 +3,9 @@
 #include "LogGenerator/Template/ClassIndex.h"
 #include "Sections/Shared/PDPContextList.h"
 #include "Sections/Shared/SimInfo.h"
-#include "Sections/UTRAN/CCTRCHSIRMeasurement.h"
-#include "Sections/UTRAN/GSMNeighbhorMeasurements.h"
+#include "Sections/UTRAN/NeighbhorMeasurements.h"
 #include "Sections/UTRAN/RRC_State.h"
-#include "Sections/UTRAN/TRCHBLERMeasurement.h"
-#include "Sections/UTRAN/UTRANNeighbhorMeasurements.h"
+#include "Sections/UTRAN/TransportChannel.h"
 #include "Sections/UTRAN/UTRANServingCellInfo.h"
 
 namespace spectrel {
@@ -16,14 +14,14 @@ namespace spectrel {
 /// line of its own when it goes.
 class UTRANClassIndex final : public ClassIndex {
 private:
-    RRC_State rrc_state {classDict, codeDictionary};
-    UTRANServingCellInfo servingCellInfo {classDict, codeDictionary};
-    UTRANNeighbhorMeasurements tdMeasurements {classDict, codeDictionary};
-    GSMNeighbhorMeasurements gsmMeasurements {classDict, codeDictionary};
-    TRCHBLERMeasurement trchMeasurements {classDict, codeDictionary};
-    CCTRCHSIRMeasurement cctrchMeasurements {classDict, codeDictionary};
-    PDPContextList pdpList {classDict, codeDictionary};
-    SimInfo simInfo {classDict, codeDictionary};
+    RRC_State rrc_state {*this};
+    UTRANServingCellInfo servingCellInfo {*this};
+    UTRANNeighbhorMeasurements tdMeasurements {*this};
+    GSMNeighbhorMeasurements gsmMeasurements {*this};
+    TRCHBLERMeasurement trchMeasurements {*this};
+    CCTRCHSIRMeasurement cctrchMeasurements {*this};
+    PDPContextList pdpList {*this};
+    SimInfo simInfo {*this};
 };
 
 } // namespace spectrel

@@ -64,15 +64,6 @@ TEST(FieldsTest, EntryHoldsTheFieldsInTableOrder)
     EXPECT_EQ(displayText(Value(entryWithFields(ByteView(Raw), Entry, 2))), "{\"B\": \"192\", \"A\": \"127\"}");
 }
 
-TEST(FieldsTest, NodeThatIsNoDictionaryLosesThem)
-{
-    constexpr std::array<Field, 1> Fields {{{0, Width::U8, "A", decimal}}};
-    storeFields(ByteView(Raw), Fields, Value());
-    const Value section(Dictionary::make());
-    storeFields(ByteView(Raw), Fields, section);
-    EXPECT_EQ(displayText(section), "{\"A\": \"129\"}");
-}
-
 std::string formatted(Formatter format, std::uint32_t value)
 {
     TextBuffer buffer;
@@ -104,17 +95,15 @@ TEST(FieldsTest, FlagIsOneOfTwoTexts)
     EXPECT_EQ(formatted(flagged<Names>, 255), "Some");
 }
 
-TEST(FieldsTest, RecordIsStoredByTheLayoutOfItsCode)
+constexpr CodeTexts<3> Sparse {{{1, "One"}, {4, "Four"}, {255, "Last"}}, "Other"};
+
+TEST(FieldsTest, CodeIsFoundInATableWithGaps)
 {
-    constexpr std::array<Field, 1> First {{{0, Width::U8, "A", decimal}}};
-    constexpr std::array<Field, 1> Second {{{1, Width::U8, "B", decimal}}};
-    const std::array<RecordLayout, 3> layouts {{{0x10, 8, First}, {0x11, 8, Second}, {0x12, 9, First}}};
-    const Value section(Dictionary::make());
-    EXPECT_FALSE(storeRecord(ByteView(Raw), 0x13, layouts, section));
-    EXPECT_TRUE(storeRecord(ByteView(Raw), 0x12, layouts, section)) << "known, but a byte too short";
-    EXPECT_EQ(displayText(section), "{}");
-    EXPECT_TRUE(storeRecord(ByteView(Raw), 0x11, layouts, section));
-    EXPECT_EQ(displayText(section), "{\"B\": \"254\"}");
+    EXPECT_EQ(formatted(named<Sparse>, 1), "One");
+    EXPECT_EQ(formatted(named<Sparse>, 4), "Four");
+    EXPECT_EQ(formatted(named<Sparse>, 255), "Last");
+    for (const std::uint32_t code : {0u, 2u, 3u, 5u, 254u, 256u, 0xFFFFFFFFu})
+        EXPECT_EQ(formatted(named<Sparse>, code), "Other") << code;
 }
 
 } // namespace

@@ -16,13 +16,14 @@ RecordBuilder contexts(std::string_view name)
         ContextArrayReader::Code, Value(List::make({Value(Dictionary::make({{"APN", name}}))})));
 }
 
-std::string shown(const RecordBuilder& record)
-{
-    return displayText((*ContextArrayReader(RecordView(record)).contexts())[0]);
-}
-
 class PropertyListReadersTest : public testing::Test {
 protected:
+    std::string shown(const RecordBuilder& record)
+    {
+        return displayText((*ContextArrayReader(RecordView(record), payloads).contexts())[0]);
+    }
+
+    PropertyListPayloads payloads;
     LogRecorder log;
 };
 
@@ -30,8 +31,8 @@ TEST_F(PropertyListReadersTest, RecordsThatTellTheSameAreParsedOnce)
 {
     const RecordBuilder first = contexts("a");
     const RecordBuilder same = contexts("a");
-    const DictionaryRef node = (*ContextArrayReader(RecordView(first)).contexts())[0].dictionary();
-    EXPECT_EQ((*ContextArrayReader(RecordView(same)).contexts())[0].dictionary(), node);
+    const DictionaryRef node = (*ContextArrayReader(RecordView(first), payloads).contexts())[0].dictionary();
+    EXPECT_EQ((*ContextArrayReader(RecordView(same), payloads).contexts())[0].dictionary(), node);
 }
 
 TEST_F(PropertyListReadersTest, AnotherRecordIsParsedAnew)
@@ -46,11 +47,11 @@ TEST_F(PropertyListReadersTest, EveryReaderTellsOfAPayloadThatDoesNotParse)
     const Bytes garbage {'<', 'x', '>'};
     const RecordBuilder record = RecordBuilder::withPayload(CellInfoArrayReader::Code, garbage);
     for (int reader = 0; reader < 2; ++reader) {
-        EXPECT_FALSE(CellInfoArrayReader(RecordView(record)).holdsAnything());
+        EXPECT_FALSE(CellInfoArrayReader(RecordView(record), payloads).holdsAnything());
         EXPECT_EQ(log.takeLog(), "<3>Cell Info Array data could not be constructed\n");
     }
-    EXPECT_THROW(LogCode_0xFF0000 {RecordView(record)}, LogCode_0xFF0000::UnknownDataException);
-    EXPECT_FALSE(ContextArrayReader(RecordView(record)).contexts());
+    EXPECT_THROW((LogCode_0xFF0000 {RecordView(record), payloads}), LogCode_0xFF0000::UnknownDataException);
+    EXPECT_FALSE(ContextArrayReader(RecordView(record), payloads).contexts());
     EXPECT_EQ(shown(contexts("a")), "{\"APN\": \"a\"}");
 }
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "LogGenerator/Template/Base.h"
+#include "LogGenerator/Template/SectionRegistry.h"
 #include "Tests/Fakes/DisplayText.h"
 #include "Tests/Fakes/LogRecorder.h"
 #include "Tests/Fakes/RecordBuilder.h"
@@ -85,9 +85,8 @@ protected:
         return _recorder.takeLog();
     }
 
-    ClassDictionary classDict;
-    CodeDictionary codeDictionary;
-    Section section {classDict, codeDictionary};
+    SectionRegistry registry;
+    Section section {registry};
 
 private:
     LogRecorder _recorder;

@@ -1,17 +1,32 @@
 #pragma once
 
-#include "LogGenerator/Template/Base.h"
+#include "LogGenerator/Template/RecordSection.h"
+
+#include <array>
 
 namespace spectrel {
 
-/// "GSM Set": the GSM cells that were ranked for reselection (0x4005).
-class GSMSet final : public Base {
-public:
-    GSMSet(ClassDictionary& dict, CodeDictionary& codeDict);
+/// The GSM cells that were ranked for reselection.
+class GSMSet final : public SectionOf<GSMSet> {
+    /// A ranked GSM cell, in writing order.
+    static constexpr std::array<Field, 4> CellFields {{
+        {0, Width::U16, "ARFCN", decimal},
+        {2, Width::U16, "BSIC", decimal},
+        {4, Width::S8, "RSSI", decimalDBm},
+        {5, Width::S16, "Ranking Value", decimal},
+    }};
+    /// The entries are read from the start of the UMTS ones, which are not skipped: kept on purpose.
+    static constexpr RepeatedGroup rankedCells(RecordView record)
+    {
+        return {15, 7, record.u8(14)};
+    }
+    static constexpr std::array<RecordLayout, 1> Layouts {{
+        {.code = 0x4005, .minimumLength = 15, .entries = {rankedCells, CellFields}},
+    }};
 
-    std::string_view getSectionName() const override;
-    std::vector<std::uint32_t> getLogCodeArray() const override;
-    void updateWithData(RecordView record, std::uint32_t logCode) override;
+public:
+    using SectionOf::SectionOf;
+    static constexpr SectionDescription Description {.name = "GSM Set", .trace = "GSMSet", .layouts = Layouts};
 };
 
 } // namespace spectrel

@@ -1,10 +1,6 @@
 // The sections that only keep their place on the screen.
 
-#include "Sections/GSMUMTS/GSM/CodingScheme.h"
-#include "Sections/GSMUMTS/GSM/NonRankedGSMSet.h"
-#include "Sections/GSMUMTS/Mobility/CellChangeCounters.h"
-#include "Sections/GSMUMTS/UMTS/NonRankedUMTSSet.h"
-#include "Sections/GSMUMTS/UMTS/UMTSRRMeasurement.h"
+#include "Sections/GSMUMTS/NameOnlySections.h"
 #include "Tests/Sections/SectionFixture.h"
 
 namespace spectrel {
@@ -13,13 +9,12 @@ namespace {
 template <typename Section> void expectOnly(const char* name, const char* trace)
 {
     LogRecorder recorder;
-    ClassDictionary classDict;
-    CodeDictionary codeDictionary;
-    Section section(classDict, codeDictionary);
+    SectionRegistry registry;
+    Section section(registry);
     EXPECT_EQ(section.getSectionName(), name);
-    EXPECT_EQ(classDict.find(name)->second, &section);
+    EXPECT_EQ(registry.classDict.find(name)->second, &section);
     EXPECT_TRUE(section.getLogCodeArray().empty());
-    EXPECT_TRUE(codeDictionary.allKeys().empty());
+    EXPECT_TRUE(registry.codeDictionary.allKeys().empty());
     const Value node(Dictionary::make({{"key", "old"}}));
     section.updateSectionRef(node);
     recorder.takeLog();

@@ -1,10 +1,7 @@
 // The three sections of the connected-mode measurement, code 0xB179.
 
+#include "Sections/LTE/ConnectedModeMeasurement.h"
 #include "LogGenerator/Template/ArrayOutOfBoundsException.h"
-#include "Sections/LTE/ConnectedModeMeasurementMisc.h"
-#include "Sections/LTE/ConnectedModeRecord.h"
-#include "Sections/LTE/DetectedCells.h"
-#include "Sections/LTE/MeasuredNeighborCells.h"
 #include "Tests/Sections/BitSweep.h"
 #include "Tests/Sections/SectionFixture.h"
 #include "Values/List.h"

@@ -1,9 +1,7 @@
 // The two sections of the idle-mode neighbour measurement, code 0xB180.
 
+#include "Sections/LTE/IdleNeighbour.h"
 #include "LogGenerator/Template/ArrayOutOfBoundsException.h"
-#include "Sections/LTE/IdleNeighbourRecord.h"
-#include "Sections/LTE/NeighborCellsList.h"
-#include "Sections/LTE/NeighborMeasurementMisc.h"
 #include "Tests/Sections/BitSweep.h"
 #include "Tests/Sections/SectionFixture.h"
 #include "Values/List.h"

@@ -1,9 +1,7 @@
 // The two sections of the reselection candidates, code 0xB186.
 
+#include "Sections/LTE/ReselectionCandidates.h"
 #include "LogGenerator/Template/ArrayOutOfBoundsException.h"
-#include "Sections/LTE/ReselectionCandidatesList.h"
-#include "Sections/LTE/ReselectionCandidatesMisc.h"
-#include "Sections/LTE/ReselectionRecord.h"
 #include "Tests/Sections/BitSweep.h"
 #include "Tests/Sections/SectionFixture.h"
 #include "Values/List.h"

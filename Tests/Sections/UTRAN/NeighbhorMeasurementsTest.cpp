@@ -1,7 +1,6 @@
 // The two lists of neighbours: UTRAN cells (0xD00A) and GSM cells (0xD00E).
 
-#include "Sections/UTRAN/GSMNeighbhorMeasurements.h"
-#include "Sections/UTRAN/UTRANNeighbhorMeasurements.h"
+#include "Sections/UTRAN/NeighbhorMeasurements.h"
 #include "Tests/Sections/BitSweep.h"
 #include "Tests/Sections/SectionFixture.h"
 

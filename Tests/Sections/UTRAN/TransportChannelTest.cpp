@@ -1,8 +1,6 @@
 // The two sections of the transport-channel quality, code 0xD00C.
 
-#include "Sections/UTRAN/CCTRCHSIRMeasurement.h"
-#include "Sections/UTRAN/TRCHBLERMeasurement.h"
-#include "Sections/UTRAN/TransportChannelRecord.h"
+#include "Sections/UTRAN/TransportChannel.h"
 #include "Tests/Sections/BitSweep.h"
 #include "Tests/Sections/SectionFixture.h"
 

@@ -1,4 +1,4 @@
-#include "Sections/GSMUMTS/Mobility/ProcessCS.h"
+#include "Sections/GSMUMTS/Mobility/MobilityManagement.h"
 
 #include "Tests/Sections/SectionFixture.h"
 

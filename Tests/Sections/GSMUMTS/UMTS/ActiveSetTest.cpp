@@ -1,6 +1,5 @@
-#include "Sections/GSMUMTS/UMTS/ActiveSet.h"
-
 #include "Sections/GSMUMTS/UMTS/UMTSCellSets.h"
+
 #include "Tests/Sections/GSMUMTS/UMTS/UMTSCellSetsRecord.h"
 #include "Tests/Sections/SectionFixture.h"
 

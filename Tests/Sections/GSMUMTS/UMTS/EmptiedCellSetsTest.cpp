@@ -1,8 +1,6 @@
 // The three cell sets that a cell-set record only empties.
 
-#include "Sections/GSMUMTS/UMTS/DetectedSet.h"
-#include "Sections/GSMUMTS/UMTS/MonitoredSet.h"
-#include "Sections/GSMUMTS/UMTS/VirtualActiveSet.h"
+#include "Sections/GSMUMTS/UMTS/UMTSCellSets.h"
 #include "Tests/Sections/GSMUMTS/UMTS/UMTSCellSetsRecord.h"
 #include "Tests/Sections/SectionFixture.h"
 

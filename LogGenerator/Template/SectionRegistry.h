@@ -1,0 +1,16 @@
+#pragma once
+
+#include "LogGenerator/Template/CodeDictionary.h"
+#include "LogGenerator/Template/PropertyListReaders.h"
+
+namespace spectrel {
+
+/// What the sections of one generator share: who is there, who wants which codes, and the parsed payload that several
+/// of them read one after the other.
+struct SectionRegistry {
+    ClassDictionary classDict;
+    CodeDictionary codeDictionary;
+    PropertyListPayloads payloads;
+};
+
+} // namespace spectrel
