@@ -6,6 +6,8 @@
 
 namespace spectrel {
 
+class SpectrelApp;
+
 /// Lengths are in points (pt), the device's unit of layout; x grows to the right, y downwards.
 struct Size {
     double width = 0;
@@ -68,13 +70,23 @@ enum class ScreenPart {
     Notice, // a short message for people came or went
 };
 
-/// The toolkit that draws the controllers: measures texts, shows alerts, and is told what to draw again.
+/// The toolkit that draws the controllers: measures texts, shows alerts, and hears what to draw again.
 ///
 /// The controllers hold the state of the screens as plain properties and decide everything; a toolkit draws them and
 /// hands the user's taps and keys back.
 class ScreenToolkit {
 public:
     virtual ~ScreenToolkit() = default;
+
+    /// The application whose controllers are drawn; null where there is none. The application itself sets it.
+    void setApplication(SpectrelApp* application)
+    {
+        _application = application;
+    }
+    SpectrelApp* application() const
+    {
+        return _application;
+    }
 
     /// The room that one line of text takes. Any bytes may come: what is no UTF-8 is measured as it will be drawn.
     virtual Size sizeOfText(std::string_view text, const Font& font) const = 0;
@@ -84,6 +96,9 @@ public:
     virtual void showAlert(const Alert& alert) = 0;
     /// Puts the text on the clipboard. False, with `reason` for people, when it cannot.
     virtual bool copyToClipboard(const std::string& text, std::string& reason) = 0;
+
+private:
+    SpectrelApp* _application = nullptr;
 };
 
 } // namespace spectrel

@@ -101,7 +101,6 @@ signals:
 
 private:
     bool isTop() const;
-    QString label(std::size_t number) const;
     QVariant cellData(const SpectrelCell& cell, int role) const;
     QVariant nodeData(std::size_t row, int role) const;
     void tellChanged(int first, int end);

@@ -75,7 +75,7 @@ void QuickScreen::screenDidChange(ScreenPart part, Animation animation)
 /// Brings the models in line with the stack of panes.
 void QuickScreen::adoptPanes(Animation animation)
 {
-    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    const SpectrelApp* app = application();
     if (!_isReady || !app || !app->navController())
         return;
     const auto& panes = app->navController()->viewControllers();
@@ -95,7 +95,7 @@ void QuickScreen::adoptPanes(Animation animation)
 
 void QuickScreen::adoptSaveScreen()
 {
-    SpectrelApp* app = SpectrelApp::sharedApplication();
+    const SpectrelApp* app = application();
     SpectrelSaveViewController* shown = app ? app->saveViewController() : nullptr;
     if (_saveScreen && _saveScreen->shows(shown))
         return;
@@ -121,7 +121,7 @@ bool QuickScreen::copyToClipboard(const std::string& text, std::string&)
 
 bool QuickScreen::isWindowShown() const
 {
-    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    const SpectrelApp* app = application();
     return app && app->window() && app->window()->isKeyAndVisible;
 }
 
@@ -148,7 +148,7 @@ QString QuickScreen::alertButton() const
 
 QString QuickScreen::notice() const
 {
-    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    const SpectrelApp* app = application();
     if (app && app->copying() && !app->copying()->message().empty())
         return shownText(app->copying()->message());
     return app && app->playback() ? shownText(app->playback()->notice()) : QString();
@@ -191,21 +191,21 @@ void QuickScreen::closeAlert()
 
 void QuickScreen::copyRow(int row)
 {
-    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    const SpectrelApp* app = application();
     if (app && app->copying() && row >= 0)
         app->copying()->copyRow(*app->navController()->topViewController(), static_cast<std::size_t>(row));
 }
 
 void QuickScreen::copyPane()
 {
-    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    const SpectrelApp* app = application();
     if (app && app->copying())
         app->copying()->copyPane(*app->navController()->topViewController());
 }
 
 void QuickScreen::clearNotice()
 {
-    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    const SpectrelApp* app = application();
     if (app && app->copying())
         app->copying()->clearMessage();
 }

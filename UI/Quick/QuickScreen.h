@@ -16,11 +16,9 @@
 
 namespace spectrel {
 
-class SpectrelApp;
-
 /// The toolkit of the graphical screens: measures texts with the desktop's fonts and tells the QML what has changed.
 ///
-/// The shared application's controllers are the only state; the models in here are what the QML knows of them.
+/// The application's controllers are the only state; the models in here are what the QML knows of them.
 class QuickScreen final : public QObject, public ScreenToolkit {
     Q_OBJECT
     QML_ELEMENT
@@ -116,8 +114,8 @@ private:
     std::vector<PaneModel*> _panes; // of the stack, bottom first; the models are this object's children
     SaveModel* _saveScreen = nullptr;
     std::deque<Alert> _alerts;
-    FindModel _find {nullptr};
-    PlaybackModel _playback {nullptr};
+    FindModel _find {*this};
+    PlaybackModel _playback {*this};
 };
 
 } // namespace spectrel

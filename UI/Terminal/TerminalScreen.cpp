@@ -16,12 +16,6 @@ constexpr std::string_view SpinnerFrames = "|/-\\";
 
 constexpr int SmallestWithPlayback = 4; // lines
 
-SpectrelApp* shownApplication()
-{
-    SpectrelApp* app = SpectrelApp::sharedApplication();
-    return app && app->window() && app->window()->isKeyAndVisible ? app : nullptr;
-}
-
 } // namespace
 
 TerminalScreen::TerminalScreen(Terminal terminal)
@@ -43,9 +37,10 @@ void TerminalScreen::screenDidChange(ScreenPart part, Animation)
 {
     if (part == ScreenPart::Modal) {
         _saveView = SaveView();
-        SpectrelApp* app = SpectrelApp::sharedApplication();
-        if (app && app->saveViewController())
-            app->saveViewController()->beginEditing(); // a keyboard is at hand: typing goes into the description
+        if (application() && application()->saveViewController())
+            application()
+                ->saveViewController()
+                ->beginEditing(); // a keyboard is at hand: typing goes into the description
     }
     _terminal.needsDisplay();
 }
@@ -70,6 +65,13 @@ void TerminalScreen::resize(int width, int height)
 {
     _grid.resize(width, height);
     _terminal.needsDisplay();
+}
+
+/// Null where none is to be seen.
+SpectrelApp* TerminalScreen::shownApplication() const
+{
+    SpectrelApp* app = application();
+    return app && app->window() && app->window()->isKeyAndVisible ? app : nullptr;
 }
 
 // ---- Input
@@ -134,7 +136,7 @@ void TerminalScreen::perform(KeyAction action, SpectrelApp& app, PaneView& view)
     case KeyAction::Help:
         return _help.open(app.playback() != nullptr);
     case KeyAction::Save:
-        return PaneView::pressSaveButton(pane);
+        return pane.pressSaveButton();
     case KeyAction::Find:
         return app.find()->open();
     case KeyAction::FindNext:
