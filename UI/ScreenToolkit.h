@@ -1,5 +1,7 @@
 #pragma once
 
+#include "Values/Result.h"
+
 #include <functional>
 #include <string>
 #include <string_view>
@@ -94,8 +96,8 @@ public:
     virtual Size mainScreenSize() const = 0;
     virtual void screenDidChange(ScreenPart part, Animation animation) = 0;
     virtual void showAlert(const Alert& alert) = 0;
-    /// Puts the text on the clipboard. False, with `reason` for people, when it cannot.
-    virtual bool copyToClipboard(const std::string& text, std::string& reason) = 0;
+    /// Puts the text on the clipboard.
+    virtual Outcome copyToClipboard(const std::string& text) = 0;
 
 private:
     SpectrelApp* _application = nullptr;

@@ -111,10 +111,10 @@ void QuickScreen::showAlert(const Alert& alert)
     emit alertChanged();
 }
 
-bool QuickScreen::copyToClipboard(const std::string& text, std::string&)
+Outcome QuickScreen::copyToClipboard(const std::string& text)
 {
     QGuiApplication::clipboard()->setText(QString::fromStdString(text));
-    return true;
+    return Done {};
 }
 
 // ---- What the QML asks and tells

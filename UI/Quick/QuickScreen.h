@@ -45,7 +45,7 @@ public:
     Size mainScreenSize() const override;
     void screenDidChange(ScreenPart part, Animation animation) override;
     void showAlert(const Alert& alert) override;
-    bool copyToClipboard(const std::string& text, std::string& reason) override;
+    Outcome copyToClipboard(const std::string& text) override;
 
     // For the front end.
     void setDark(bool isDark);

@@ -51,14 +51,12 @@ void TerminalScreen::showAlert(const Alert& alert)
     _terminal.needsDisplay();
 }
 
-bool TerminalScreen::copyToClipboard(const std::string& text, std::string& reason)
+Outcome TerminalScreen::copyToClipboard(const std::string& text)
 {
-    if (text.size() > MaximumCopy) {
-        reason = std::to_string(text.size()) + " bytes are too many for a terminal";
-        return false;
-    }
+    if (text.size() > MaximumCopy)
+        return Failure {std::to_string(text.size()) + " bytes are too many for a terminal"};
     _terminal.copy(text);
-    return true;
+    return Done {};
 }
 
 void TerminalScreen::resize(int width, int height)
