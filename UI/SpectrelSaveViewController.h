@@ -26,6 +26,7 @@ class SpectrelSaveViewController final : public TableSource {
 public:
     static constexpr std::string_view CellIdentifier = "SaveHistoryContentCell";
     static const Font CellFont;
+    static constexpr double RowHeight = 46; // pt, in a window
 
     /// Writes the snapshot to the path; false, with `reason`, when it could not.
     using SnapshotWriter =

@@ -112,7 +112,7 @@ QVariant PaneModel::nodeData(std::size_t row, int role) const
     }
 }
 
-void PaneModel::tellChanged(int first, int end)
+void PaneModel::emitChanged(int first, int end)
 {
     first = std::max(first, 0);
     end = std::min(end, _count);
@@ -132,10 +132,10 @@ void PaneModel::setVisibleRows(int first, int count, double width)
     const int oldFirst = std::exchange(_firstVisible, first);
     const int oldEnd = std::exchange(_endVisible, end);
     if (hasNewWidth || first >= oldEnd || end <= oldFirst) {
-        tellChanged(first, end);
+        emitChanged(first, end);
     } else {
-        tellChanged(first, oldFirst);
-        tellChanged(oldEnd, end);
+        emitChanged(first, oldFirst);
+        emitChanged(oldEnd, end);
     }
 }
 
@@ -177,17 +177,7 @@ void PaneModel::adoptNode()
         _count += newRows;
         endInsertRows();
     }
-    tellChanged(0, _count);
-}
-
-QFont PaneModel::nameFont()
-{
-    return shownFont(SpectrelCell::KeyFont);
-}
-
-QFont PaneModel::valueFont()
-{
-    return shownFont(SpectrelCell::ValueFont);
+    emitChanged(0, _count);
 }
 
 // ---- Title and toolbar
@@ -215,11 +205,6 @@ QString PaneModel::status() const
 QString PaneModel::reason() const
 {
     return shownText(_pane->lostReason());
-}
-
-QFont PaneModel::statusFont()
-{
-    return shownFont(SpectrelPaneController::StatusFont);
 }
 
 bool PaneModel::canSave() const

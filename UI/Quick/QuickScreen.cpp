@@ -32,7 +32,7 @@ Size QuickScreen::mainScreenSize() const
 
 // ---- What the controllers tell
 
-template <typename Member> void QuickScreen::tellPanes(Member member)
+template <typename Member> void QuickScreen::forEachPane(Member member)
 {
     const auto panes = _panes; // a pane may come or go meanwhile
     for (PaneModel* pane : panes)
@@ -49,11 +49,11 @@ void QuickScreen::screenDidChange(ScreenPart part, Animation animation)
     case ScreenPart::Navigation:
         return adoptPanes(animation);
     case ScreenPart::Title:
-        return tellPanes(&PaneModel::titleDidChange);
+        return forEachPane(&PaneModel::titleDidChange);
     case ScreenPart::Rows:
-        return tellPanes(&PaneModel::rowsDidChange);
+        return forEachPane(&PaneModel::rowsDidChange);
     case ScreenPart::Toolbar:
-        return tellPanes(&PaneModel::toolbarDidChange);
+        return forEachPane(&PaneModel::toolbarDidChange);
     case ScreenPart::Modal:
         return adoptSaveScreen();
     case ScreenPart::Text:

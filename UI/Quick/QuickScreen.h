@@ -105,7 +105,7 @@ signals:
 private:
     void adoptPanes(Animation animation);
     void adoptSaveScreen();
-    template <typename Member> void tellPanes(Member member);
+    template <typename Member> void forEachPane(Member member);
 
     std::function<void()> _quit;
     Size _size {480, 800};
