@@ -100,9 +100,8 @@ public:
 
     bool run()
     {
-        std::string reason;
-        if (!_frontEnd.start(reason)) {
-            std::fprintf(stderr, "quick_benchmark: %s\n", reason.c_str());
+        if (const Outcome started = _frontEnd.start(); !started) {
+            std::fprintf(stderr, "quick_benchmark: %s\n", started.failure().text.c_str());
             return false;
         }
         SpectrelApp app({_runLoop, _clock, _preferences, _frontEnd.toolkit(),

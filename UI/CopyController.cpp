@@ -43,8 +43,8 @@ void CopyController::copyPane(const SpectrelPaneController& pane)
 
 void CopyController::copy(const std::string& text, const std::string& what)
 {
-    std::string reason;
-    _message = _toolkit.copyToClipboard(text, reason) ? "Copied " + what : "Not copied: " + reason;
+    const Outcome copied = _toolkit.copyToClipboard(text);
+    _message = copied ? "Copied " + what : "Not copied: " + copied.failure().text;
     _toolkit.screenDidChange(ScreenPart::Notice, Animation::Animated);
 }
 

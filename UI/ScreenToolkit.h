@@ -1,10 +1,14 @@
 #pragma once
 
+#include "Values/Result.h"
+
 #include <functional>
 #include <string>
 #include <string_view>
 
 namespace spectrel {
+
+class SpectrelApp;
 
 /// Lengths are in points (pt), the device's unit of layout; x grows to the right, y downwards.
 struct Size {
@@ -68,7 +72,7 @@ enum class ScreenPart {
     Notice, // a short message for people came or went
 };
 
-/// The toolkit that draws the controllers: measures texts, shows alerts, and is told what to draw again.
+/// The toolkit that draws the controllers: measures texts, shows alerts, and hears what to draw again.
 ///
 /// The controllers hold the state of the screens as plain properties and decide everything; a toolkit draws them and
 /// hands the user's taps and keys back.
@@ -76,14 +80,27 @@ class ScreenToolkit {
 public:
     virtual ~ScreenToolkit() = default;
 
+    /// The application whose controllers are drawn; null where there is none. The application itself sets it.
+    void setApplication(SpectrelApp* application)
+    {
+        _application = application;
+    }
+    SpectrelApp* application() const
+    {
+        return _application;
+    }
+
     /// The room that one line of text takes. Any bytes may come: what is no UTF-8 is measured as it will be drawn.
     virtual Size sizeOfText(std::string_view text, const Font& font) const = 0;
     /// The bounds of the main screen.
     virtual Size mainScreenSize() const = 0;
     virtual void screenDidChange(ScreenPart part, Animation animation) = 0;
     virtual void showAlert(const Alert& alert) = 0;
-    /// Puts the text on the clipboard. False, with `reason` for people, when it cannot.
-    virtual bool copyToClipboard(const std::string& text, std::string& reason) = 0;
+    /// Puts the text on the clipboard.
+    virtual Outcome copyToClipboard(const std::string& text) = 0;
+
+private:
+    SpectrelApp* _application = nullptr;
 };
 
 } // namespace spectrel

@@ -23,15 +23,18 @@ SpectrelApp::SpectrelApp(Services services)
     : _services(std::move(services))
 {
     sharedInstance = this;
+    _services.toolkit.setApplication(this);
 }
 
 SpectrelApp::~SpectrelApp()
 {
-    // Closing the session tells its observer, who must find no model by then.
+    // Closing the session calls its observer, who must find no model by then.
     _playback.reset();
     _model.reset();
     if (sharedInstance == this)
         sharedInstance = nullptr;
+    if (_services.toolkit.application() == this)
+        _services.toolkit.setApplication(nullptr);
 }
 
 SpectrelApp* SpectrelApp::sharedApplication()
@@ -50,7 +53,7 @@ void SpectrelApp::applicationDidFinishLaunching()
     setUpdateMessage(ConnectingAgain);
     _dateFormatter = std::make_unique<DateFormatter>(_services.clock, UpdatedPattern);
 
-    auto root = std::make_shared<SpectrelPaneController>(_services.toolkit, nullptr, "/");
+    auto root = std::make_shared<SpectrelPaneController>(*this, _services.toolkit, nullptr, "/");
     root->setStatus(ConnectingFirst, true);
     _navController = std::make_unique<NavigationController>(_services.toolkit, std::move(root));
     _navController->setDelegate(this);
@@ -102,8 +105,8 @@ void SpectrelApp::showSaveView()
     if (_saveViewController || !_model)
         return;
     setSaveViewController(std::make_unique<SpectrelSaveViewController>(
-        SpectrelSaveViewController::Services {_services.toolkit, _services.runLoop, _services.clock,
-            _services.writeSnapshot, _services.snapshotDirectory},
+        SpectrelSaveViewController::Services {
+            *this, _services.toolkit, _services.clock, _services.writeSnapshot, _services.snapshotDirectory},
         _model->getSaveContents()));
     _saveViewController->viewWillAppear();
     _services.toolkit.screenDidChange(ScreenPart::Modal, Animation::Animated);
@@ -115,6 +118,14 @@ void SpectrelApp::closeSaveView()
         return;
     setSaveViewController(nullptr);
     _services.toolkit.screenDidChange(ScreenPart::Modal, Animation::Animated);
+}
+
+void SpectrelApp::saveViewDidFinish()
+{
+    _services.runLoop.async([] {
+        if (sharedInstance)
+            sharedInstance->closeSaveView();
+    });
 }
 
 void SpectrelApp::updateStatusForViewController(SpectrelPaneController& pane)

@@ -5,6 +5,7 @@
 #include "Platform/Clock.h"
 #include "Platform/Preferences.h"
 #include "Platform/RunLoop.h"
+#include "UI/Application.h"
 #include "UI/CopyController.h"
 #include "UI/FindController.h"
 #include "UI/NavigationController.h"
@@ -48,7 +49,7 @@ private:
 ///
 /// A front end creates it, calls `applicationDidFinishLaunching`, runs the run loop, and calls
 /// `applicationWillTerminate` when that has ended. There is one at a time.
-class SpectrelApp final : public SpectrelModelObserver, public NavigationControllerDelegate {
+class SpectrelApp final : public Application, public SpectrelModelObserver, public NavigationControllerDelegate {
 public:
     static constexpr const char* SaveMarker = "/VexelInternal/Library/PreferenceBundles/Carrier Settings.bundle";
     static constexpr std::string_view HomeScreenDomain = "org.spectrel.HomeScreen";
@@ -79,10 +80,11 @@ public:
     void applicationWillTerminate();
 
     void getSaveButtonPref();
-    /// `_setGSMRSSI`: tells the home screen whether to show the signal strength as a number.
+    /// `_setGSMRSSI`: has the home screen show, or no longer show, the signal strength as a number.
     void setGSMRSSI(bool shows);
-    void showSaveView();
+    void showSaveView() override;
     void closeSaveView();
+    void saveViewDidFinish() override;
     void updateStatusForViewController(SpectrelPaneController& pane);
 
     void updateViewControllerFromModel() override;
@@ -91,7 +93,7 @@ public:
     void navigationControllerWillShowViewController(
         NavigationController& navigationController, SpectrelPaneController& pane, Animation animated) override;
 
-    bool allowSaveButton() const
+    bool allowSaveButton() const override
     {
         return _allowSaveButton;
     }
@@ -148,8 +150,7 @@ public:
     {
         return _playback.get();
     }
-    /// Why there is no session; empty while there is one or nothing is known.
-    const std::string& lostReason() const;
+    const std::string& lostReason() const override;
 
 private:
     void reloadPanes();

@@ -1,7 +1,6 @@
 #include "UI/SpectrelPaneController.h"
 
 #include "UI/NavigationController.h"
-#include "UI/SpectrelApp.h"
 #include "UI/SpectrelCell.h"
 
 #include <memory>
@@ -11,8 +10,10 @@ namespace spectrel {
 
 const Font SpectrelPaneController::StatusFont {14};
 
-SpectrelPaneController::SpectrelPaneController(ScreenToolkit& toolkit, NodeRef node, std::string path)
-    : _toolkit(toolkit)
+SpectrelPaneController::SpectrelPaneController(
+    Application& application, ScreenToolkit& toolkit, NodeRef node, std::string path)
+    : _application(application)
+    , _toolkit(toolkit)
     , _nodes(std::move(node))
     , _keyPath(std::move(path))
     , _tableView(toolkit, *this)
@@ -37,20 +38,23 @@ void SpectrelPaneController::reloadWithNode(NodeRef node)
 void SpectrelPaneController::createToolbarItems()
 {
     using Item = ToolbarItem::Kind;
-    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    _lostReason = _application.lostReason();
+    _canSave = _application.allowSaveButton();
     _toolbarItems.clear();
     _toolbarItems.push_back({.kind = Item::LoadingIndicator, .isSpinning = _isLoading});
     _toolbarItems.push_back({.kind = Item::Label, .text = _status, .font = StatusFont});
-    if (app && !app->lostReason().empty())
-        _toolbarItems.push_back({.kind = Item::Label, .text = app->lostReason(), .font = StatusFont});
+    if (!_lostReason.empty())
+        _toolbarItems.push_back({.kind = Item::Label, .text = _lostReason, .font = StatusFont});
     _toolbarItems.push_back({.kind = Item::FlexibleSpace});
-    if (app && app->allowSaveButton()) {
-        _toolbarItems.push_back({.kind = Item::SaveButton, .action = [] {
-                                     if (SpectrelApp* current = SpectrelApp::sharedApplication())
-                                         current->showSaveView();
-                                 }});
-    }
+    if (_canSave)
+        _toolbarItems.push_back({.kind = Item::SaveButton, .action = [this] { pressSaveButton(); }});
     _toolkit.screenDidChange(ScreenPart::Toolbar, Animation::Animated);
+}
+
+void SpectrelPaneController::pressSaveButton()
+{
+    if (_canSave)
+        _application.showSaveView();
 }
 
 void SpectrelPaneController::setTitle()
@@ -140,8 +144,8 @@ void SpectrelPaneController::openRow(std::size_t row, Animation animation)
     const NodeRef child = childAtRow(row);
     if (!child || !child->childNodes())
         return;
-    auto pane =
-        std::make_shared<SpectrelPaneController>(_toolkit, child, pathByAppending(_keyPath, child->displayName()));
+    auto pane = std::make_shared<SpectrelPaneController>(
+        _application, _toolkit, child, pathByAppending(_keyPath, child->displayName()));
     pane->setStatus(_status, _isLoading);
     if (_navigationController)
         _navigationController->pushViewController(std::move(pane), animation);

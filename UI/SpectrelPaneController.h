@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Monitor/SpectrelModelNode.h"
+#include "UI/Application.h"
 #include "UI/ScreenToolkit.h"
 #include "UI/TableView.h"
 
@@ -22,7 +23,7 @@ public:
     static const Font StatusFont;
 
     /// `node` may be null: the first tree may not exist yet.
-    SpectrelPaneController(ScreenToolkit& toolkit, NodeRef node, std::string path);
+    SpectrelPaneController(Application& application, ScreenToolkit& toolkit, NodeRef node, std::string path);
     ~SpectrelPaneController() override = default;
     SpectrelPaneController(const SpectrelPaneController&) = delete;
     SpectrelPaneController& operator=(const SpectrelPaneController&) = delete;
@@ -43,6 +44,15 @@ public:
     {
         return _isLoading;
     }
+    /// Why there is no session; empty where nothing is known. As of the latest change of the toolbar, as is `canSave`.
+    const std::string& lostReason() const
+    {
+        return _lostReason;
+    }
+    bool canSave() const
+    {
+        return _canSave;
+    }
     const std::string& title() const
     {
         return _title;
@@ -59,6 +69,8 @@ public:
     /// Left to right: loading indicator, status, why there is no session when that is known, flexible space, and the
     /// save button where saving is allowed.
     void createToolbarItems();
+    /// Opens the save screen where saving is allowed.
+    void pressSaveButton();
 
     void viewWillAppear();
     void viewWillDisappear();
@@ -67,6 +79,10 @@ public:
         return _isFirstResponder;
     }
     /// The stack that the pane is on; null when it is on none.
+    NavigationController* navigationController() const
+    {
+        return _navigationController;
+    }
     void setNavigationController(NavigationController* navigationController)
     {
         _navigationController = navigationController;
@@ -90,11 +106,14 @@ private:
     void didSelectRow(std::optional<std::size_t> row) override;
     void setTitle();
 
+    Application& _application;
     ScreenToolkit& _toolkit;
     NodeRef _nodes;
     std::string _keyPath;
     std::string _status;
     bool _isLoading = true;
+    std::string _lostReason;
+    bool _canSave = false;
     std::string _title;
     std::vector<ToolbarItem> _toolbarItems;
     TableView _tableView;

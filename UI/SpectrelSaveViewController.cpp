@@ -2,7 +2,6 @@
 
 #include "Monitor/Snapshot.h"
 #include "Platform/SystemLog.h"
-#include "UI/SpectrelApp.h"
 #include "Values/Dictionary.h"
 
 #include <utility>
@@ -42,21 +41,12 @@ void SpectrelSaveViewController::savePressed()
         SPECTREL_LOG(Priority::Error, "Unable to write snapshot to %s", path.c_str());
         _services.toolkit.showAlert({"File Error", "Unable to write file to disk", "Close"});
     }
-    closeLater();
+    _services.application.saveViewDidFinish();
 }
 
 void SpectrelSaveViewController::cancelPressed()
 {
-    closeLater();
-}
-
-/// The button's own action ends first.
-void SpectrelSaveViewController::closeLater()
-{
-    _services.runLoop.async([] {
-        if (SpectrelApp* app = SpectrelApp::sharedApplication())
-            app->closeSaveView();
-    });
+    _services.application.saveViewDidFinish();
 }
 
 bool SpectrelSaveViewController::textFieldShouldReturn(TextField& textField)

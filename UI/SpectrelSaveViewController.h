@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Platform/Clock.h"
-#include "Platform/RunLoop.h"
+#include "UI/Application.h"
 #include "UI/ScreenToolkit.h"
 #include "UI/TableView.h"
 #include "Values/List.h"
@@ -26,20 +26,21 @@ class SpectrelSaveViewController final : public TableSource {
 public:
     static constexpr std::string_view CellIdentifier = "SaveHistoryContentCell";
     static const Font CellFont;
+    static constexpr double RowHeight = 46; // pt, in a window
 
     /// Writes the snapshot to the path; false, with `reason`, when it could not.
     using SnapshotWriter =
         std::function<bool(const DictionaryRef& snapshot, const std::string& path, std::string& reason)>;
-    /// What the screen needs of the platform; all outlive it.
+    /// What the screen needs; all outlive it.
     struct Services {
+        Application& application;
         ScreenToolkit& toolkit;
-        RunLoop& runLoop;
         const Clock& clock;
         SnapshotWriter writeSnapshot;
         std::string directory; // the crash-log directory
     };
 
-    /// Keeps a copy of the list; null: nothing could tell what to save.
+    /// Keeps a copy of the list; null: there is nothing to save.
     SpectrelSaveViewController(Services services, const ListRef& saveHistory);
     ~SpectrelSaveViewController() override = default;
     SpectrelSaveViewController(const SpectrelSaveViewController&) = delete;
@@ -89,7 +90,6 @@ private:
     void layOutCell(TableCell& cell, std::size_t row) override;
     void didSelectRow(std::optional<std::size_t> row) override;
     void resignDescription();
-    void closeLater();
 
     Services _services;
     Moment _timeStamp;

@@ -17,9 +17,8 @@ int runTerminal()
     LiveServices live;
     TerminalFrontEnd frontEnd(live.runLoop());
     frontEnd.onQuit = [&live] { live.runLoop().quit(); };
-    std::string reason;
-    if (!frontEnd.start(reason)) {
-        report("cannot open the terminal screens: " + reason);
+    if (const Outcome started = frontEnd.start(); !started) {
+        report("cannot open the terminal screens: " + started.failure().text);
         return ExitStatus::Failed;
     }
     runLiveApplication(live, frontEnd.toolkit(), restoreTerminal);

@@ -27,9 +27,8 @@ int viewInTerminal(const std::string& path, ViewedFile& file)
     QtRunLoop runLoop;
     TerminalFrontEnd frontEnd(runLoop);
     frontEnd.onQuit = [&runLoop] { runLoop.quit(); };
-    std::string reason;
-    if (!frontEnd.start(reason)) {
-        report("cannot open the terminal screens: " + reason);
+    if (const Outcome started = frontEnd.start(); !started) {
+        report("cannot open the terminal screens: " + started.failure().text);
         return ExitStatus::Failed;
     }
     const int status = runViewingApplication(file, path, runLoop, frontEnd.toolkit());

@@ -35,9 +35,8 @@ int runApplication(const GraphicalArguments& arguments)
     if (instance.activateOther(takeActivationToken()))
         return ExitStatus::Done;
     frontEnd.onQuit = [&live] { live.runLoop().quit(); };
-    std::string reason;
-    if (!frontEnd.start(reason)) {
-        report("cannot open the graphical screens: " + reason);
+    if (const Outcome started = frontEnd.start(); !started) {
+        report("cannot open the graphical screens: " + started.failure().text);
         return ExitStatus::Failed;
     }
     const TerminationSignals endings([&live](int) { live.runLoop().quit(); });
@@ -61,8 +60,8 @@ int viewFile(const GraphicalArguments& arguments)
         report(path + ": " + reason);
         return ExitStatus::Failed;
     }
-    if (!frontEnd.start(reason)) {
-        report("cannot open the graphical screens: " + reason);
+    if (const Outcome started = frontEnd.start(); !started) {
+        report("cannot open the graphical screens: " + started.failure().text);
         return ExitStatus::Failed;
     }
     const TerminationSignals endings([&runLoop](int) { runLoop.quit(); });

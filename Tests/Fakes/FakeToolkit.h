@@ -31,12 +31,12 @@ public:
         alerts.push_back(alert);
     }
 
-    bool copyToClipboard(const std::string& text, std::string& reason) override
+    Outcome copyToClipboard(const std::string& text) override
     {
-        reason = refusesToCopy;
-        if (refusesToCopy.empty())
-            clipboard = text;
-        return refusesToCopy.empty();
+        if (!refusesToCopy.empty())
+            return Failure {refusesToCopy};
+        clipboard = text;
+        return Done {};
     }
 
     struct Change {

@@ -58,6 +58,28 @@ inline DictionaryRef entries(std::initializer_list<Dictionary::Entry> list)
     return Dictionary::make(list);
 }
 
+/// What a controller asks for where there is no whole application.
+class FakeApplication final : public Application {
+public:
+    const std::string& lostReason() const override
+    {
+        return reason;
+    }
+    bool allowSaveButton() const override
+    {
+        return allowsSaving;
+    }
+    void showSaveView() override
+    {
+        ++saveViews;
+    }
+    void saveViewDidFinish() override { }
+
+    std::string reason;
+    bool allowsSaving = false;
+    int saveViews = 0; // asked for
+};
+
 /// A launched application over a fake model.
 class AppFixture : public testing::Test {
 protected:

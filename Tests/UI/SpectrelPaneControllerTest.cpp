@@ -20,7 +20,8 @@ protected:
 
 TEST_F(SpectrelPaneControllerTest, APaneWithNoNodeShowsNoRowsAndTheTitleSpectrel)
 {
-    SpectrelPaneController pane(toolkit, nullptr, "/");
+    FakeApplication application;
+    SpectrelPaneController pane(application, toolkit, nullptr, "/");
     pane.viewWillAppear();
     EXPECT_EQ(pane.title(), "Spectrel");
     EXPECT_EQ(pane.numberOfRows(), 0U);
@@ -91,7 +92,8 @@ TEST_F(SpectrelPaneControllerTest, AnOpenedPaneTakesPathStatusAndIndicatorFromTh
 
 TEST_F(SpectrelPaneControllerTest, NoStatusTextReadsAsAnEmptyOne)
 {
-    SpectrelPaneController pane(toolkit, nullptr, "/");
+    FakeApplication application;
+    SpectrelPaneController pane(application, toolkit, nullptr, "/");
     pane.setStatus("text", false);
     EXPECT_EQ(toolbar(pane), "(stopped)|text|...");
     pane.setStatus(std::nullopt, true);
@@ -100,7 +102,8 @@ TEST_F(SpectrelPaneControllerTest, NoStatusTextReadsAsAnEmptyOne)
 
 TEST_F(SpectrelPaneControllerTest, TheStatusLabelIsInThe14PointSystemFont)
 {
-    SpectrelPaneController pane(toolkit, nullptr, "/");
+    FakeApplication application;
+    SpectrelPaneController pane(application, toolkit, nullptr, "/");
     pane.setStatus("text", false);
     EXPECT_EQ(pane.toolbarItems()[1].font, (Font {14, FontWeight::Regular}));
 }
@@ -112,6 +115,24 @@ TEST_F(SpectrelPaneControllerTest, TheSaveButtonOpensTheSaveScreen)
     const auto action = top().toolbarItems().back().action;
     action();
     EXPECT_NE(app->saveViewController(), nullptr);
+}
+
+TEST_F(SpectrelPaneControllerTest, WhatItSaysOfTheSessionIsThatOfTheToolbar)
+{
+    FakeApplication application;
+    SpectrelPaneController pane(application, toolkit, nullptr, "/");
+    pane.pressSaveButton();
+    EXPECT_EQ(application.saveViews, 0);
+    application.reason = "no service";
+    application.allowsSaving = true;
+    EXPECT_EQ(pane.lostReason(), "");
+    EXPECT_FALSE(pane.canSave());
+    pane.createToolbarItems();
+    EXPECT_EQ(toolbar(pane), "(spinning)||no service|...|[save]");
+    EXPECT_EQ(pane.lostReason(), "no service");
+    EXPECT_TRUE(pane.canSave());
+    pane.pressSaveButton();
+    EXPECT_EQ(application.saveViews, 1);
 }
 
 TEST_F(SpectrelPaneControllerTest, ARowMadeForAnInnerNodeLeavesTheValueOfALeafBlank)

@@ -6,19 +6,15 @@
 
 namespace spectrel {
 
-namespace {
-
-FindController* controller()
+FindModel::FindModel(const ScreenToolkit& toolkit)
+    : _toolkit(toolkit)
 {
-    const SpectrelApp* app = SpectrelApp::sharedApplication();
-    return app ? app->find() : nullptr;
 }
 
-} // namespace
-
-FindModel::FindModel(QObject* parent)
-    : QAbstractListModel(parent)
+FindController* FindModel::controller() const
 {
+    const SpectrelApp* app = _toolkit.application();
+    return app ? app->find() : nullptr;
 }
 
 int FindModel::rowCount(const QModelIndex& parent) const

@@ -7,6 +7,7 @@
 namespace spectrel {
 
 class FindController;
+class ScreenToolkit;
 
 /// The search in the tree as the QML sees it: the rows found as a list model.
 class FindModel final : public QAbstractListModel {
@@ -20,7 +21,8 @@ class FindModel final : public QAbstractListModel {
 public:
     enum Role { NameRole = Qt::UserRole, ValueRole, IsInnerRole, PanePathRole };
 
-    explicit FindModel(QObject* parent);
+    /// `toolkit` knows the application and outlives this.
+    explicit FindModel(const ScreenToolkit& toolkit);
 
     int rowCount(const QModelIndex& parent = {}) const override;
     QVariant data(const QModelIndex& index, int role) const override;
@@ -47,6 +49,9 @@ signals:
     void changed();
 
 private:
+    FindController* controller() const;
+
+    const ScreenToolkit& _toolkit;
     int _count = 0; // finds that the QML knows
 };
 

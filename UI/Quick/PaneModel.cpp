@@ -2,7 +2,6 @@
 
 #include "UI/NavigationController.h"
 #include "UI/Quick/QuickText.h"
-#include "UI/SpectrelApp.h"
 #include "UI/SpectrelCell.h"
 
 #include <algorithm>
@@ -113,7 +112,7 @@ QVariant PaneModel::nodeData(std::size_t row, int role) const
     }
 }
 
-void PaneModel::tellChanged(int first, int end)
+void PaneModel::emitChanged(int first, int end)
 {
     first = std::max(first, 0);
     end = std::min(end, _count);
@@ -133,10 +132,10 @@ void PaneModel::setVisibleRows(int first, int count, double width)
     const int oldFirst = std::exchange(_firstVisible, first);
     const int oldEnd = std::exchange(_endVisible, end);
     if (hasNewWidth || first >= oldEnd || end <= oldFirst) {
-        tellChanged(first, end);
+        emitChanged(first, end);
     } else {
-        tellChanged(first, oldFirst);
-        tellChanged(oldEnd, end);
+        emitChanged(first, oldFirst);
+        emitChanged(oldEnd, end);
     }
 }
 
@@ -178,17 +177,7 @@ void PaneModel::adoptNode()
         _count += newRows;
         endInsertRows();
     }
-    tellChanged(0, _count);
-}
-
-QFont PaneModel::nameFont()
-{
-    return shownFont(SpectrelCell::KeyFont);
-}
-
-QFont PaneModel::valueFont()
-{
-    return shownFont(SpectrelCell::ValueFont);
+    emitChanged(0, _count);
 }
 
 // ---- Title and toolbar
@@ -205,38 +194,22 @@ QString PaneModel::path() const
 
 bool PaneModel::isLoading() const
 {
-    return std::ranges::any_of(_pane->toolbarItems(),
-        [](const ToolbarItem& item) { return item.kind == ToolbarItem::Kind::LoadingIndicator && item.isSpinning; });
-}
-
-QString PaneModel::label(std::size_t number) const
-{
-    for (const ToolbarItem& item : _pane->toolbarItems()) {
-        if (item.kind == ToolbarItem::Kind::Label && number-- == 0)
-            return shownText(item.text);
-    }
-    return {};
+    return _pane->isLoading();
 }
 
 QString PaneModel::status() const
 {
-    return label(0);
+    return shownText(_pane->status());
 }
 
 QString PaneModel::reason() const
 {
-    return label(1);
-}
-
-QFont PaneModel::statusFont()
-{
-    return shownFont(SpectrelPaneController::StatusFont);
+    return shownText(_pane->lostReason());
 }
 
 bool PaneModel::canSave() const
 {
-    return std::ranges::any_of(
-        _pane->toolbarItems(), [](const ToolbarItem& item) { return item.kind == ToolbarItem::Kind::SaveButton; });
+    return _pane->canSave();
 }
 
 void PaneModel::titleDidChange()
@@ -254,8 +227,8 @@ void PaneModel::toolbarDidChange()
 /// A page that slides away is still there for a moment, but nothing on it can be pressed.
 bool PaneModel::isTop() const
 {
-    const SpectrelApp* app = SpectrelApp::sharedApplication();
-    return app && app->navController() && app->navController()->topViewController() == _pane;
+    const NavigationController* navigation = _pane->navigationController();
+    return navigation && navigation->topViewController() == _pane;
 }
 
 void PaneModel::tap(int row)
@@ -269,7 +242,7 @@ void PaneModel::tap(int row)
 void PaneModel::goBack()
 {
     if (isTop())
-        SpectrelApp::sharedApplication()->navController()->popViewController(Animation::Animated);
+        _pane->navigationController()->popViewController(Animation::Animated);
 }
 
 void PaneModel::didScrollSideways(int row, double offset)
@@ -290,14 +263,8 @@ bool PaneModel::scrollSideways(int row, double by)
 
 void PaneModel::pressSaveButton()
 {
-    if (!isTop())
-        return;
-    for (const ToolbarItem& item : _pane->toolbarItems()) {
-        if (item.kind == ToolbarItem::Kind::SaveButton && item.action) {
-            const auto action = item.action; // the toolbar may be rebuilt meanwhile
-            return action();
-        }
-    }
+    if (isTop())
+        _pane->pressSaveButton();
 }
 
 void PaneModel::didLeave()

@@ -3,7 +3,6 @@
 #include "UI/SpectrelPaneController.h"
 
 #include <QAbstractListModel>
-#include <QFont>
 #include <QRectF>
 #include <QString>
 #include <QtQml/qqmlregistration.h>
@@ -25,11 +24,8 @@ class PaneModel final : public QAbstractListModel {
     Q_PROPERTY(bool isLoading READ isLoading NOTIFY toolbarChanged)
     Q_PROPERTY(QString status READ status NOTIFY toolbarChanged)
     Q_PROPERTY(QString reason READ reason NOTIFY toolbarChanged)
-    Q_PROPERTY(QFont statusFont READ statusFont CONSTANT)
     Q_PROPERTY(bool canSave READ canSave NOTIFY toolbarChanged)
     Q_PROPERTY(int selectedRow READ selectedRow NOTIFY selectedRowChanged)
-    Q_PROPERTY(QFont nameFont READ nameFont CONSTANT)
-    Q_PROPERTY(QFont valueFont READ valueFont CONSTANT)
 
 public:
     enum Role {
@@ -63,15 +59,12 @@ public:
     QString status() const;
     /// Why there is no session; empty where nothing is known.
     QString reason() const;
-    static QFont statusFont();
     bool canSave() const;
     /// -1: none.
     int selectedRow() const
     {
         return _selectedRow;
     }
-    static QFont nameFont();
-    static QFont valueFont();
 
     /// The room that the screen has: `count` rows from row `first`, each with a content `width` pt wide.
     Q_INVOKABLE void setVisibleRows(int first, int count, double width);
@@ -101,10 +94,9 @@ signals:
 
 private:
     bool isTop() const;
-    QString label(std::size_t number) const;
     QVariant cellData(const SpectrelCell& cell, int role) const;
     QVariant nodeData(std::size_t row, int role) const;
-    void tellChanged(int first, int end);
+    void emitChanged(int first, int end);
     void adoptNode();
     void adoptSelection();
 

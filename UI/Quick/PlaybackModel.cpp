@@ -8,18 +8,18 @@ namespace spectrel {
 
 namespace {
 
-PlaybackController* controller()
-{
-    const SpectrelApp* app = SpectrelApp::sharedApplication();
-    return app ? app->playback() : nullptr;
-}
-
 Direction direction(int by)
 {
     return by < 0 ? Direction::Backward : Direction::Forward;
 }
 
 } // namespace
+
+PlaybackController* PlaybackModel::controller() const
+{
+    const SpectrelApp* app = _toolkit.application();
+    return app ? app->playback() : nullptr;
+}
 
 bool PlaybackModel::isThere() const
 {

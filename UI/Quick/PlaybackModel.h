@@ -6,6 +6,9 @@
 
 namespace spectrel {
 
+class PlaybackController;
+class ScreenToolkit;
+
 /// The playback line of a recording as the QML sees it.
 class PlaybackModel final : public QObject {
     Q_OBJECT
@@ -19,8 +22,9 @@ class PlaybackModel final : public QObject {
     Q_PROPERTY(QString messagesText READ messagesText NOTIFY changed)
 
 public:
-    explicit PlaybackModel(QObject* parent)
-        : QObject(parent)
+    /// `toolkit` knows the application and outlives this.
+    explicit PlaybackModel(const ScreenToolkit& toolkit)
+        : _toolkit(toolkit)
     {
     }
 
@@ -43,6 +47,11 @@ public:
 
 signals:
     void changed();
+
+private:
+    PlaybackController* controller() const;
+
+    const ScreenToolkit& _toolkit;
 };
 
 } // namespace spectrel

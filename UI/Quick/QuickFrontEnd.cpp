@@ -75,12 +75,13 @@ ScreenToolkit& QuickFrontEnd::toolkit()
     return _session->screen;
 }
 
-bool QuickFrontEnd::start(std::string& reason)
+Outcome QuickFrontEnd::start()
 {
+    std::string reason;
     chooseRenderer();
     qml_register_types_Spectrel_Quick();
     auto engine = std::make_unique<QQmlApplicationEngine>();
-    const auto telling =
+    const auto listening =
         QObject::connect(engine.get(), &QQmlEngine::warnings, [&reason](const QList<QQmlError>& errors) {
             if (reason.empty() && !errors.isEmpty())
                 reason = errors.constFirst().toString().toStdString();
@@ -88,11 +89,11 @@ bool QuickFrontEnd::start(std::string& reason)
     engine->addImportPath("qrc:/qt/qml");
     engine->setInitialProperties({{"screen", QVariant::fromValue(&_session->screen)}});
     engine->load(QUrl("qrc:/qt/qml/Spectrel/Quick/Main.qml"));
-    QObject::disconnect(telling);
+    QObject::disconnect(listening);
     if (engine->rootObjects().isEmpty())
-        return false;
+        return Failure {reason};
     _session->engine = std::move(engine);
-    return true;
+    return Done {};
 }
 
 void QuickFrontEnd::stop()

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "UI/ScreenToolkit.h"
+#include "Values/Result.h"
 
 #include <functional>
 #include <memory>
@@ -19,7 +20,7 @@ enum class Appearance { Light, Dark };
 ///     QGuiApplication application(argc, argv);
 ///     QuickFrontEnd frontEnd;
 ///     frontEnd.onQuit = [&runLoop] { end the run loop };
-///     if (!frontEnd.start(reason)) ...                        // before the application, which asks for the size
+///     if (!frontEnd.start()) ...                              // before the application, which asks for the size
 ///     SpectrelApp app({ runLoop, clock, preferences, frontEnd.toolkit(), ... });
 ///     app.applicationDidFinishLaunching();                    // shows the window
 ///     run the run loop
@@ -37,8 +38,8 @@ public:
     QuickFrontEnd& operator=(const QuickFrontEnd&) = delete;
 
     ScreenToolkit& toolkit();
-    /// Loads the screens; false, with `reason`, when they do not load.
-    bool start(std::string& reason);
+    /// Loads the screens.
+    Outcome start();
     /// Ends the window and all in it; any number of times.
     void stop();
     /// Brings the window to the front. `activationToken` is what a Wayland compositor gave the one who asks, or empty.

@@ -32,7 +32,7 @@ Size QuickScreen::mainScreenSize() const
 
 // ---- What the controllers tell
 
-template <typename Member> void QuickScreen::tellPanes(Member member)
+template <typename Member> void QuickScreen::forEachPane(Member member)
 {
     const auto panes = _panes; // a pane may come or go meanwhile
     for (PaneModel* pane : panes)
@@ -49,11 +49,11 @@ void QuickScreen::screenDidChange(ScreenPart part, Animation animation)
     case ScreenPart::Navigation:
         return adoptPanes(animation);
     case ScreenPart::Title:
-        return tellPanes(&PaneModel::titleDidChange);
+        return forEachPane(&PaneModel::titleDidChange);
     case ScreenPart::Rows:
-        return tellPanes(&PaneModel::rowsDidChange);
+        return forEachPane(&PaneModel::rowsDidChange);
     case ScreenPart::Toolbar:
-        return tellPanes(&PaneModel::toolbarDidChange);
+        return forEachPane(&PaneModel::toolbarDidChange);
     case ScreenPart::Modal:
         return adoptSaveScreen();
     case ScreenPart::Text:
@@ -75,7 +75,7 @@ void QuickScreen::screenDidChange(ScreenPart part, Animation animation)
 /// Brings the models in line with the stack of panes.
 void QuickScreen::adoptPanes(Animation animation)
 {
-    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    const SpectrelApp* app = application();
     if (!_isReady || !app || !app->navController())
         return;
     const auto& panes = app->navController()->viewControllers();
@@ -95,7 +95,7 @@ void QuickScreen::adoptPanes(Animation animation)
 
 void QuickScreen::adoptSaveScreen()
 {
-    SpectrelApp* app = SpectrelApp::sharedApplication();
+    const SpectrelApp* app = application();
     SpectrelSaveViewController* shown = app ? app->saveViewController() : nullptr;
     if (_saveScreen && _saveScreen->shows(shown))
         return;
@@ -111,17 +111,17 @@ void QuickScreen::showAlert(const Alert& alert)
     emit alertChanged();
 }
 
-bool QuickScreen::copyToClipboard(const std::string& text, std::string&)
+Outcome QuickScreen::copyToClipboard(const std::string& text)
 {
     QGuiApplication::clipboard()->setText(QString::fromStdString(text));
-    return true;
+    return Done {};
 }
 
 // ---- What the QML asks and tells
 
 bool QuickScreen::isWindowShown() const
 {
-    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    const SpectrelApp* app = application();
     return app && app->window() && app->window()->isKeyAndVisible;
 }
 
@@ -148,7 +148,7 @@ QString QuickScreen::alertButton() const
 
 QString QuickScreen::notice() const
 {
-    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    const SpectrelApp* app = application();
     if (app && app->copying() && !app->copying()->message().empty())
         return shownText(app->copying()->message());
     return app && app->playback() ? shownText(app->playback()->notice()) : QString();
@@ -191,21 +191,21 @@ void QuickScreen::closeAlert()
 
 void QuickScreen::copyRow(int row)
 {
-    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    const SpectrelApp* app = application();
     if (app && app->copying() && row >= 0)
         app->copying()->copyRow(*app->navController()->topViewController(), static_cast<std::size_t>(row));
 }
 
 void QuickScreen::copyPane()
 {
-    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    const SpectrelApp* app = application();
     if (app && app->copying())
         app->copying()->copyPane(*app->navController()->topViewController());
 }
 
 void QuickScreen::clearNotice()
 {
-    const SpectrelApp* app = SpectrelApp::sharedApplication();
+    const SpectrelApp* app = application();
     if (app && app->copying())
         app->copying()->clearMessage();
 }

@@ -16,11 +16,9 @@
 
 namespace spectrel {
 
-class SpectrelApp;
-
 /// The toolkit of the graphical screens: measures texts with the desktop's fonts and tells the QML what has changed.
 ///
-/// The shared application's controllers are the only state; the models in here are what the QML knows of them.
+/// The application's controllers are the only state; the models in here are what the QML knows of them.
 class QuickScreen final : public QObject, public ScreenToolkit {
     Q_OBJECT
     QML_ELEMENT
@@ -47,7 +45,7 @@ public:
     Size mainScreenSize() const override;
     void screenDidChange(ScreenPart part, Animation animation) override;
     void showAlert(const Alert& alert) override;
-    bool copyToClipboard(const std::string& text, std::string& reason) override;
+    Outcome copyToClipboard(const std::string& text) override;
 
     // For the front end.
     void setDark(bool isDark);
@@ -107,7 +105,7 @@ signals:
 private:
     void adoptPanes(Animation animation);
     void adoptSaveScreen();
-    template <typename Member> void tellPanes(Member member);
+    template <typename Member> void forEachPane(Member member);
 
     std::function<void()> _quit;
     Size _size {480, 800};
@@ -116,8 +114,8 @@ private:
     std::vector<PaneModel*> _panes; // of the stack, bottom first; the models are this object's children
     SaveModel* _saveScreen = nullptr;
     std::deque<Alert> _alerts;
-    FindModel _find {nullptr};
-    PlaybackModel _playback {nullptr};
+    FindModel _find {*this};
+    PlaybackModel _playback {*this};
 };
 
 } // namespace spectrel

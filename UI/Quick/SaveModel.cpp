@@ -8,12 +8,11 @@ namespace spectrel {
 SaveModel::SaveModel(SpectrelSaveViewController& controller, QObject* parent)
     : QAbstractListModel(parent)
     , _controller(&controller)
-    , _font(shownFont(SpectrelSaveViewController::CellFont))
 {
     // The table is as high as its rows: all of them are in sight.
     TableView& table = *controller.saveContentTable();
     const std::size_t rows = controller.numberOfRows();
-    table.setVisibleRows(0, rows, {0, 0, controller.frame().width, 44});
+    table.setVisibleRows(0, rows, {0, 0, controller.frame().width, SpectrelSaveViewController::RowHeight});
     for (std::size_t row = 0; row < rows; ++row) {
         const CellRef cell = table.cellAtRow(row);
         _rows.push_back({shownText(cell->textLabel.text), cell->accessory == CellAccessory::Checkmark});

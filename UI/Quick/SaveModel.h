@@ -1,7 +1,6 @@
 #pragma once
 
 #include <QAbstractListModel>
-#include <QFont>
 #include <QString>
 #include <QtQml/qqmlregistration.h>
 #include <vector>
@@ -19,7 +18,6 @@ class SaveModel final : public QAbstractListModel {
     QML_UNCREATABLE("the save screen comes from the screen")
     Q_PROPERTY(QString description READ description NOTIFY textChanged)
     Q_PROPERTY(bool isEditing READ isEditing NOTIFY textChanged)
-    Q_PROPERTY(QFont font READ font CONSTANT)
 
 public:
     enum Role { TextRole = Qt::UserRole, IsCheckedRole };
@@ -38,10 +36,6 @@ public:
     bool isEditing() const
     {
         return _isEditing;
-    }
-    QFont font() const
-    {
-        return _font;
     }
 
     Q_INVOKABLE void save();
@@ -76,7 +70,6 @@ private:
 
     SpectrelSaveViewController* _controller;
     std::vector<Row> _rows;
-    QFont _font;
     QString _description;
     bool _isEditing = false;
 };

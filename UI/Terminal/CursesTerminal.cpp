@@ -73,12 +73,10 @@ struct CursesTerminal::Screen {
     SCREEN* handle;
 };
 
-std::unique_ptr<CursesTerminal> CursesTerminal::open(std::string& reason)
+Result<std::unique_ptr<CursesTerminal>> CursesTerminal::open()
 {
-    if (::isatty(STDIN_FILENO) == 0 || ::isatty(STDOUT_FILENO) == 0) {
-        reason = "standard input and output are no terminal";
-        return nullptr;
-    }
+    if (::isatty(STDIN_FILENO) == 0 || ::isatty(STDOUT_FILENO) == 0)
+        return Failure {"standard input and output are no terminal"};
     std::setlocale(LC_CTYPE, "");
     std::unique_ptr<CursesTerminal> terminal(new CursesTerminal());
     terminal->_isUTF8 = std::string_view(::nl_langinfo(CODESET)) == "UTF-8";
@@ -86,8 +84,7 @@ std::unique_ptr<CursesTerminal> CursesTerminal::open(std::string& reason)
     SCREEN* screen = ::newterm(nullptr, stdout, stdin);
     if (!screen) {
         const char* name = std::getenv("TERM");
-        reason = std::string("cannot draw on a terminal of the kind \"") + (name ? name : "") + "\"";
-        return nullptr;
+        return Failure {std::string("cannot draw on a terminal of the kind \"") + (name ? name : "") + "\""};
     }
     TerminalGuard::arm();
     terminal->_screen = std::make_unique<Screen>(screen);

@@ -3,6 +3,7 @@
 #include "UI/Terminal/Grid.h"
 #include "UI/Terminal/KeyDecoder.h"
 #include "UI/Terminal/TerminalGuard.h"
+#include "Values/Result.h"
 
 #include <functional>
 #include <memory>
@@ -16,9 +17,9 @@ namespace spectrel {
 /// else than ASCII shows as its nearest likeness or as '?'. Destroying it gives the terminal back.
 class CursesTerminal {
 public:
-    /// Takes the terminal; null, with `reason`, when there is none or it is of an unknown kind. Sets the locale's
+    /// Takes the terminal; fails when there is none or it is of an unknown kind. Sets the locale's
     /// character type from the environment, and nothing else of the locale.
-    static std::unique_ptr<CursesTerminal> open(std::string& reason);
+    static Result<std::unique_ptr<CursesTerminal>> open();
     ~CursesTerminal();
     CursesTerminal(const CursesTerminal&) = delete;
     CursesTerminal& operator=(const CursesTerminal&) = delete;

@@ -172,7 +172,7 @@ void PaneView::handle(const MouseEvent& event, int height, NavigationController&
         return navigation.popViewController(Animation::Animated);
     if (layout.hasToolbar && event.y == height - 1) {
         if (event.x >= _saveButton.left && event.x < _saveButton.right)
-            pressSaveButton(*pane);
+            pane->pressSaveButton();
         return;
     }
     const int line = event.y - layout.firstRow();
@@ -183,16 +183,6 @@ void PaneView::handle(const MouseEvent& event, int height, NavigationController&
         return;
     moveTo(*pane, row, layout.rows);
     pane->tableView().selectRow(_cursor);
-}
-
-void PaneView::pressSaveButton(SpectrelPaneController& pane)
-{
-    for (const ToolbarItem& item : pane.toolbarItems()) {
-        if (item.kind == ToolbarItem::Kind::SaveButton && item.action) {
-            const auto action = item.action; // the toolbar may be rebuilt meanwhile
-            return action();
-        }
-    }
 }
 
 // ---- Drawing

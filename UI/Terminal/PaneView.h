@@ -50,8 +50,6 @@ public:
     /// `height` is as in `Surroundings`.
     void perform(KeyAction action, int height, NavigationController& navigation);
     void handle(const MouseEvent& event, int height, NavigationController& navigation);
-    /// Presses the toolbar's save button, where there is one.
-    static void pressSaveButton(SpectrelPaneController& pane);
 
 private:
     /// Which lines hold what: title and toolbar give way on the smallest screens.

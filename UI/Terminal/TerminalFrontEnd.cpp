@@ -130,15 +130,15 @@ ScreenToolkit& TerminalFrontEnd::toolkit()
     return _screens->screen;
 }
 
-bool TerminalFrontEnd::start(std::string& reason)
+Outcome TerminalFrontEnd::start()
 {
     auto relay = std::make_unique<SignalRelay>();
-    auto terminal = CursesTerminal::open(reason);
+    auto terminal = CursesTerminal::open();
     if (!terminal)
-        return false;
+        return terminal.failure();
     relay->install(); // the terminal's library has handlers of its own
-    _session = std::make_unique<Session>(*this, std::move(relay), std::move(terminal));
-    return true;
+    _session = std::make_unique<Session>(*this, std::move(relay), std::move(*terminal));
+    return Done {};
 }
 
 void TerminalFrontEnd::stop()

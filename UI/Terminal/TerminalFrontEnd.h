@@ -3,6 +3,7 @@
 #include "Platform/Lifetime.h"
 #include "Platform/RunLoop.h"
 #include "UI/ScreenToolkit.h"
+#include "Values/Result.h"
 
 #include <functional>
 #include <memory>
@@ -14,7 +15,7 @@ namespace spectrel {
 ///
 ///     TerminalFrontEnd frontEnd(runLoop);
 ///     frontEnd.onQuit = [&runLoop] { end the run loop };
-///     if (!frontEnd.start(reason)) ...                        // before the application, which asks for the size
+///     if (!frontEnd.start()) ...                              // before the application, which asks for the size
 ///     SpectrelApp app({ runLoop, clock, preferences, frontEnd.toolkit(), ... });
 ///     app.applicationDidFinishLaunching();
 ///     run the run loop
@@ -34,9 +35,9 @@ public:
     TerminalFrontEnd& operator=(const TerminalFrontEnd&) = delete;
 
     ScreenToolkit& toolkit();
-    /// Opens the screens and takes SIGINT, SIGTERM, SIGHUP (each calls `onQuit`), SIGWINCH, SIGTSTP and SIGCONT; false,
-    /// with `reason`, when there is no terminal that could show them.
-    bool start(std::string& reason);
+    /// Opens the screens and takes SIGINT, SIGTERM, SIGHUP (each calls `onQuit`), SIGWINCH, SIGTSTP and SIGCONT; fails
+    /// when there is no terminal that could show them.
+    Outcome start();
     /// Gives the terminal and the signals back; any number of times.
     void stop();
 

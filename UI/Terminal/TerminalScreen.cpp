@@ -16,12 +16,6 @@ constexpr std::string_view SpinnerFrames = "|/-\\";
 
 constexpr int SmallestWithPlayback = 4; // lines
 
-SpectrelApp* shownApplication()
-{
-    SpectrelApp* app = SpectrelApp::sharedApplication();
-    return app && app->window() && app->window()->isKeyAndVisible ? app : nullptr;
-}
-
 } // namespace
 
 TerminalScreen::TerminalScreen(Terminal terminal)
@@ -43,9 +37,10 @@ void TerminalScreen::screenDidChange(ScreenPart part, Animation)
 {
     if (part == ScreenPart::Modal) {
         _saveView = SaveView();
-        SpectrelApp* app = SpectrelApp::sharedApplication();
-        if (app && app->saveViewController())
-            app->saveViewController()->beginEditing(); // a keyboard is at hand: typing goes into the description
+        if (application() && application()->saveViewController())
+            application()
+                ->saveViewController()
+                ->beginEditing(); // a keyboard is at hand: typing goes into the description
     }
     _terminal.needsDisplay();
 }
@@ -56,20 +51,25 @@ void TerminalScreen::showAlert(const Alert& alert)
     _terminal.needsDisplay();
 }
 
-bool TerminalScreen::copyToClipboard(const std::string& text, std::string& reason)
+Outcome TerminalScreen::copyToClipboard(const std::string& text)
 {
-    if (text.size() > MaximumCopy) {
-        reason = std::to_string(text.size()) + " bytes are too many for a terminal";
-        return false;
-    }
+    if (text.size() > MaximumCopy)
+        return Failure {std::to_string(text.size()) + " bytes are too many for a terminal"};
     _terminal.copy(text);
-    return true;
+    return Done {};
 }
 
 void TerminalScreen::resize(int width, int height)
 {
     _grid.resize(width, height);
     _terminal.needsDisplay();
+}
+
+/// Null where none is to be seen.
+SpectrelApp* TerminalScreen::shownApplication() const
+{
+    SpectrelApp* app = application();
+    return app && app->window() && app->window()->isKeyAndVisible ? app : nullptr;
 }
 
 // ---- Input
@@ -134,7 +134,7 @@ void TerminalScreen::perform(KeyAction action, SpectrelApp& app, PaneView& view)
     case KeyAction::Help:
         return _help.open(app.playback() != nullptr);
     case KeyAction::Save:
-        return PaneView::pressSaveButton(pane);
+        return pane.pressSaveButton();
     case KeyAction::Find:
         return app.find()->open();
     case KeyAction::FindNext:

@@ -18,9 +18,7 @@
 
 namespace spectrel {
 
-class SpectrelApp;
-
-/// Everything of the terminal front end but the terminal: draws the shared application's screens into a grid and
+/// Everything of the terminal front end but the terminal: draws the application's screens into a grid and
 /// hands input to the controllers. An alert covers the help, the help the save screen or the search, and those the
 /// panes.
 class TerminalScreen final : public ScreenToolkit {
@@ -41,7 +39,7 @@ public:
     Size mainScreenSize() const override;
     void screenDidChange(ScreenPart part, Animation animation) override;
     void showAlert(const Alert& alert) override;
-    bool copyToClipboard(const std::string& text, std::string& reason) override;
+    Outcome copyToClipboard(const std::string& text) override;
 
     // For the terminal.
     void resize(int width, int height);
@@ -52,6 +50,7 @@ public:
     void advanceSpinner();
 
 private:
+    SpectrelApp* shownApplication() const;
     PaneView* topView(SpectrelApp& app);
     template <typename Event> void dispatch(const Event& event);
     bool coverTakes(const KeyEvent& event);

@@ -87,8 +87,8 @@ void QuickFixture::TearDown()
 
 void QuickFixture::open(int width, int height)
 {
-    std::string reason;
-    ASSERT_TRUE(frontEnd->start(reason)) << reason;
+    const Outcome started = frontEnd->start();
+    ASSERT_TRUE(started) << started.failure().text;
     window().resize(width, height);
     app = makeApp(frontEnd->toolkit());
     app->applicationDidFinishLaunching();

@@ -18,13 +18,13 @@
 namespace spectrel {
 namespace {
 
-struct Outcome {
+struct Ended {
     std::string output; // all that reached the terminal
     int status = 0; // as waitpid tells it
 };
 
 /// Runs the action in a process of its own on a terminal of 20 by 4.
-Outcome runOnTerminal(const char* kind, const std::function<void()>& action)
+Ended runOnTerminal(const char* kind, const std::function<void()>& action)
 {
     winsize size {4, 20, 0, 0};
     int master = -1;
@@ -40,7 +40,7 @@ Outcome runOnTerminal(const char* kind, const std::function<void()>& action)
         action();
         std::exit(0);
     }
-    Outcome outcome;
+    Ended outcome;
     std::array<char, 4096> bytes;
     ssize_t count = 0;
     while ((count = ::read(master, bytes.data(), bytes.size())) > 0)
@@ -52,12 +52,12 @@ Outcome runOnTerminal(const char* kind, const std::function<void()>& action)
 
 std::unique_ptr<CursesTerminal> showText(std::string_view text)
 {
-    std::string reason;
-    auto terminal = CursesTerminal::open(reason);
-    if (!terminal) {
-        std::printf("%s\n", reason.c_str());
+    auto opened = CursesTerminal::open();
+    if (!opened) {
+        std::printf("%s\n", opened.failure().text.c_str());
         std::exit(1);
     }
+    auto terminal = std::move(*opened);
     Grid grid(terminal->width(), terminal->height());
     grid.put(0, 0, text, Style {.tint = Tint::Accent});
     terminal->show(grid);
@@ -75,7 +75,7 @@ std::string afterScreen(const std::string& output)
 
 TEST(CursesTerminalTest, ShowsTheGridAndGivesTheTerminalBack)
 {
-    const Outcome outcome = runOnTerminal("xterm", [] { showText("日本"); });
+    const Ended outcome = runOnTerminal("xterm", [] { showText("日本"); });
     EXPECT_NE(outcome.output.find("日本"), std::string::npos);
     EXPECT_NE(afterScreen(outcome.output), "never left");
     EXPECT_EQ(outcome.status, 0);
@@ -84,7 +84,7 @@ TEST(CursesTerminalTest, ShowsTheGridAndGivesTheTerminalBack)
 TEST(CursesTerminalTest, ACrashGivesTheTerminalBackAndStaysACrash)
 {
     for (const int signal : {SIGSEGV, SIGABRT, SIGBUS, SIGFPE, SIGILL, SIGQUIT}) {
-        const Outcome outcome = runOnTerminal("xterm", [signal] {
+        const Ended outcome = runOnTerminal("xterm", [signal] {
             std::signal(signal, SIG_DFL); // whatever a sanitizer has put there
             const auto terminal = showText("text");
             ::raise(signal);
@@ -97,7 +97,7 @@ TEST(CursesTerminalTest, ACrashGivesTheTerminalBackAndStaysACrash)
 
 TEST(CursesTerminalTest, StandardErrorIsHeldUntilTheScreenIsLeft)
 {
-    const Outcome outcome = runOnTerminal("xterm", [] {
+    const Ended outcome = runOnTerminal("xterm", [] {
         const auto terminal = showText("text");
         std::fprintf(stderr, "a held line\n");
     });
@@ -107,7 +107,7 @@ TEST(CursesTerminalTest, StandardErrorIsHeldUntilTheScreenIsLeft)
 
 TEST(CursesTerminalTest, CopyingSendsTheTextToTheTerminalsClipboard)
 {
-    const Outcome outcome = runOnTerminal("xterm-256color", [] { showText("hello")->copy("20 MHz\n"); });
+    const Ended outcome = runOnTerminal("xterm-256color", [] { showText("hello")->copy("20 MHz\n"); });
     const auto sent = outcome.output.find("\033]52;c;MjAgTUh6Cg==\a");
     ASSERT_NE(sent, std::string::npos);
     EXPECT_GT(sent, outcome.output.find("hello"));
@@ -126,7 +126,7 @@ TEST(CursesTerminalTest, ColoursAreLeftOutWhenNotWanted)
 
 TEST(CursesTerminalTest, AnUnknownTerminalIsRefusedWithItsName)
 {
-    const Outcome outcome = runOnTerminal("nonsense", [] { showText("text"); });
+    const Ended outcome = runOnTerminal("nonsense", [] { showText("text"); });
     EXPECT_NE(outcome.output.find("\"nonsense\""), std::string::npos);
     EXPECT_EQ(WEXITSTATUS(outcome.status), 1);
 }
@@ -147,7 +147,7 @@ TEST(SignalRelayTest, ASignalMakesTheFileReadableAndIsTakenOnce)
 
 TEST(SignalRelayTest, ASecondWishToEndEndsAProgramThatDoesNotListen)
 {
-    const Outcome outcome = runOnTerminal("xterm", [] {
+    const Ended outcome = runOnTerminal("xterm", [] {
         const SignalRelay relay;
         const auto terminal = showText("text");
         ::raise(SIGTERM);

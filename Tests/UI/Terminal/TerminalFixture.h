@@ -16,6 +16,10 @@ protected:
     {
         screen.resize(40, 7);
     }
+    ~TerminalFixture() override
+    {
+        app.reset(); // before the screen
+    }
     void start()
     {
         app = makeApp(screen);

@@ -54,7 +54,7 @@ Popup {
             width: box.width - 48
             topPadding: 8
             text: box.screen.aboutName
-            font.pixelSize: 20
+            font.pixelSize: Theme.nameText
             font.bold: true
             color: Theme.text
             horizontalAlignment: Text.AlignHCenter
@@ -64,7 +64,7 @@ Popup {
             objectName: "aboutVersion"
             width: box.width - 48
             text: box.screen.aboutVersion
-            font.pixelSize: 14
+            font.pixelSize: Theme.messageText
             color: Theme.faint
             horizontalAlignment: Text.AlignHCenter
         }
@@ -74,7 +74,7 @@ Popup {
             topPadding: 6
             bottomPadding: 14
             text: box.screen.aboutSummary
-            font.pixelSize: 15
+            font.pixelSize: Theme.plainText
             color: Theme.text
             wrapMode: Text.Wrap
             horizontalAlignment: Text.AlignHCenter

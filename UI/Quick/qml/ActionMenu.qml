@@ -64,7 +64,7 @@ T.Popup {
                     rightPadding: 12
                     text: entry.text
                     textFormat: Text.PlainText
-                    font.pixelSize: 16
+                    font.pixelSize: Theme.controlText
                     color: Theme.text
                     elide: Text.ElideMiddle
                     verticalAlignment: Text.AlignVCenter

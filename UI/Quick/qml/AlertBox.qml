@@ -48,7 +48,7 @@ Popup {
             width: box.width - 48
             text: box.screen.alertTitle
             textFormat: Text.PlainText
-            font.pixelSize: 18
+            font.pixelSize: Theme.titleText
             font.bold: true
             color: Theme.text
             wrapMode: Text.Wrap
@@ -61,7 +61,7 @@ Popup {
             bottomPadding: 12
             text: box.screen.alertMessage
             textFormat: Text.PlainText
-            font.pixelSize: 15
+            font.pixelSize: Theme.plainText
             color: Theme.faint
             wrapMode: Text.Wrap
             horizontalAlignment: Text.AlignHCenter

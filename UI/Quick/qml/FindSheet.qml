@@ -106,7 +106,7 @@ Popup {
             height: 28
             text: sheet.find.countText
             textFormat: Text.PlainText
-            font.pixelSize: 13
+            font.pixelSize: Theme.noteText
             font.bold: true
             color: Theme.faint
             verticalAlignment: Text.AlignVCenter
@@ -175,7 +175,7 @@ Popup {
                             Layout.fillWidth: true
                             text: entry.name
                             textFormat: Text.PlainText
-                            font.pixelSize: 15
+                            font.pixelSize: Theme.plainText
                             font.bold: true
                             color: Theme.text
                             elide: Text.ElideRight
@@ -186,7 +186,7 @@ Popup {
                             Layout.maximumWidth: entry.width / 2
                             text: entry.value
                             textFormat: Text.PlainText
-                            font.pixelSize: 15
+                            font.pixelSize: Theme.plainText
                             color: Theme.value
                             elide: Text.ElideRight
                             Accessible.ignored: true
@@ -204,7 +204,7 @@ Popup {
                         Layout.fillWidth: true
                         text: entry.panePath
                         textFormat: Text.PlainText
-                        font.pixelSize: 12
+                        font.pixelSize: Theme.smallText
                         color: Theme.faint
                         elide: Text.ElideLeft
                         Accessible.ignored: true

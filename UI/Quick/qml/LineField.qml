@@ -9,7 +9,7 @@ TextField {
     implicitHeight: Theme.touch
     leftPadding: 16
     rightPadding: 16
-    font.pixelSize: 16
+    font.pixelSize: Theme.controlText
     color: Theme.text
     selectionColor: Theme.accent
     selectedTextColor: Theme.accentText

@@ -10,7 +10,6 @@ FocusScope {
     required property QuickScreen screen
     property bool showsCursor: false // the keyboard is in use
 
-    readonly property real rowHeight: 50
     readonly property real gapAbove: 4 // the first row
     readonly property real sidewaysStep: 80 // px
 
@@ -70,17 +69,17 @@ FocusScope {
             }
         }
 
-        onContentYChanged: tellVisibleRows()
-        onOriginYChanged: tellVisibleRows()
-        onHeightChanged: tellVisibleRows()
-        onWidthChanged: tellVisibleRows()
-        Component.onCompleted: tellVisibleRows()
+        onContentYChanged: showVisibleRows()
+        onOriginYChanged: showVisibleRows()
+        onHeightChanged: showVisibleRows()
+        onWidthChanged: showVisibleRows()
+        Component.onCompleted: showVisibleRows()
 
-        function tellVisibleRows() {
+        function showVisibleRows() {
             // The list moves its origin rather than the rows in sight when rows come or go above them.
             const top = contentY - originY - page.gapAbove;
-            const first = Math.max(0, Math.floor(top / page.rowHeight));
-            const room = Math.ceil(height / page.rowHeight) + 1;
+            const first = Math.max(0, Math.floor(top / Theme.rowHeight));
+            const room = Math.ceil(height / Theme.rowHeight) + 1;
             page.pane.setVisibleRows(first, room, width - 1.5 * Theme.margin - 4);
         }
     }
@@ -112,7 +111,7 @@ FocusScope {
 
     // False when the page does nothing at it.
     function perform(action) {
-        const perPage = Math.max(1, Math.floor(list.height / rowHeight) - 1);
+        const perPage = Math.max(1, Math.floor(list.height / Theme.rowHeight) - 1);
         switch (action) {
         case KeyMap.RowUp: moveBy(-1); break;
         case KeyMap.RowDown: moveBy(1); break;

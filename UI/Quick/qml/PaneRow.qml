@@ -24,7 +24,7 @@ Item {
     signal held(point at) // held down, or pressed with the right button
 
     objectName: "row"
-    implicitHeight: 50
+    implicitHeight: Theme.rowHeight
     Accessible.role: isInner ? Accessible.Button : Accessible.ListItem
     Accessible.name: isInner ? name : name + ", " + value
     Accessible.focusable: true
@@ -104,7 +104,7 @@ Item {
             elide: isTooLong ? Text.ElideRight : Text.ElideNone
             text: row.name
             textFormat: Text.PlainText
-            font: row.pane.nameFont
+            font: Measures.nameFont
             color: Theme.text
             Accessible.ignored: true
         }
@@ -117,7 +117,7 @@ Item {
             height: row.valueFrame.height
             text: row.value
             textFormat: Text.PlainText
-            font: row.pane.valueFont
+            font: Measures.valueFont
             color: Theme.value
             Accessible.ignored: true
         }

@@ -32,7 +32,7 @@ Rectangle {
         Text {
             objectName: "playbackTime"
             text: bar.playback.timeText
-            font.pixelSize: 13
+            font.pixelSize: Theme.noteText
             color: Theme.text
             Accessible.role: Accessible.StaticText
             Accessible.name: text
@@ -42,7 +42,7 @@ Rectangle {
             visible: bar.width >= 420
             Layout.fillWidth: true
             text: bar.playback.messagesText
-            font.pixelSize: 13
+            font.pixelSize: Theme.noteText
             color: Theme.faint
             elide: Text.ElideRight
             horizontalAlignment: Text.AlignHCenter
@@ -56,7 +56,7 @@ Rectangle {
         Text {
             objectName: "playbackState"
             text: bar.playback.stateText
-            font.pixelSize: 13
+            font.pixelSize: Theme.noteText
             font.bold: true
             color: Theme.accent
             Accessible.role: Accessible.StaticText

@@ -85,9 +85,9 @@ Popup {
                 Layout.fillWidth: true
                 objectName: "saveTitle"
                 text: qsTr("Save Snapshot")
-                font.pixelSize: 17
+                font.pixelSize: Theme.sheetTitle
                 fontSizeMode: Text.HorizontalFit
-                minimumPixelSize: 12
+                minimumPixelSize: Theme.smallText
                 font.bold: true
                 color: Theme.text
                 elide: Text.ElideRight
@@ -109,7 +109,7 @@ Popup {
             anchors.topMargin: 8
             x: 2 * Theme.margin + 4
             text: qsTr("Description")
-            font.pixelSize: 13
+            font.pixelSize: Theme.noteText
             font.bold: true
             color: Theme.faint
             Accessible.ignored: true
@@ -137,7 +137,7 @@ Popup {
             anchors.topMargin: 20
             x: 2 * Theme.margin + 4
             text: qsTr("Will be saved")
-            font.pixelSize: 13
+            font.pixelSize: Theme.noteText
             font.bold: true
             color: Theme.faint
             visible: list.count > 0
@@ -167,7 +167,7 @@ Popup {
 
                 objectName: "saveRow"
                 width: ListView.view.width
-                height: 46
+                height: Theme.entryHeight
                 Accessible.role: Accessible.ListItem
                 Accessible.name: entryText
                 Accessible.checkable: true
@@ -206,7 +206,7 @@ Popup {
                     anchors.verticalCenter: parent.verticalCenter
                     text: entry.entryText
                     textFormat: Text.PlainText
-                    font: sheet.save ? sheet.save.font : Qt.font({})
+                    font: Measures.entryFont
                     color: Theme.text
                     elide: Text.ElideRight
                     Accessible.ignored: true

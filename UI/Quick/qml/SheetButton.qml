@@ -27,7 +27,7 @@ T.AbstractButton {
         id: label
         text: button.text
         textFormat: Text.PlainText
-        font.pixelSize: 16
+        font.pixelSize: Theme.controlText
         font.bold: button.isFilled
         color: button.isFilled ? Theme.accentText : Theme.accent
         horizontalAlignment: Text.AlignHCenter

@@ -35,7 +35,7 @@ Rectangle {
                 Layout.fillWidth: true
                 text: bar.pane.status
                 textFormat: Text.PlainText
-                font: bar.pane.statusFont
+                font: Measures.statusFont
                 color: Theme.text
                 elide: Text.ElideRight
                 Accessible.role: Accessible.StaticText
@@ -47,7 +47,7 @@ Rectangle {
                 visible: text !== ""
                 text: bar.pane.reason
                 textFormat: Text.PlainText
-                font.pixelSize: 12
+                font.pixelSize: Theme.smallText
                 color: Theme.warning
                 elide: Text.ElideRight
                 Accessible.role: Accessible.StaticText

@@ -1,5 +1,6 @@
 pragma Singleton
 import QtQuick
+import Spectrel.Quick
 
 // Colours and measures of every screen, light and dark.
 QtObject {
@@ -23,6 +24,20 @@ QtObject {
     readonly property real edge: 1.5 * margin // px, from the left edge to what scrolls sideways
     readonly property real radius: 12
     readonly property real columnWidth: 760 // px, the widest that a column of rows gets
+
+    readonly property real rowHeight: Measures.rowHeight // px, of a pane
+    readonly property real entryHeight: Measures.entryHeight // px, of the save screen
+
+    // Text heights, px. The fonts of rows, status and entries are the controllers' (Measures).
+    readonly property int smallText: 12 // below a line of its own
+    readonly property int noteText: 13 // over a list, and the time line
+    readonly property int messageText: 14
+    readonly property int plainText: 15
+    readonly property int controlText: 16 // what is pressed or filled in
+    readonly property int sheetTitle: 17
+    readonly property int titleText: 18
+    readonly property int nameText: 20 // the program's
+    readonly property int rootTitle: 22
 
     readonly property int slide: 260 // ms
     readonly property int fade: 140

@@ -43,7 +43,7 @@ Item {
                 Layout.fillWidth: true
                 text: bar.pane.title
                 textFormat: Text.PlainText
-                font.pixelSize: bar.pane.isRoot ? 22 : 18
+                font.pixelSize: bar.pane.isRoot ? Theme.rootTitle : Theme.titleText
                 font.bold: true
                 color: Theme.text
                 elide: Text.ElideRight
@@ -56,7 +56,7 @@ Item {
                 visible: !bar.pane.isRoot
                 text: bar.pane.path
                 textFormat: Text.PlainText
-                font.pixelSize: 12
+                font.pixelSize: Theme.smallText
                 color: Theme.faint
                 elide: Text.ElideLeft
                 Accessible.role: Accessible.StaticText

@@ -30,7 +30,7 @@ Rectangle {
         anchors.rightMargin: 20
         text: toast.message
         textFormat: Text.PlainText
-        font.pixelSize: 14
+        font.pixelSize: Theme.messageText
         color: Theme.isDark ? "#10151c" : "#ffffff"
         elide: Text.ElideRight
         horizontalAlignment: Text.AlignHCenter
