@@ -2,6 +2,8 @@
 
 #include <cmath>
 #include <gtest/gtest.h>
+#include <string_view>
+#include <utility>
 
 namespace spectrel {
 namespace {
@@ -52,11 +54,15 @@ TEST(JourneyTest, PlacesAreAheadOrBehindByTheShorterWay)
 
 TEST(SceneTest, NamesAreThoseOfTheCommandLine)
 {
-    Scene scene = Scene::Drive;
-    EXPECT_TRUE(sceneNamed("still", scene));
-    EXPECT_EQ(scene, Scene::Still);
-    EXPECT_FALSE(sceneNamed("fly", scene));
-    EXPECT_EQ(scene, Scene::Still);
+    const std::pair<std::string_view, Scene> names[] {
+        {"still", Scene::Still}, {"walk", Scene::Walk}, {"drive", Scene::Drive}, {"stress", Scene::Stress}};
+    for (const auto& [name, wanted] : names) {
+        Scene scene = wanted == Scene::Still ? Scene::Stress : Scene::Still;
+        EXPECT_TRUE(sceneNamed(name, scene)) << name;
+        EXPECT_EQ(scene, wanted) << name;
+        EXPECT_FALSE(sceneNamed("fly", scene));
+        EXPECT_EQ(scene, wanted) << "an unknown name changes nothing";
+    }
 }
 
 TEST(PathLossTest, FollowsTheUrbanMacroCell)
