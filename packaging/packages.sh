@@ -17,7 +17,7 @@ test_packages=(
     python3-dbusmock modemmanager
     xvfb xdotool imagemagick appstream desktop-file-utils
 )
-check_packages=(shellcheck) # for ./test --all; qmllint is among the build's
+check_packages=(clang-tidy shellcheck) # for ./test --all; qmllint is among the build's
 picture_packages=(
     "${build_packages[@]}"
     python3 xvfb xdotool imagemagick optipng fonts-inter
