@@ -1,5 +1,6 @@
 // How much decoding costs beyond reading the recording, and showing beyond printing the same values.
 
+#include "Benchmarks/GoldenAnswer.h"
 #include "Benchmarks/Yardstick.h"
 #include "Monitor/SpectrelModelNode.h"
 #include "Platform/Resources.h"
@@ -110,6 +111,8 @@ void DecodeServingCells(benchmark::State& run)
     decodeAll(capture.path, proof);
     if (!capture.isWritten || shownCell(proof) != std::to_string(LastCell))
         return run.SkipWithError("wrong display");
+    if (!decodesGoldenRecordings("lte", decodeAll))
+        return run.SkipWithError("wrong display of a golden recording");
 
     const double floor = bestSeconds([&] { benchmark::DoNotOptimize(readAll(capture.path)); });
     const double formatting = bestSeconds(formatAll);

@@ -1,6 +1,7 @@
 // What a technology's records cost: a whole simulated drive against a bare read of the same file, and each log code
 // alone, with the allocations that a record takes in the steady state.
 
+#include "Benchmarks/GoldenAnswer.h"
 #include "Benchmarks/Yardstick.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Platform/Resources.h"
@@ -60,9 +61,8 @@ std::size_t readAll(const std::string& path)
     return sum;
 }
 
-void decodeAll(const std::string& path, Technology technology)
+void decodeAll(const std::string& path, Technology technology, Dictionary& state)
 {
-    Dictionary state;
     const auto generator = makeGenerator(technology);
     std::size_t count = 0;
     forEachMessage(path, [&](ByteView body) {
@@ -77,11 +77,20 @@ void decodeDrive(benchmark::State& run, Technology technology)
     const Drive drive(technology);
     if (!drive.isWritten)
         return run.SkipWithError("there is no such simulated baseband");
+    if (!decodesGoldenRecordings(technologyName(technology),
+            [technology](const std::string& path, Dictionary& state) { decodeAll(path, technology, state); }))
+        return run.SkipWithError("wrong display of a golden recording");
     const std::size_t records = forEachMessage(drive.path, [](ByteView) {});
     const double floor = bestSeconds([&] { benchmark::DoNotOptimize(readAll(drive.path)); });
     double seconds = 1e9;
     for (auto _ : run)
-        seconds = std::min(seconds, bestSeconds([&] { decodeAll(drive.path, technology); }, 1));
+        seconds = std::min(seconds,
+            bestSeconds(
+                [&] {
+                    Dictionary state;
+                    decodeAll(drive.path, technology, state);
+                },
+                1));
     run.counters["records/s"] = static_cast<double>(records) / seconds;
     run.counters["x_bare_read"] = seconds / floor;
 }

@@ -1,3 +1,4 @@
+# shellcheck shell=bash disable=SC2034
 # Sourced by ./run and ./test: which Debian packages they need, and how what is missing is installed.
 
 build_packages=(
@@ -16,6 +17,7 @@ test_packages=(
     python3-dbusmock modemmanager
     xvfb xdotool imagemagick appstream desktop-file-utils
 )
+check_packages=(clang-tidy shellcheck) # for ./test --all; qmllint is among the build's
 picture_packages=(
     "${build_packages[@]}"
     python3 xvfb xdotool imagemagick optipng fonts-inter

@@ -50,7 +50,7 @@ std::vector<DictionaryRef> cellsOf(
 
 const std::optional<Value>& PropertyListPayloads::of(RecordView record)
 {
-    const ByteView payload = record.payload();
+    const ByteView payload = recordPayload(record);
     if (!std::ranges::equal(payload, _latest)) {
         _parsed = parsePropertyList(payload);
         _latest.assign(payload.begin(), payload.end());

@@ -488,7 +488,7 @@ TEST_F(SpectrelModelTest, ExceptionOfARecordEndsTheProcess)
 {
     model.startMonitor();
     const Bytes garbage {1, 2, 3};
-    EXPECT_DEATH(ports.deliver(PortName, 0, RecordBuilder::withPayload(0xFF0000, garbage)), "");
+    EXPECT_DEATH(ports.deliver(PortName, 0, RecordBuilder::withPayload(0xFF0000, garbage)), "UnknownDataException");
 }
 
 } // namespace

@@ -167,7 +167,7 @@ FocusScope {
     }
 
     function openMenu() {
-        const current = showsCursor ? list.currentItem : null;
+        const current = showsCursor ? list.currentItem as PaneRow : null;
         const copying = current ? rowActions(current.index, current.name) : rowActions(-1, "").slice(1);
         menu.actions = [{ name: "find", text: qsTr("Find\u2026"), run: () => screen.find.open() }, ...copying,
                         { name: "about", text: qsTr("About Spectrel"), run: () => aboutPressed() }];
