@@ -7,7 +7,6 @@
 #include "Platform/Resources.h"
 #include "Records/Frame.h"
 #include "Records/Recording.h"
-#include "Telephony/RoutedCode.h"
 #include "Telephony/Simulator/SimulatedRecording.h"
 #include "Tests/Fakes/CountedAllocations.h"
 #include "Tests/Fakes/ScratchFolder.h"
