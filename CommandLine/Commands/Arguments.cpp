@@ -23,7 +23,7 @@ constexpr const char* Environment =
     "Exit status: 0 done, 1 something could not be done, 2 wrong usage.";
 
 constexpr OptionForm<OutputFormat> FormatForm {
-    "tree|json|changes|csv|none", outputFormatNamed, "is not one of tree, json, changes, csv, none"};
+    "tree|json|changes|csv|events|none", outputFormatNamed, "is not one of tree, json, changes, csv, events, none"};
 
 void addFormat(CLI::App& command, OutputFormat& format)
 {

@@ -1,5 +1,6 @@
 #include "CommandLine/Commands/Decode.h"
 
+#include "CommandLine/Output/EventOutput.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/MessageText.h"
@@ -7,6 +8,7 @@
 
 #include <cstdio>
 #include <exception>
+#include <optional>
 
 namespace spectrel {
 
@@ -21,6 +23,8 @@ public:
         , _journal(printsChanges(options.format) ? &_session.displayState().followChanges() : nullptr)
         , _output(stdout, options.format)
     {
+        if (options.format == OutputFormat::Events)
+            _events.emplace(_session.displayState(), _output);
     }
 
     int run()
@@ -29,6 +33,8 @@ public:
             if (!decodeFile(file))
                 break;
         }
+        if (_events)
+            _events->finish();
         if (!_options.each)
             _output.printDisplay(_session.display());
         saveSnapshot();
@@ -106,6 +112,7 @@ private:
     OfflineSession _session;
     Journal* const _journal; // where changes are printed
     OutputWriter _output;
+    std::optional<EventOutput> _events; // where events are printed
     std::uint64_t _n = 0;
     int _status = 0;
 };

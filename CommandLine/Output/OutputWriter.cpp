@@ -46,11 +46,12 @@ std::optional<OutputFormat> outputFormatNamed(std::string_view name)
         std::string_view name;
         OutputFormat format;
     };
-    static constexpr std::array<NamedFormat, 5> Formats {{
+    static constexpr std::array<NamedFormat, 6> Formats {{
         {"tree", OutputFormat::Tree},
         {"json", OutputFormat::Json},
         {"changes", OutputFormat::Changes},
         {"csv", OutputFormat::Csv},
+        {"events", OutputFormat::Events},
         {"none", OutputFormat::None},
     }};
     const auto* known = findRow(Formats, name, &NamedFormat::name);

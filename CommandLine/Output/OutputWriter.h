@@ -13,9 +13,9 @@
 
 namespace spectrel {
 
-enum class OutputFormat : std::uint8_t { Tree, Json, Changes, Csv, None };
+enum class OutputFormat : std::uint8_t { Tree, Json, Changes, Csv, Events, None };
 
-/// "tree", "json", "changes", "csv", "none".
+/// "tree", "json", "changes", "csv", "events", "none".
 std::optional<OutputFormat> outputFormatNamed(std::string_view name);
 
 /// Whether displays are printed as their changes.
