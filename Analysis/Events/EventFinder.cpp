@@ -72,8 +72,10 @@ void EventFinder::messageAnalysed(const AppliedMessage& message, const Journal& 
     const AnalysedChanges& changes)
 {
     reportBookmarks(message.time, message.number);
-    settleDue(message.time);
     _latest = message.number;
+    _latestTime = message.time;
+    settleDue(message.time);
+    reportReady(); // before what this message shows
     _log.read(message, journal);
     followService(message, analysis, changes);
     if (changes.surroundings)
@@ -94,6 +96,7 @@ void EventFinder::reportBookmarks(Moment time, std::uint64_t n)
     while (!_bookmarks.empty() && _bookmarks.begin()->first <= time) {
         const auto mark = _bookmarks.extract(_bookmarks.begin());
         settleDue(mark.key());
+        _latestTime = std::max(_latestTime, mark.key());
         Event event;
         event.n = n;
         event.time = mark.key();

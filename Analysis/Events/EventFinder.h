@@ -38,8 +38,22 @@ public:
     void sessionDidChange(bool isConnected, const std::string& reason, Moment time);
     /// A note that somebody made at a moment; reported before the first message that is later.
     void addBookmark(Moment time, const std::string& note);
-    /// An event that somebody else has found, at the latest message.
+    /// An event that somebody else has found, no earlier than the latest message.
     void add(Event event);
+    /// The latest message.
+    std::uint64_t latest() const
+    {
+        return _latest;
+    }
+    Moment latestTime() const
+    {
+        return _latestTime;
+    }
+    /// What speaks for causes.
+    const EvidenceLog& evidence() const
+    {
+        return _log;
+    }
     /// No more messages come: what waits is reported as it stands.
     void finish();
 
@@ -88,6 +102,7 @@ private:
     std::optional<bool> _isConnected; // to the service; none before the first session
     std::deque<Waiting> _queue;
     std::uint64_t _latest = 0; // message
+    Moment _latestTime {};
 };
 
 } // namespace spectrel

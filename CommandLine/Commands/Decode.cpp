@@ -1,6 +1,6 @@
 #include "CommandLine/Commands/Decode.h"
 
-#include "CommandLine/Output/EventOutput.h"
+#include "CommandLine/Commands/EventOutput.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/MessageText.h"
@@ -23,8 +23,8 @@ public:
         , _journal(printsChanges(options.format) ? &_session.displayState().followChanges() : nullptr)
         , _output(stdout, options.format)
     {
-        if (options.format == OutputFormat::Events)
-            _events.emplace(_session.displayState(), _output);
+        if (options.format == OutputFormat::Events || options.events.hasAlarms())
+            _events.emplace(_session.displayState(), options.events, options.format, _output);
     }
 
     int run()
@@ -38,6 +38,8 @@ public:
         if (!_options.each)
             _output.printDisplay(_session.display());
         saveSnapshot();
+        if (_options.events.until && !_events->isUntilMet())
+            fail("the alarm '" + _options.events.until->text + "' was not raised");
         if (!_output.flush())
             fail("standard output: cannot be written");
         return _status;
@@ -51,7 +53,7 @@ private:
         _status = 1;
     }
 
-    /// False when a message has ended the decoding.
+    /// False when a message or an alarm has ended the decoding.
     bool decodeFile(const std::string& path)
     {
         const bool isStandardInput = path == "-";
@@ -97,7 +99,7 @@ private:
             _output.printNumberedJson(n, _session.display());
         else if (_journal)
             _output.printChanges(n, message.time, _session.display(), *_journal);
-        return true;
+        return !_events || !_events->isUntilMet();
     }
 
     void saveSnapshot()
