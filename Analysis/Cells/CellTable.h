@@ -139,11 +139,11 @@ struct ContextRow {
 struct CellTable {
     std::string_view generator; // the class name of the generator whose display this is
     std::span<const LeafRow> leaves;
-    std::span<const ListRow> lists;
-    std::span<const ConnectionRow> connections;
-    std::span<const RegistrationRow> registration;
-    std::span<const NoServiceRow> noService;
-    ContextRow contexts;
+    std::span<const ListRow> lists {};
+    std::span<const ConnectionRow> connections {};
+    std::span<const RegistrationRow> registration {};
+    std::span<const NoServiceRow> noService {};
+    ContextRow contexts {};
     ChannelNumbering umtsNumbering = ChannelNumbering::UTRAFDD;
 };
 
