@@ -4,6 +4,7 @@
 
 #include <CLI/CLI.hpp>
 #include <iostream>
+#include <limits>
 
 namespace spectrel {
 
@@ -37,14 +38,36 @@ void addLimits(CLI::App& command, std::optional<std::uint64_t>& count, const cha
     addFormedOption(command, "--duration", duration, DurationForm, "End after this time");
 }
 
-void addCommon(CLI::App& command, Arguments& arguments)
+void addVersion(CLI::App& command)
 {
     command.set_version_flag("--version", "spectrel " SPECTREL_VERSION);
+}
+
+void addCommon(CLI::App& command, Arguments& arguments)
+{
+    addVersion(command);
     addFormedOption(
         command, "--resources", arguments.resources, FolderForm, "Take the display templates from this folder");
     addFormedOption(
         command, "--log", arguments.logFile, FileForm, "Write every system-log line to this file: <PRIORITY>TEXT");
 }
+
+std::optional<std::uint32_t> parseChannel(std::string_view text)
+{
+    const auto number = parseWholeNumber(text, 0, std::numeric_limits<std::uint32_t>::max());
+    return number ? std::optional(static_cast<std::uint32_t>(*number)) : std::nullopt;
+}
+
+std::optional<double> parseFrequency(std::string_view text)
+{
+    return parseNumber(text, 0, 1e6);
+}
+
+constexpr OptionForm<ChannelTechnology> ChannelTechnologyForm {
+    "lte|utran|gsm|cdma", channelTechnologyNamed, "is not one of lte, utran, gsm, cdma"};
+constexpr OptionForm<ChannelFormat> ChannelFormatForm {"text|json", channelFormatNamed, "is not one of text, json"};
+constexpr OptionForm<std::uint32_t> ChannelForm {"NUMBER", parseChannel, "is no channel number"};
+constexpr OptionForm<double> FrequencyForm {"FREQUENCY", parseFrequency, "is no frequency in MHz"};
 
 void addScreens(CLI::App& command, Arguments& arguments)
 {
@@ -122,9 +145,26 @@ void addRecord(CLI::App& program, Arguments& arguments)
     addLimits(command, arguments.record.count, "End after this many messages", arguments.record.duration);
 }
 
+void addChannel(CLI::App& program, Arguments& arguments)
+{
+    ChannelOptions& channel = arguments.channel;
+    CLI::App& command = *program.add_subcommand("channel", "Print the bands and frequencies of a channel number");
+    command.callback([&arguments] { arguments.job = Job::Channel; });
+    addVersion(command);
+    addFormedOption(command, "TECH", channel.technology, ChannelTechnologyForm, "Whose channel")->required();
+    addFormedOption(command, "NUMBER", channel.number, ChannelForm, "A downlink or uplink channel number");
+    addFormedOption(command, "--mhz", channel.mhz, FrequencyForm,
+        "Instead of a number: a downlink or uplink centre frequency in MHz");
+    command.add_option("--band", channel.band, "Only this band, such as 3 or 'DCS 1800'")->type_name("BAND");
+    addFormedOption(
+        command, "--format", channel.format, ChannelFormatForm, "How the bands are printed (default: text)");
+}
+
 /// What no single option can tell.
 void checkTogether(const Arguments& arguments)
 {
+    if (arguments.job == Job::Channel && arguments.channel.number.has_value() == arguments.channel.mhz.has_value())
+        throw CLI::ValidationError("channel", "takes either a channel NUMBER or --mhz FREQUENCY");
     if (arguments.decode.each && arguments.decode.format != OutputFormat::Json)
         throw CLI::ValidationError("--each", "goes with --format json only");
     const RecordingFilesOptions& files = arguments.record.files;
@@ -148,6 +188,7 @@ std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
     addDecode(program, arguments);
     addView(program, arguments);
     addRecord(program, arguments);
+    addChannel(program, arguments);
     try {
         program.parse(argc, argv);
         checkTogether(arguments);

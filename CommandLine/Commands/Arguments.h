@@ -1,5 +1,6 @@
 #pragma once
 
+#include "CommandLine/Commands/Channel.h"
 #include "CommandLine/Commands/Decode.h"
 #include "CommandLine/Commands/Record.h"
 #include "CommandLine/Commands/View.h"
@@ -14,7 +15,7 @@
 
 namespace spectrel {
 
-enum class Job : std::uint8_t { Application, Watch, Decode, View, Record };
+enum class Job : std::uint8_t { Application, Watch, Decode, View, Record, Channel };
 
 /// Which screens the application was told to open; by default it finds out by itself.
 enum class ScreenChoice : std::uint8_t { Automatic, Graphical, Terminal };
@@ -29,6 +30,7 @@ struct Arguments {
     ViewOptions view;
     WatchOptions watch;
     RecordOptions record;
+    ChannelOptions channel;
 };
 
 /// Reads the command line. An exit status when the program is done with that: after --help, --version or wrong usage,
