@@ -24,9 +24,9 @@ struct RecordedMessage {
 class RecordingReader {
 public:
     virtual ~RecordingReader() = default;
-    /// None when the file does not tell it.
+    /// None when the file does not name it.
     virtual std::optional<Technology> technology() const = 0;
-    /// False at the end and at damage; `damage` then tells which.
+    /// False at the end and at damage; `damage` then says which.
     virtual bool next(RecordedMessage& message) = 0;
     /// What ended the reading early, with the place in the file ("message 12 at byte 3481: ..."); empty at a clean end.
     virtual const std::string& damage() const = 0;
@@ -37,10 +37,10 @@ public:
     }
 };
 
-/// Opens a recording; its content tells its kind. Fails when it cannot be read or is of no known kind.
+/// Opens a recording; its content says its kind. Fails when it cannot be read or is of no known kind.
 Result<std::unique_ptr<RecordingReader>> openRecording(const std::string& path);
 
-/// Writes a capture file (classic pcap); the link type tells the technology.
+/// Writes a capture file (classic pcap); the link type names the technology.
 class RecordingWriter {
 public:
     virtual ~RecordingWriter() = default;
