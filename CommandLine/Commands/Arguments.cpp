@@ -24,11 +24,35 @@ constexpr const char* Environment =
     "Exit status: 0 done, 1 something could not be done, 2 wrong usage.";
 
 constexpr OptionForm<OutputFormat> FormatForm {
-    "tree|json|changes|csv|none", outputFormatNamed, "is not one of tree, json, changes, csv, none"};
+    "tree|json|changes|csv|table|none", outputFormatNamed, "is not one of tree, json, changes, csv, table, none"};
 
-void addFormat(CLI::App& command, OutputFormat& format)
+constexpr OptionForm<std::vector<TableColumn>> ColumnsForm {
+    "PATH[=NAME],...", parseTableColumns, "is no list of columns PATH[=NAME],..."};
+
+void addOutput(CLI::App& command, OutputOptions& output)
 {
-    addFormedOption(command, "--format", format, FormatForm, "How the display is printed (default: tree)");
+    addFormedOption(command, "--format", output.format, FormatForm, "How the display is printed (default: tree)");
+    command
+        .add_option("--path", output.paths,
+            "Print only the leaves with such a path: * stands for any text within a name, ** across names (repeatable)")
+        ->type_name("GLOB")
+        ->expected(1)
+        ->take_all()
+        ->check([](const std::string& glob) { return glob.empty() ? "'' is no path" : ""; });
+    addFormedOption(command, "--columns", output.columns, ColumnsForm,
+        "With --format table: the leaves that make its columns, and what stands above them");
+}
+
+/// What no single option can say.
+void checkOutput(const OutputOptions& output)
+{
+    const bool isTable = output.format == OutputFormat::Table;
+    if (isTable && output.columns.empty())
+        throw CLI::ValidationError("--format", "table needs --columns");
+    if (!isTable && !output.columns.empty())
+        throw CLI::ValidationError("--columns", "goes with --format table only");
+    if (isTable && !output.paths.empty())
+        throw CLI::ValidationError("--path", "a table has its --columns");
 }
 
 void addLimits(CLI::App& command, std::optional<std::uint64_t>& count, const char* what,
@@ -90,7 +114,7 @@ void addWatch(CLI::App& program, Arguments& arguments)
     CLI::App& command = *program.add_subcommand("watch", "Print the live session, once at each refresh");
     command.callback([&arguments] { arguments.job = Job::Watch; });
     addCommon(command, arguments);
-    addFormat(command, arguments.watch.format);
+    addOutput(command, arguments.watch.output);
     addLimits(command, arguments.watch.count, "End after this many refreshes", arguments.watch.duration);
 }
 
@@ -104,7 +128,7 @@ void addDecode(CLI::App& program, Arguments& arguments)
     command.add_option("FILE", decode.files, "The recordings, decoded one after the other; - is standard input")
         ->required()
         ->type_name("");
-    addFormat(command, decode.format);
+    addOutput(command, decode.output);
     command.add_flag("--each", decode.each, "With --format json: one line for each message");
     addTechnology(command, decode.technology);
     addFormedOption(command, "--snapshot", decode.snapshotDirectory, FolderForm,
@@ -165,7 +189,9 @@ void checkTogether(const Arguments& arguments)
 {
     if (arguments.job == Job::Channel && arguments.channel.number.has_value() == arguments.channel.mhz.has_value())
         throw CLI::ValidationError("channel", "takes either a channel NUMBER or --mhz FREQUENCY");
-    if (arguments.decode.each && arguments.decode.format != OutputFormat::Json)
+    checkOutput(arguments.decode.output);
+    checkOutput(arguments.watch.output);
+    if (arguments.decode.each && arguments.decode.output.format != OutputFormat::Json)
         throw CLI::ValidationError("--each", "goes with --format json only");
     const RecordingFilesOptions& files = arguments.record.files;
     if (files.target == "-" && (files.largestFile || files.longestFile || files.keep))

@@ -78,7 +78,7 @@ TEST(ReadArgumentsTest, DecodeTakesItsOptions)
         std::nullopt);
     EXPECT_EQ(arguments.job, Job::Decode);
     EXPECT_EQ(arguments.decode.files, (std::vector<std::string> {"a.pcap", "b.dlf"}));
-    EXPECT_EQ(arguments.decode.format, OutputFormat::Json);
+    EXPECT_EQ(arguments.decode.output.format, OutputFormat::Json);
     EXPECT_TRUE(arguments.decode.each);
     EXPECT_TRUE(arguments.decode.keepGoing);
     EXPECT_EQ(arguments.decode.technology, Technology::UTRAN);
@@ -90,7 +90,7 @@ TEST(ReadArgumentsTest, WatchEndsAfterACountOrATime)
     Arguments arguments;
     EXPECT_EQ(read({"watch", "--format", "changes", "--count", "3", "--duration", "2m"}, arguments), std::nullopt);
     EXPECT_EQ(arguments.job, Job::Watch);
-    EXPECT_EQ(arguments.watch.format, OutputFormat::Changes);
+    EXPECT_EQ(arguments.watch.output.format, OutputFormat::Changes);
     EXPECT_EQ(arguments.watch.count, 3u);
     EXPECT_EQ(arguments.watch.duration, std::chrono::minutes(2));
 }
@@ -149,6 +149,34 @@ TEST(ReadArgumentsTest, EmptyNameOfAFileOrFolderIsWrongUsage)
     EXPECT_EQ(complaintAbout({"view", ""}), "spectrel: FILE: '' names no file (see spectrel --help)\n");
     EXPECT_EQ(complaintAbout({"--log", ""}), "spectrel: --log: '' names no file (see spectrel --help)\n");
     EXPECT_EQ(complaintAbout({"--resources", ""}), "spectrel: --resources: '' names no folder (see spectrel --help)\n");
+}
+
+TEST(ReadArgumentsTest, PathsAndColumnsSayWhatIsPrinted)
+{
+    Arguments arguments;
+    EXPECT_EQ(read({"watch", "--path", "/A/*", "--path", "**/B", "--format", "csv"}, arguments), std::nullopt);
+    EXPECT_EQ(arguments.watch.output.paths, (std::vector<std::string> {"/A/*", "**/B"}));
+    EXPECT_EQ(read({"decode", "--path", "/A", "a.pcap"}, arguments), std::nullopt);
+    EXPECT_EQ(arguments.decode.output.paths, (std::vector<std::string> {"/A"}));
+    EXPECT_EQ(arguments.decode.files, (std::vector<std::string> {"a.pcap"}));
+    Arguments table;
+    EXPECT_EQ(read({"decode", "--format", "table", "--columns", "/A/B=b,/C", "a.pcap"}, table), std::nullopt);
+    ASSERT_EQ(table.decode.output.columns.size(), 2u);
+    EXPECT_EQ(table.decode.output.columns[0].path, "/A/B");
+    EXPECT_EQ(table.decode.output.columns[0].name, "b");
+}
+
+TEST(ReadArgumentsTest, TableAndItsColumnsComeTogether)
+{
+    EXPECT_EQ(complaintAbout({"watch", "--format", "table"}),
+        "spectrel: --format: table needs --columns (see spectrel --help)\n");
+    EXPECT_EQ(complaintAbout({"watch", "--columns", "/A"}),
+        "spectrel: --columns: goes with --format table only (see spectrel --help)\n");
+    EXPECT_EQ(complaintAbout({"watch", "--format", "table", "--columns", "/A", "--path", "/A"}),
+        "spectrel: --path: a table has its --columns (see spectrel --help)\n");
+    EXPECT_EQ(complaintAbout({"watch", "--format", "table", "--columns", "/A,"}),
+        "spectrel: --columns: '/A,' is no list of columns PATH[=NAME],... (see spectrel --help)\n");
+    EXPECT_EQ(complaintAbout({"watch", "--path", ""}), "spectrel: --path: '' is no path (see spectrel --help)\n");
 }
 
 TEST(ReadArgumentsTest, StandardOutputTakesNoOptionOfSeveralFiles)
