@@ -26,9 +26,9 @@ struct RecordedMessage {
 class RecordingReader {
 public:
     virtual ~RecordingReader() = default;
-    /// None when the file does not tell it.
+    /// None when the file does not name it.
     virtual std::optional<Technology> technology() const = 0;
-    /// False at the end and at damage; `damage` then tells which.
+    /// False at the end and at damage; `damage` then says which.
     virtual bool next(RecordedMessage& message) = 0;
     /// What ended the reading early, with the place in the file ("message 12 at byte 3481: ..."); empty at a clean end.
     virtual const std::string& damage() const = 0;
@@ -39,10 +39,10 @@ public:
     }
 };
 
-/// Opens a recording; its content tells its kind. Fails when it cannot be read or is of no known kind.
+/// Opens a recording; its content says its kind. Fails when it cannot be read or is of no known kind.
 Result<std::unique_ptr<RecordingReader>> openRecording(const std::string& path);
 
-/// Writes a capture (classic pcap); the link type tells the technology. What is written gathers until it is flushed, or
+/// Writes a capture (classic pcap); the link type names the technology. What is written gathers until it is flushed, or
 /// is much; only whole messages go out.
 class RecordingWriter {
 public:
@@ -50,7 +50,7 @@ public:
     static constexpr std::size_t MostWaiting = 8 * 1024 * 1024; // bytes
 
     virtual ~RecordingWriter() = default;
-    /// Fails where the message is not taken: it cannot be told in a capture, or the writer has failed for good, or,
+    /// Fails where the message is not taken: a capture cannot hold it, or the writer has failed for good, or,
     /// with `NoRoom`, too much waits for room already.
     virtual Outcome write(Moment time, ByteView body) = 0;
     /// Writes out what has gathered. After a failure with `NoRoom` (a full disk) the file still ends with a whole

@@ -16,7 +16,7 @@ namespace spectrel {
 
 enum class Job : std::uint8_t { Application, Watch, Decode, View, Record };
 
-/// Which screens the application was told to open; by default it finds out by itself.
+/// Which screens the application was asked to open; by default it finds out by itself.
 enum class ScreenChoice : std::uint8_t { Automatic, Graphical, Terminal };
 
 /// The command line of `spectrel`, read.
@@ -32,7 +32,7 @@ struct Arguments {
 };
 
 /// Reads the command line. An exit status when the program is done with that: after --help, --version or wrong usage,
-/// each told on the stream where it belongs.
+/// each reported on the stream where it belongs.
 std::optional<int> readArguments(int argc, char** argv, Arguments& arguments);
 
 } // namespace spectrel

@@ -15,7 +15,7 @@ struct DecodeOptions {
     OutputFormat format = OutputFormat::Tree;
     bool each = false; // with Json: one line for each message
     bool keepGoing = false; // past a message that would end the running application
-    std::optional<Technology> technology; // where a file does not tell
+    std::optional<Technology> technology; // where a file does not say
     std::optional<std::string> snapshotDirectory;
 };
 

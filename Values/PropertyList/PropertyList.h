@@ -18,7 +18,7 @@ struct PropertyListLimits {
     static constexpr std::size_t SerialisedBytes = 256 * 1024 * 1024; // a file or message, read or written
 };
 
-/// Reads a property list in its XML or its binary form; which one, the first bytes tell.
+/// Reads a property list in its XML or its binary form; which one, the first bytes decide.
 ///
 /// Strict: malformed numbers, missing values, trailing garbage and unknown elements do not parse. Keys keep the
 /// list's order; a key given twice keeps its last value.
