@@ -156,10 +156,11 @@ void addRecord(CLI::App& program, Arguments& arguments)
     addCommon(command, arguments);
     RecordingFilesOptions& files = arguments.record.files;
     addFormedOption(command, "FILE", files.target, FileForm,
-        "The capture file; an existing one is overwritten. A folder (or a new one: FOLDER/) takes numbered files, on "
-        "from those that are there. - is standard output")
+        "The capture file, a new one. A folder (or a new one: FOLDER/) takes numbered files, on from those that are "
+        "there. - is standard output")
         ->required()
         ->type_name("");
+    command.add_flag("--overwrite", files.overwrite, "Write over the capture file, where it is there");
     addFormedOption(command, "--rollover", files.largestFile, SizeForm,
         "Begin a further file before one has more bytes than this, such as 100M");
     addFormedOption(command, "--rollover-time", files.longestFile, DurationForm,
