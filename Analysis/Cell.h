@@ -105,7 +105,13 @@ struct Cell {
     {
         return origins[static_cast<std::size_t>(key)];
     }
-    /// The level that cells of the technology are compared by; none where it is not known.
+    /// What cells of the technology are compared by, where it is known of this one.
+    std::optional<Level> strengthLevel() const
+    {
+        const Level which = strengthLevelOf(technology);
+        return level(which) ? std::optional(which) : std::nullopt;
+    }
+    /// That level; none where it is not known.
     const std::optional<double>& strength() const
     {
         return level(strengthLevelOf(technology));

@@ -17,9 +17,9 @@ class Watching final : public SpectrelModelObserver {
 public:
     explicit Watching(const WatchOptions& options)
         : _options(options)
-        , _output(stdout, options.format)
+        , _output(stdout, options.output)
         , _model(_live.services(), &LogGenerator::generatorFromTechnology, *this, LiveServices::portPrefixFor("Watch"))
-        , _journal(printsChanges(options.format) ? &_model.displayState().followChanges() : nullptr)
+        , _journal(printsChanges(options.output.format) ? &_model.displayState().followChanges() : nullptr)
     {
     }
     ~Watching() override
@@ -44,10 +44,11 @@ public:
         _model.topLevelNodes(); // builds the display, and the history entry of this refresh
         const Value& display = _model.displayState().display();
         _output.printDisplay(display);
-        if (_options.format == OutputFormat::Tree)
+        if (_options.output.format == OutputFormat::Tree)
             _output.printLine("");
         if (_journal)
             _output.printChanges(_refreshes, Clock::installed().now(), display, *_journal);
+        _output.printRow(Clock::installed().now(), display);
         if (!_output.flush()) {
             report("standard output: cannot be written");
             _status = 1;

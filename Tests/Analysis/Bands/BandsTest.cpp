@@ -1,6 +1,6 @@
 #include "Analysis/Bands/Bands.h"
 
-#include "ChannelText.h"
+#include "Tests/Analysis/Bands/ChannelText.h"
 
 #include <gmock/gmock.h>
 #include <limits>
@@ -50,7 +50,7 @@ TEST(ChannelsAtMHzTest, EveryChannelLeadsBackToItself)
 {
     for (const auto numbering : {ChannelNumbering::EUTRA, ChannelNumbering::UTRAFDD, ChannelNumbering::UTRATDD,
              ChannelNumbering::GSM, ChannelNumbering::CDMA}) {
-        for (std::uint32_t number = 0; number < 300000; number += number < 30000 ? 1 : 7) {
+        for (std::uint32_t number = 0; number < 300000; number += number < 3000 ? 1 : 7) {
             for (const BandChannel& channel : bandsOfChannel(numbering, number)) {
                 const auto back = channelTexts(channelsAtMHz(numbering, channel.downlinkMHz, channel.band));
                 BandChannel down = channel;

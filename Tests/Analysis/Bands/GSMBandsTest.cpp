@@ -1,5 +1,5 @@
 #include "Analysis/Bands/Bands.h"
-#include "ChannelText.h"
+#include "Tests/Analysis/Bands/ChannelText.h"
 
 #include <gmock/gmock.h>
 #include <string>
