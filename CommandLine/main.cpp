@@ -1,4 +1,4 @@
-// spectrel: the application with its terminal screens, and the commands watch, decode, view and record.
+// spectrel: the application with its terminal screens, and the commands watch, decode, view, record and channel.
 
 #include "CommandLine/Commands/Application.h"
 #include "CommandLine/Commands/Arguments.h"
@@ -44,6 +44,8 @@ int run(const Arguments& arguments)
         return view(arguments);
     case Job::Record:
         return record(arguments.record);
+    case Job::Channel:
+        return channel(arguments.channel);
     case Job::Application:
         return runApplication(arguments);
     }
@@ -57,6 +59,8 @@ int main(int argc, char** argv)
     Arguments arguments;
     if (const auto status = readArguments(argc, argv, arguments))
         return *status;
+    if (arguments.job == Job::Channel)
+        return run(arguments); // needs neither templates nor a session
 
     std::signal(SIGXFSZ, SIG_IGN); // a file grown too large is a failed write like any other
     if (isLive(arguments.job))

@@ -34,7 +34,7 @@ public:
     virtual void updateState(Dictionary& state, ByteView data) = 0;
     /// The display dictionary, or an absent value; appends one history entry.
     virtual Value generateLogUsingState(Dictionary& state) = 0;
-    /// The property-list dictionary that tells the baseband what to stream.
+    /// The property-list dictionary that asks the baseband for what it should stream.
     virtual DictionaryRef getStartCommand() = 0;
     /// A new list of the dictionaries that a snapshot saves.
     virtual ListRef getSaveContentsFromState(const Dictionary& state) = 0;

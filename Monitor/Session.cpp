@@ -243,7 +243,7 @@ void Session::handleInvalidation(const LocalMessagePort* port)
     restart();
 }
 
-/// Tells the sink when the session came or went, or the reason for its absence has changed.
+/// Informs the sink when the session came or went, or the reason for its absence has changed.
 void Session::announceChange()
 {
     const bool isRunning = _displayUpdateTimer != nullptr;

@@ -120,7 +120,7 @@ private:
     std::string _portPrefix;
     SessionLoss _loss; // of the latest attempt to open a session
     bool _attemptHasCause = false;
-    bool _announcedRunning = false; // what the sink was told last
+    bool _announcedRunning = false; // what the sink heard last
     std::string _announcedText;
     std::string _technology;
     Lifetime _lifetime;

@@ -17,7 +17,7 @@
 
 namespace spectrel {
 
-/// Who is told of the model's news; every program that runs a session has one.
+/// Who hears of the model's news; every program that runs a session has one.
 class SpectrelModelObserver {
 public:
     virtual ~SpectrelModelObserver() = default;

@@ -1,5 +1,6 @@
 #include "Analysis/Events/EvidenceLog.h"
 
+#include "Monitor/DisplayOrder.h"
 #include "Monitor/SpectrelModelNode.h"
 
 #include <algorithm>
@@ -25,8 +26,8 @@ constexpr std::array<std::string_view, 4> GSMNeighbourKeys {"ARFCN", "BSIC", "RS
 constexpr std::array<std::string_view, 4> GSMRankingKeys {"ARFCN", "BSIC", "RSSI", "Ranking Value"};
 constexpr std::array<std::string_view, 1> UMTSStateKeys {"RRC State"};
 constexpr std::array<std::string_view, 3> UMTSActiveKeys {"Scrambling Code", "RSCP", "Energy Per Chip"};
-constexpr std::array<std::string_view, 7> UMTSRankingKeys {"Scrambling Code", "RSCP", "Energy Per Chip",
-    "Downlink Frequency", "UARFCN", "Ranking Value", "Rank Cell RSCP"};
+constexpr std::array<std::string_view, 7> UMTSRankingKeys {
+    "Scrambling Code", "RSCP", "Energy Per Chip", "Downlink Frequency", "UARFCN", "Ranking Value", "Rank Cell RSCP"};
 constexpr std::array<std::string_view, 1> StateKeys {"State"};
 constexpr std::array<std::string_view, 4> UTRANNeighbourKeys {"UARFCN", "Cell ID", "Filter RSCP", "Status"};
 
@@ -75,9 +76,15 @@ std::optional<int> positionIn(std::string_view text)
     return end.ec == std::errc() && end.ptr == text.data() + text.size() ? std::optional(number) : std::nullopt;
 }
 
+/// As the tree names what stands in the place.
+std::string_view nameIn(const Journal::Place& place, std::string_view key)
+{
+    return place.isSorted ? sortedKeyName(key) : key;
+}
+
 std::string pathOf(const Journal::Place& place)
 {
-    return place.parent ? pathByAppending(pathOf(*place.parent), place.key) : "/";
+    return place.parent ? pathByAppending(pathOf(*place.parent), nameIn(*place.parent, place.key)) : "/";
 }
 
 } // namespace
@@ -103,8 +110,7 @@ std::optional<double> EvidenceSample::number(std::string_view key) const
 Evidence EvidenceSample::evidence(std::string_view key) const
 {
     const SectionRow& row = rowOf(section);
-    const std::string container =
-        row.isList ? pathByAppending(row.path, std::to_string(entry)) : std::string(row.path);
+    const std::string container = row.isList ? pathByAppending(row.path, std::to_string(entry)) : std::string(row.path);
     return {pathByAppending(container, key), text(key), time};
 }
 
@@ -122,7 +128,7 @@ void EvidenceLog::read(const AppliedMessage& message, const Journal& journal)
         if (known->section < 0 || change.kind == Journal::Kind::Removed)
             continue;
         const auto section = static_cast<EvidenceSection>(known->section);
-        const std::size_t position = positionOf(section, journal.keyOf(change));
+        const std::size_t position = positionOf(section, nameIn(*place, journal.keyOf(change)));
         if (position < rowOf(section).keys.size())
             sampleOf(*known, message).texts[position] = journal.valueOf(change);
     }

@@ -20,11 +20,13 @@ public:
     explicit Decoding(const DecodeOptions& options)
         : _options(options)
         , _session(&LogGenerator::generatorFromTechnology, options.snapshotDirectory.has_value())
-        , _journal(printsChanges(options.format) ? &_session.displayState().followChanges() : nullptr)
-        , _output(stdout, options.format)
+        , _journal(printsChanges(options.output.format) ? &_session.displayState().followChanges() : nullptr)
+        , _output(stdout, options.output)
     {
-        if (options.format == OutputFormat::Events || options.events.hasAlarms())
-            _events.emplace(_session.displayState(), options.events, options.format, _output);
+        if (options.output.format == OutputFormat::Events || options.events.hasAlarms())
+            _events.emplace(_session.displayState(), options.events, options.output.format, _output);
+        if (options.output.format == OutputFormat::Table)
+            _session.setTickHandler([this](Moment tick) { _output.printRow(tick, _session.display()); });
     }
 
     int run()
@@ -37,6 +39,8 @@ public:
             _events->finish();
         if (!_options.each)
             _output.printDisplay(_session.display());
+        if (_session.messages() > 0)
+            _output.printRow(_session.lastTime(), _session.display());
         saveSnapshot();
         if (_options.events.until && !_events->isUntilMet())
             fail("the alarm '" + _options.events.until->text + "' was not raised");

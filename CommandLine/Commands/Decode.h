@@ -13,10 +13,10 @@ namespace spectrel {
 /// What `spectrel decode` was asked for.
 struct DecodeOptions {
     std::vector<std::string> files;
-    OutputFormat format = OutputFormat::Tree;
+    OutputOptions output;
     bool each = false; // with Json: one line for each message
     bool keepGoing = false; // past a message that would end the running application
-    std::optional<Technology> technology; // where a file does not tell
+    std::optional<Technology> technology; // where a file does not say
     std::optional<std::string> snapshotDirectory;
     EventOptions events;
 };

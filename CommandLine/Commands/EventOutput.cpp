@@ -8,20 +8,21 @@
 
 namespace spectrel {
 
-EventOutput::EventOutput(
-    DisplayState& display, const EventOptions& options, OutputFormat format, OutputWriter& output)
+EventOutput::EventOutput(DisplayState& display, const EventOptions& options, OutputFormat format, OutputWriter& output)
     : _options(options)
     , _output(output)
     , _analysis(display)
 {
+    EventListener& events = *this;
+    AlarmListener& alarms = *this;
     if (format == OutputFormat::Events) {
-        _finder.emplace(_analysis, *this);
+        _finder.emplace(_analysis, events);
         _findings.emplace(_analysis, *_finder, options.thresholds);
     }
     for (const AlarmCondition& condition : options.alarms)
-        _alarms.emplace_back(condition, _analysis, *this);
+        _alarms.emplace_back(condition, _analysis, alarms);
     if (options.until)
-        _alarms.emplace_back(*options.until, _analysis, *this);
+        _alarms.emplace_back(*options.until, _analysis, alarms);
     if (options.alarmCommand)
         _command.emplace(*options.alarmCommand);
 }

@@ -12,7 +12,7 @@ struct Arguments;
 /// What `spectrel view` was asked for.
 struct ViewOptions {
     std::string file;
-    std::optional<Technology> technology; // where the file does not tell
+    std::optional<Technology> technology; // where the file does not say
 };
 
 /// Browses a recording or a snapshot in the screens that the arguments and the surroundings ask for. No session is

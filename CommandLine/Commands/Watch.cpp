@@ -18,12 +18,12 @@ class Watching final : public SpectrelModelObserver {
 public:
     explicit Watching(const WatchOptions& options)
         : _options(options)
-        , _output(stdout, options.format)
+        , _output(stdout, options.output)
         , _model(_live.services(), &LogGenerator::generatorFromTechnology, *this, LiveServices::portPrefixFor("Watch"))
-        , _journal(printsChanges(options.format) ? &_model.displayState().followChanges() : nullptr)
+        , _journal(printsChanges(options.output.format) ? &_model.displayState().followChanges() : nullptr)
     {
-        if (options.format == OutputFormat::Events || options.events.hasAlarms())
-            _events.emplace(_model.displayState(), options.events, options.format, _output);
+        if (options.output.format == OutputFormat::Events || options.events.hasAlarms())
+            _events.emplace(_model.displayState(), options.events, options.output.format, _output);
     }
     ~Watching() override
     {
@@ -48,12 +48,13 @@ public:
         _model.topLevelNodes(); // builds the display, and the history entry of this refresh
         const Value& display = _model.displayState().display();
         _output.printDisplay(display);
-        if (_options.format == OutputFormat::Tree)
+        if (_options.output.format == OutputFormat::Tree)
             _output.printLine("");
         if (_journal)
             _output.printChanges(_refreshes, Clock::installed().now(), display, *_journal);
         if (_events)
             _events->refresh(Clock::installed().now());
+        _output.printRow(Clock::installed().now(), display);
         flush();
         if (++_refreshes == _options.count || (_events && _events->isUntilMet()))
             _live.runLoop().quit();

@@ -11,7 +11,7 @@ namespace spectrel {
 
 /// What `spectrel watch` was asked for.
 struct WatchOptions {
-    OutputFormat format = OutputFormat::Tree;
+    OutputOptions output;
     std::optional<std::uint64_t> count; // refreshes
     std::optional<std::chrono::milliseconds> duration;
     EventOptions events;

@@ -180,7 +180,7 @@ void RecordingModel::applyNext()
     _track.take();
 }
 
-/// Going the same way again tells nothing twice.
+/// Going the same way again reports nothing twice.
 void RecordingModel::tellException(const std::string& line)
 {
     if (_track.taken() >= _told) {

@@ -23,7 +23,7 @@ namespace spectrel {
 /// The state of a decoder cannot be taken back, so a place behind is reached from the start again: that costs the
 /// decoding of all before it and no memory. Long ways are gone in slices on the run loop; the tree changes on arrival.
 ///
-/// A message that would end the running application is told (`report`, `notice`) and left behind; while playing it
+/// A message that would end the running application is reported (`report`, `notice`) and left behind; while playing it
 /// also pauses, so that the moment can be looked at.
 class RecordingModel final : public MonitorModel, public Playback {
 public:

@@ -10,7 +10,7 @@
 namespace spectrel {
 namespace {
 
-/// A 0x1183 record that tells this channel, 0 to 255.
+/// A 0x1183 record with this channel, 0 to 255.
 RecordBuilder channelRecord(std::uint8_t channel)
 {
     return RecordBuilder(0x1183, 50).u8(13, channel);
