@@ -68,8 +68,8 @@ EventFinder::~EventFinder()
     _analysis.removeListener(*this);
 }
 
-void EventFinder::messageAnalysed(const AppliedMessage& message, const Journal& journal, const Analysis& analysis,
-    const AnalysedChanges& changes)
+void EventFinder::messageAnalysed(
+    const AppliedMessage& message, const Journal& journal, const Analysis& analysis, const AnalysedChanges& changes)
 {
     reportBookmarks(message.time, message.number);
     _latest = message.number;
@@ -107,8 +107,7 @@ void EventFinder::reportBookmarks(Moment time, std::uint64_t n)
     }
 }
 
-void EventFinder::followService(
-    const AppliedMessage& message, const Analysis& analysis, const AnalysedChanges& changes)
+void EventFinder::followService(const AppliedMessage& message, const Analysis& analysis, const AnalysedChanges& changes)
 {
     const Cell* const serving = analysis.serving();
     Cell stored;
@@ -117,7 +116,7 @@ void EventFinder::followService(
     auto shown = ServiceWatch::Shown::Nothing;
     if (isAnythingStored(stored))
         shown = ServiceWatch::Shown::Cell;
-    else if (changes.serving && !serving)
+    else if (analysis.isOutOfService())
         shown = ServiceWatch::Shown::NoService;
 
     const bool wasLost = _service.isLost();
@@ -183,8 +182,7 @@ void EventFinder::followStates(const AppliedMessage& message, const Analysis& an
 }
 
 /// What is known for the first time is no change, and what is not known any more is none either.
-void EventFinder::noteChange(
-    EventKind kind, std::string& known, const std::string& now, const AppliedMessage& message)
+void EventFinder::noteChange(EventKind kind, std::string& known, const std::string& now, const AppliedMessage& message)
 {
     if (now.empty() || now == known)
         return;
@@ -307,9 +305,8 @@ void EventFinder::giveUp(Radio& radio)
     if (radio.tracker.isSettling())
         radio.tracker.take();
     radio.isWaiting = false;
-    std::erase_if(_queue, [&radio](const Waiting& each) {
-        return each.radio == &radio && each.event.kind == EventKind::Cell;
-    });
+    std::erase_if(
+        _queue, [&radio](const Waiting& each) { return each.radio == &radio && each.event.kind == EventKind::Cell; });
     for (Waiting& each : _queue) {
         if (each.radio == &radio)
             each.radio = nullptr;
