@@ -1,12 +1,15 @@
 #include "CommandLine/Commands/Decode.h"
 
+#include "CommandLine/Output/CellOutput.h"
 #include "CommandLine/Program/ErrorLine.h"
+#include "CommandLine/Program/ProviderNames.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/MessageText.h"
 #include "Monitor/Viewing/OfflineSession.h"
 
 #include <cstdio>
 #include <exception>
+#include <optional>
 
 namespace spectrel {
 
@@ -23,6 +26,10 @@ public:
     {
         if (options.output.format == OutputFormat::Table)
             _session.setTickHandler([this](Moment tick) { _output.printRow(tick, _session.display()); });
+        if (printsCells(options.output.format)) {
+            _cells.emplace(_session.displayState(), _output, options.output, &_operators);
+            _session.setTickHandler([this](Moment tick) { _cells->refresh(tick); });
+        }
     }
 
     int run()
@@ -34,7 +41,7 @@ public:
         if (!_options.each)
             _output.printDisplay(_session.display());
         if (_session.messages() > 0)
-            _output.printRow(_session.lastTime(), _session.display());
+            printLast();
         saveSnapshot();
         if (!_output.flush())
             fail("standard output: cannot be written");
@@ -42,6 +49,14 @@ public:
     }
 
 private:
+    /// What ticks print, once more after the last message.
+    void printLast()
+    {
+        _output.printRow(_session.lastTime(), _session.display());
+        if (_cells)
+            _cells->refresh(_session.lastTime());
+    }
+
     void fail(const std::string& line)
     {
         _output.flush(); // what was decoded comes before the complaint
@@ -110,6 +125,8 @@ private:
     OfflineSession _session;
     Journal* const _journal; // where changes are printed
     OutputWriter _output;
+    ProviderNames _operators;
+    std::optional<CellOutput> _cells;
     std::uint64_t _n = 0;
     int _status = 0;
 };

@@ -1,13 +1,16 @@
 #include "CommandLine/Commands/Watch.h"
 
+#include "CommandLine/Output/CellOutput.h"
 #include "CommandLine/Program/CrashReport.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/LiveServices.h"
+#include "CommandLine/Program/ProviderNames.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/SpectrelModel.h"
 #include "Platform/Qt/TerminationSignals.h"
 
 #include <cstdio>
+#include <optional>
 
 namespace spectrel {
 
@@ -21,6 +24,8 @@ public:
         , _model(_live.services(), &LogGenerator::generatorFromTechnology, *this, LiveServices::portPrefixFor("Watch"))
         , _journal(printsChanges(options.output.format) ? &_model.displayState().followChanges() : nullptr)
     {
+        if (printsCells(options.output.format))
+            _cells.emplace(_model.displayState(), _output, options.output, &_operators);
     }
     ~Watching() override
     {
@@ -49,6 +54,8 @@ public:
         if (_journal)
             _output.printChanges(_refreshes, Clock::installed().now(), display, *_journal);
         _output.printRow(Clock::installed().now(), display);
+        if (_cells)
+            _cells->refresh(Clock::installed().now());
         if (!_output.flush()) {
             report("standard output: cannot be written");
             _status = 1;
@@ -70,6 +77,8 @@ private:
     OutputWriter _output;
     SpectrelModel _model;
     Journal* const _journal; // where changes are printed
+    ProviderNames _operators;
+    std::optional<CellOutput> _cells;
     std::uint64_t _refreshes = 0;
     int _status = 0;
 };
