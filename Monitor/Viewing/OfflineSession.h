@@ -17,8 +17,11 @@ namespace spectrel {
 class OfflineSession {
 public:
     /// `keepsHistory`: run the refresh ticks and keep the raw messages, as a snapshot needs them; otherwise the raw
-    /// messages are forgotten, so that memory does not grow with the recording.
-    OfflineSession(GeneratorFactory makeGenerator, bool keepsHistory);
+    /// messages are forgotten, so that memory does not grow with the recording. The clock of the context does not
+    /// count.
+    OfflineSession(GeneratorFactory makeGenerator, bool keepsHistory, const Context& context);
+    OfflineSession(const OfflineSession&) = delete;
+    OfflineSession& operator=(const OfflineSession&) = delete;
 
     /// A recording of another technology replaces the generator, as a baseband that changes its technology does.
     void useTechnology(Technology technology);

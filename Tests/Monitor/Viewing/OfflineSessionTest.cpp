@@ -50,7 +50,8 @@ protected:
     FakeResources resources;
     const ScratchFolder scratch;
     const std::string folder = scratch.path().string();
-    OfflineSession session {&LogGenerator::generatorFromTechnology, true};
+    OfflineSession session {
+        &LogGenerator::generatorFromTechnology, true, {.resources = resources, .log = log, .console = log}};
 };
 
 TEST_F(OfflineSessionTest, MessageAtTheVeryTimeOfATickComesBeforeIt)
