@@ -87,6 +87,7 @@ private:
     void applyShared(bool isMainTold);
     void applyNetwork(const Leaf& leaf);
     void applyLists(const Value& display);
+    void forgetLevelsOf(const CellList& list);
     void applyHint(CellList& list, const Value& display);
     void applyLevels(ServingTrack& track, const Value& display);
     ServingTrack& trackOf(RadioTechnology technology)

@@ -75,6 +75,7 @@ void EventFinder::messageAnalysed(
     _latest = message.number;
     _latestTime = message.time;
     settleDue(message.time);
+    reportRegistration(message.time);
     reportReady(); // before what this message shows
     _log.read(message, journal);
     followService(message, analysis, changes);
@@ -176,7 +177,11 @@ void EventFinder::followStates(const AppliedMessage& message, const Analysis& an
     const CellReport& report = analysis.report();
     if (report.connection)
         noteChange(EventKind::Connection, _connection, std::string(connectionName(*report.connection)), message);
-    noteChange(EventKind::Registration, _registration, report.registration, message);
+    if (changes.registration && !report.registration.empty()) {
+        _nextRegistration = report.registration;
+        if (!_registrationChange)
+            _registrationChange = {message.number, message.time, {}};
+    }
     if (changes.contexts)
         followContexts(report, message);
 }
@@ -193,6 +198,15 @@ void EventFinder::noteChange(EventKind kind, std::string& known, const std::stri
     event.from = before;
     event.to = now;
     push(std::move(event));
+}
+
+/// The registration is put together of what several messages of one moment tell.
+void EventFinder::reportRegistration(Moment time)
+{
+    if (!_registrationChange || time <= _registrationChange->time)
+        return;
+    noteChange(EventKind::Registration, _registration, _nextRegistration, *_registrationChange);
+    _registrationChange.reset();
 }
 
 /// Contexts of one name are told apart by their order.
@@ -270,6 +284,7 @@ void EventFinder::finish()
         else
             giveUp(*radio);
     }
+    reportRegistration(Moment::max());
     reportBookmarks(Moment::max(), _latest);
     reportReady();
 }
