@@ -17,7 +17,7 @@ import unittest
 from harness import Place
 
 GOLDEN = os.path.join(os.path.dirname(os.path.abspath(__file__)), "..", "Golden")
-FORMATS = ("json", "changes", "tree")
+FORMATS = ("json", "changes", "tree", "events")
 LONG = 200_000
 
 
