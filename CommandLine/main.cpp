@@ -1,4 +1,4 @@
-// spectrel: the application with its terminal screens, and the commands watch, decode, view and record.
+// spectrel: the application with its terminal screens, and the commands watch, decode, view, record and mark.
 
 #include "CommandLine/Commands/Application.h"
 #include "CommandLine/Commands/Arguments.h"
@@ -18,7 +18,7 @@ using namespace spectrel;
 /// A live session tells the system log, a recording that is decoded again does not.
 bool isLive(Job job)
 {
-    return job != Job::Decode && job != Job::View;
+    return job != Job::Decode && job != Job::View && job != Job::Mark;
 }
 
 std::string portPrefix(Job job)
@@ -44,6 +44,8 @@ int run(const Arguments& arguments)
         return view(arguments);
     case Job::Record:
         return record(arguments.record);
+    case Job::Mark:
+        return mark(arguments.mark);
     case Job::Application:
         return runApplication(arguments);
     }

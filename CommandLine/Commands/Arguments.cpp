@@ -1,6 +1,7 @@
 #include "CommandLine/Commands/Arguments.h"
 
 #include "CommandLine/Options/OptionTypes.h"
+#include "Records/Beside/Marks.h"
 
 #include <CLI/CLI.hpp>
 #include <iostream>
@@ -24,6 +25,15 @@ constexpr const char* Environment =
 
 constexpr OptionForm<OutputFormat> FormatForm {
     "tree|json|changes|csv|table|none", outputFormatNamed, "is not one of tree, json, changes, csv, table, none"};
+
+std::optional<std::string> parseNote(std::string_view text)
+{
+    const bool isNote = !text.empty() && text.size() <= LongestNote;
+    return isNote ? std::optional<std::string>(text) : std::nullopt;
+}
+
+constexpr OptionForm<std::string> NoteForm {"TEXT", parseNote, "is no note of 1 to 4096 bytes"};
+static_assert(LongestNote == 4096);
 
 constexpr OptionForm<std::vector<TableColumn>> ColumnsForm {
     "PATH[=NAME],...", parseTableColumns, "is no list of columns PATH[=NAME],..."};
@@ -146,6 +156,16 @@ void addRecord(CLI::App& program, Arguments& arguments)
     addLimits(command, arguments.record.count, "End after this many messages", arguments.record.duration);
 }
 
+void addMark(CLI::App& program, Arguments& arguments)
+{
+    CLI::App& command = *program.add_subcommand("mark", "Write a bookmark of this moment into a running recording");
+    command.callback([&arguments] { arguments.job = Job::Mark; });
+    addCommon(command, arguments);
+    addFormedOption(command, "TEXT", arguments.mark.note, NoteForm, "What there is to note")->required()->type_name("");
+    addFormedOption(command, "--recording", arguments.mark.recording, FileForm,
+        "The recording beside which it is written (default: that of the running recorder)");
+}
+
 /// What no single option can tell.
 void checkTogether(const Arguments& arguments)
 {
@@ -174,6 +194,7 @@ std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
     addDecode(program, arguments);
     addView(program, arguments);
     addRecord(program, arguments);
+    addMark(program, arguments);
     try {
         program.parse(argc, argv);
         checkTogether(arguments);

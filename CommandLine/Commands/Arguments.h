@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CommandLine/Commands/Decode.h"
+#include "CommandLine/Commands/Mark.h"
 #include "CommandLine/Commands/Record.h"
 #include "CommandLine/Commands/View.h"
 #include "CommandLine/Commands/Watch.h"
@@ -14,7 +15,7 @@
 
 namespace spectrel {
 
-enum class Job : std::uint8_t { Application, Watch, Decode, View, Record };
+enum class Job : std::uint8_t { Application, Watch, Decode, View, Record, Mark };
 
 /// Which screens the application was asked to open; by default it finds out by itself.
 enum class ScreenChoice : std::uint8_t { Automatic, Graphical, Terminal };
@@ -29,6 +30,7 @@ struct Arguments {
     ViewOptions view;
     WatchOptions watch;
     RecordOptions record;
+    MarkOptions mark;
 };
 
 /// Reads the command line. An exit status when the program is done with that: after --help, --version or wrong usage,

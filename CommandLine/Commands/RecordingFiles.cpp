@@ -1,5 +1,6 @@
 #include "CommandLine/Commands/RecordingFiles.h"
 
+#include "Records/Beside/Beside.h"
 #include "Records/Capture/CaptureFormat.h"
 
 #include <algorithm>
@@ -48,6 +49,14 @@ std::vector<std::pair<std::uint64_t, fs::path>> numberedFiles(const std::string&
     }
     std::ranges::sort(files);
     return files;
+}
+
+/// With what stands beside it.
+void removeRecording(const std::string& path)
+{
+    std::error_code error;
+    fs::remove(path, error);
+    removeBeside(path);
 }
 
 } // namespace
@@ -137,6 +146,8 @@ Outcome RecordingFiles::createNext(Technology technology)
         const bool isTarget = _path == _options.target;
         auto created = (isTarget ? createRecording : createNewRecording)(_path, technology);
         if (created) {
+            if (_path != "-")
+                removeBeside(_path); // of an earlier recording of this name
             _writer = *std::move(created);
             return Done();
         }
@@ -163,16 +174,15 @@ void RecordingFiles::removeOldest()
 {
     if (!_options.keep)
         return;
-    std::error_code error;
     if (_isFolder) {
         const auto files = numberedFiles(_options.target);
         for (std::size_t i = 0; i + *_options.keep < files.size(); ++i)
-            fs::remove(files[i].second, error);
+            removeRecording(files[i].second);
         return;
     }
     _written.push_back(_path);
     if (_written.size() > *_options.keep) {
-        fs::remove(_written.front(), error);
+        removeRecording(_written.front());
         _written.erase(_written.begin());
     }
 }
