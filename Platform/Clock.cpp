@@ -26,6 +26,11 @@ Clock* installedClock = &utcClock;
 
 } // namespace
 
+std::chrono::nanoseconds Clock::steady() const
+{
+    return std::chrono::steady_clock::now().time_since_epoch();
+}
+
 void Clock::install(Clock* clock)
 {
     installedClock = clock ? clock : &utcClock;

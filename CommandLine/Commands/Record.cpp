@@ -20,7 +20,7 @@ class Recorder final : public SessionSink {
 public:
     explicit Recorder(const RecordOptions& options)
         : _options(options)
-        , _files(options.files)
+        , _files(options.files, _live.clock())
         , _session(_live.services(), *this, LiveServices::portPrefixFor("Record"))
     {
     }
@@ -83,14 +83,14 @@ private:
         const auto technology = technologyOfConstant(_session.technology());
         if (!technology || _status != 0)
             return;
-        if (const auto begun = _files.begin(*technology, Clock::installed().now()); !begun)
+        if (const auto begun = _files.begin(*technology); !begun)
             fail(begun.failure().text);
     }
 
     void write(Technology technology, ByteView body)
     {
         const std::size_t before = _files.count();
-        if (const auto written = _files.write(technology, Clock::installed().now(), body); !written)
+        if (const auto written = _files.write(technology, body); !written)
             return fail(written.failure().text);
         if (before > 0 && _files.count() > before)
             report("recording into " + _files.path());
@@ -110,8 +110,8 @@ private:
     }
 
     const RecordOptions& _options;
-    RecordingFiles _files;
     LiveServices _live;
+    RecordingFiles _files;
     std::unique_ptr<LogGenerator> _generator; // for its start command: nothing is decoded
     Session _session;
     std::uint64_t _messages = 0;
