@@ -69,8 +69,8 @@ public:
     const std::string& pathOf(const Origin& origin) const;
 
 private:
-    class Reading;
-    std::unique_ptr<Reading> _reading;
+    class State;
+    std::unique_ptr<State> _state;
     std::vector<AnalysisListener*> _listeners;
 };
 
