@@ -1,5 +1,6 @@
 #include "CommandLine/Commands/Decode.h"
 
+#include "CommandLine/Commands/EventOutput.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/MessageText.h"
@@ -7,6 +8,7 @@
 
 #include <cstdio>
 #include <exception>
+#include <optional>
 
 namespace spectrel {
 
@@ -21,6 +23,8 @@ public:
         , _journal(printsChanges(options.output.format) ? &_session.displayState().followChanges() : nullptr)
         , _output(stdout, options.output)
     {
+        if (options.output.format == OutputFormat::Events || options.events.hasAlarms())
+            _events.emplace(_session.displayState(), options.events, options.output.format, _output);
         if (options.output.format == OutputFormat::Table)
             _session.setTickHandler([this](Moment tick) { _output.printRow(tick, _session.display()); });
     }
@@ -31,11 +35,15 @@ public:
             if (!decodeFile(file))
                 break;
         }
+        if (_events)
+            _events->finish();
         if (!_options.each)
             _output.printDisplay(_session.display());
         if (_session.messages() > 0)
             _output.printRow(_session.lastTime(), _session.display());
         saveSnapshot();
+        if (_options.events.until && !_events->isUntilMet())
+            fail("the alarm '" + _options.events.until->text + "' was not raised");
         if (!_output.flush())
             fail("standard output: cannot be written");
         return _status;
@@ -49,7 +57,7 @@ private:
         _status = 1;
     }
 
-    /// False when a message has ended the decoding.
+    /// False when a message or an alarm has ended the decoding.
     bool decodeFile(const std::string& path)
     {
         const bool isStandardInput = path == "-";
@@ -95,7 +103,7 @@ private:
             _output.printNumberedJson(n, _session.display());
         else if (_journal)
             _output.printChanges(n, message.time, _session.display(), *_journal);
-        return true;
+        return !_events || !_events->isUntilMet();
     }
 
     void saveSnapshot()
@@ -110,6 +118,7 @@ private:
     OfflineSession _session;
     Journal* const _journal; // where changes are printed
     OutputWriter _output;
+    std::optional<EventOutput> _events; // where events are printed
     std::uint64_t _n = 0;
     int _status = 0;
 };

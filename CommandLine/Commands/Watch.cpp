@@ -8,6 +8,7 @@
 #include "Platform/Qt/TerminationSignals.h"
 
 #include <cstdio>
+#include <optional>
 
 namespace spectrel {
 
@@ -21,6 +22,8 @@ public:
         , _model(_live.services(), &LogGenerator::generatorFromTechnology, *this, LiveServices::portPrefixFor("Watch"))
         , _journal(printsChanges(options.output.format) ? &_model.displayState().followChanges() : nullptr)
     {
+        if (options.output.format == OutputFormat::Events || options.events.hasAlarms())
+            _events.emplace(_model.displayState(), options.events, options.output.format, _output);
     }
     ~Watching() override
     {
@@ -36,6 +39,7 @@ public:
             _live.runLoop().after(*_options.duration, [this] { _live.runLoop().quit(); });
         _output.flush();
         _live.runLoop().run();
+        finish();
         return _status;
     }
 
@@ -48,28 +52,53 @@ public:
             _output.printLine("");
         if (_journal)
             _output.printChanges(_refreshes, Clock::installed().now(), display, *_journal);
+        if (_events)
+            _events->refresh(Clock::installed().now());
         _output.printRow(Clock::installed().now(), display);
-        if (!_output.flush()) {
-            report("standard output: cannot be written");
-            _status = 1;
-            _live.runLoop().quit();
-        }
-        if (++_refreshes == _options.count)
+        flush();
+        if (++_refreshes == _options.count || (_events && _events->isUntilMet()))
             _live.runLoop().quit();
     }
 
     void sessionDidChange() override
     {
+        if (_events) {
+            _events->sessionDidChange(_model.isConnected(), _model.lostReason(), Clock::installed().now());
+            flush();
+        }
         if (!_model.isConnected() && !_model.lostReason().empty())
             report("Connecting... (" + _model.lostReason() + ")");
     }
 
 private:
+    void flush()
+    {
+        if (_output.flush())
+            return;
+        report("standard output: cannot be written");
+        _status = 1;
+        _live.runLoop().quit();
+    }
+
+    void finish()
+    {
+        if (!_events)
+            return;
+        _events->finish();
+        if (!_output.flush())
+            _status = 1;
+        if (_options.events.until && !_events->isUntilMet()) {
+            report("the alarm '" + _options.events.until->text + "' was not raised");
+            _status = 1;
+        }
+    }
+
     const WatchOptions& _options;
     LiveServices _live;
     OutputWriter _output;
     SpectrelModel _model;
     Journal* const _journal; // where changes are printed
+    std::optional<EventOutput> _events; // where events are printed or alarms raised
     std::uint64_t _refreshes = 0;
     int _status = 0;
 };

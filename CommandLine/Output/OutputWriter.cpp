@@ -46,12 +46,13 @@ std::optional<OutputFormat> outputFormatNamed(std::string_view name)
         std::string_view name;
         OutputFormat format;
     };
-    static constexpr std::array<NamedFormat, 6> Formats {{
+    static constexpr std::array<NamedFormat, 7> Formats {{
         {"tree", OutputFormat::Tree},
         {"json", OutputFormat::Json},
         {"changes", OutputFormat::Changes},
         {"csv", OutputFormat::Csv},
         {"table", OutputFormat::Table},
+        {"events", OutputFormat::Events},
         {"none", OutputFormat::None},
     }};
     const auto* known = findRow(Formats, name, &NamedFormat::name);

@@ -16,9 +16,9 @@
 
 namespace spectrel {
 
-enum class OutputFormat : std::uint8_t { Tree, Json, Changes, Csv, Table, None };
+enum class OutputFormat : std::uint8_t { Tree, Json, Changes, Csv, Table, Events, None };
 
-/// "tree", "json", "changes", "csv", "table", "none".
+/// "tree", "json", "changes", "csv", "table", "events", "none".
 std::optional<OutputFormat> outputFormatNamed(std::string_view name);
 
 /// Whether displays are printed as their changes.
