@@ -1,4 +1,5 @@
-// spectrel: the application with its terminal screens, and the commands watch, decode, view, record and channel.
+// spectrel: the application with its terminal screens, and the commands watch, decode, view,
+// record, channel and report.
 
 #include "CommandLine/Commands/Application.h"
 #include "CommandLine/Commands/Arguments.h"
@@ -18,7 +19,7 @@ using namespace spectrel;
 /// A live session tells the system log, a recording that is decoded again does not.
 bool isLive(Job job)
 {
-    return job != Job::Decode && job != Job::View;
+    return job != Job::Decode && job != Job::View && job != Job::Report;
 }
 
 std::string portPrefix(Job job)
@@ -46,6 +47,8 @@ int run(const Arguments& arguments)
         return record(arguments.record);
     case Job::Channel:
         return channel(arguments.channel);
+    case Job::Report:
+        return writeReport(arguments.report);
     case Job::Application:
         return runApplication(arguments);
     }

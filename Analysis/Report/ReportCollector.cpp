@@ -38,6 +38,43 @@ void complete(Cell& known, const Cell& further)
     fill(known.bandwidthMHz, further.bandwidthMHz);
 }
 
+ReportedEvent::Mark markOf(const Event& event)
+{
+    switch (event.kind) {
+    case EventKind::Cell:
+        return event.fromCell ? ReportedEvent::Mark::Move : ReportedEvent::Mark::None;
+    case EventKind::ServiceLost:
+        return ReportedEvent::Mark::ServiceLost;
+    case EventKind::ServiceBack:
+        return ReportedEvent::Mark::ServiceBack;
+    case EventKind::Bookmark:
+    case EventKind::Alarm:
+        return ReportedEvent::Mark::Note;
+    default:
+        return ReportedEvent::Mark::None;
+    }
+}
+
+ReportedEvent reported(const Event& event)
+{
+    constexpr std::size_t MaxEvidence = 6;
+    ReportedEvent out;
+    out.time = event.time;
+    out.kind = event.kind == EventKind::Finding ? event.finding : std::string(eventKindName(event.kind));
+    out.text = event.text;
+    if (event.fromCell && event.cause) {
+        out.cause = causeKindName(event.cause->kind);
+        if (event.cause->kind == CauseKind::Reselection)
+            out.cause += ": " + std::string(causeRuleName(event.cause->rule));
+        out.causeText = event.cause->text;
+    }
+    out.seconds = event.seconds;
+    for (std::size_t i = 0; i < std::min(event.evidence.size(), MaxEvidence); ++i)
+        out.evidence.emplace_back(event.evidence[i].path, event.evidence[i].value);
+    out.mark = markOf(event);
+    return out;
+}
+
 bool isMoreThanALog(const ReportedEvent& event)
 {
     return event.mark != ReportedEvent::Mark::None;
@@ -62,9 +99,30 @@ void keep(std::vector<ReportedEvent>& kept, std::uint64_t& more, ReportedEvent e
 
 } // namespace
 
-ReportCollector::ReportCollector(ReportedRecording& recording)
+ReportCollector::ReportCollector(
+    DisplayState& display, ReportedRecording& recording, const Thresholds& thresholds, OperatorNames* operators)
     : _recording(recording)
+    , _analysis(display, operators)
+    , _finder(_analysis, static_cast<EventListener&>(*this))
+    , _findings(_analysis, _finder, thresholds)
 {
+    _analysis.addListener(*this);
+}
+
+ReportCollector::~ReportCollector()
+{
+    _analysis.removeListener(*this);
+}
+
+void ReportCollector::addBookmark(Moment time, const std::string& note)
+{
+    _finder.addBookmark(time, note);
+}
+
+void ReportCollector::finish()
+{
+    _finder.finish();
+    _findings.finish();
 }
 
 void ReportCollector::messageAnalysed(
@@ -81,14 +139,13 @@ void ReportCollector::messageAnalysed(
 
 void ReportCollector::refreshed(const CellReport&, const Analysis&) { }
 
-void ReportCollector::addEvent(ReportedEvent event)
+void ReportCollector::eventFound(const Event& event)
 {
-    keep(_recording.events, _recording.moreEvents, std::move(event), MaxEvents);
-}
-
-void ReportCollector::addFinding(ReportedEvent finding)
-{
-    keep(_recording.findings, _recording.moreFindings, std::move(finding), MaxFindings);
+    if (event.kind == EventKind::Finding)
+        keep(_recording.findings, _recording.moreFindings, reported(event), MaxFindings);
+    else
+        keep(_recording.events, _recording.moreEvents, reported(event), MaxEvents);
+    _findings.eventFound(event);
 }
 
 /// The time since the message before is the serving cell's.
