@@ -269,6 +269,30 @@ void addMark(CLI::App& program, Arguments& arguments)
         "The recording beside which it is written (default: that of the running recorder)");
 }
 
+void addReport(CLI::App& program, Arguments& arguments)
+{
+    ReportOptions& report = arguments.report;
+    CLI::App& command =
+        *program.add_subcommand("report", "Write recordings as one HTML page: levels, cells, events and findings");
+    command.callback([&arguments] { arguments.job = Job::Report; });
+    addCommon(command, arguments);
+    command
+        .add_option("FILE", report.files,
+            "The recordings. Files that `record` has numbered (drive.pcap, drive-2.pcap) are one recording; others "
+            "stand "
+            "side by side. - is standard input")
+        ->required()
+        ->type_name("");
+    addFormedOption(command, "-o,--output", report.output, FileForm,
+        "The page; a report that is there is overwritten, any other file is not. - is standard output")
+        ->required();
+    addTechnology(command, report.technology);
+    addRepeatedOption(
+        command, "--threshold", [&report](const std::string& text) { return report.thresholds.set(text); },
+        "Set what a finding depends on; may be given several times")
+        ->type_name("NAME=VALUE");
+}
+
 /// What no single option can tell.
 void checkTogether(const Arguments& arguments)
 {
@@ -301,6 +325,7 @@ std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
     addRecord(program, arguments);
     addChannel(program, arguments);
     addMark(program, arguments);
+    addReport(program, arguments);
     try {
         program.parse(argc, argv);
         checkTogether(arguments);

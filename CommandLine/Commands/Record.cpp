@@ -126,7 +126,7 @@ private:
         const auto file = recording();
         if (!file)
             return file;
-        if (auto appended = appendMark(*file, {Clock::installed().now(), note}); !appended)
+        if (auto appended = appendMark(*file, {_live.clock().now(), note}); !appended)
             return appended.failure();
         return file;
     }
