@@ -2,12 +2,16 @@
 
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/LiveServices.h"
+#include "CommandLine/Program/RecorderPort.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/Session.h"
 #include "Platform/Qt/TerminationSignals.h"
+#include "Records/Beside/Marks.h"
 #include "Records/Recording.h"
 
+#include <filesystem>
 #include <memory>
+#include <string>
 
 namespace spectrel {
 
@@ -23,6 +27,8 @@ public:
         , _files(options.files)
         , _live(context)
         , _session(_live.services(), *this, LiveServices::portPrefixFor("Record"))
+        , _marks(_live.services().ports, LiveServices::portPrefixFor("Record"),
+              {[this] { return recording(); }, [this](const std::string& note) { return mark(note); }})
     {
     }
 
@@ -103,6 +109,28 @@ private:
             _live.runLoop().quit();
     }
 
+    /// The file that is being written, for whoever asks from another folder.
+    Result<std::string> recording() const
+    {
+        if (_options.files.target == "-")
+            return Failure {"standard output is recorded to, beside which no bookmark can stand"};
+        if (_files.count() == 0)
+            return Failure {"the recorder has no file yet, for no session is open"};
+        std::error_code error;
+        const auto path = std::filesystem::absolute(_files.path(), error);
+        return error ? _files.path() : path.string();
+    }
+
+    Result<std::string> mark(const std::string& note) const
+    {
+        const auto file = recording();
+        if (!file)
+            return file;
+        if (auto appended = appendMark(*file, {Clock::installed().now(), note}); !appended)
+            return appended.failure();
+        return file;
+    }
+
     void flush()
     {
         _flushIsDue = false;
@@ -115,6 +143,7 @@ private:
     LiveServices _live;
     std::unique_ptr<LogGenerator> _generator; // for its start command: nothing is decoded
     Session _session;
+    RecorderPort _marks;
     std::uint64_t _messages = 0;
     bool _flushIsDue = false;
     int _status = 0;

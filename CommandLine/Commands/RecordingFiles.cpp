@@ -1,5 +1,6 @@
 #include "CommandLine/Commands/RecordingFiles.h"
 
+#include "Records/Beside/Beside.h"
 #include "Records/Capture/CaptureFormat.h"
 #include "Values/OwnFile.h"
 
@@ -55,14 +56,16 @@ std::vector<std::pair<std::uint64_t, fs::path>> numberedFiles(const std::string&
     return files;
 }
 
-/// A file that somebody writes is locked, and stays.
+/// With what stands beside it. A file that somebody writes is locked, and stays.
 void removeUnlessWritten(const fs::path& path)
 {
     const int file = ::open(path.c_str(), O_RDONLY | O_NOFOLLOW | O_NONBLOCK | O_CLOEXEC);
     if (file < 0)
         return;
-    if (::flock(file, LOCK_EX | LOCK_NB) == 0)
+    if (::flock(file, LOCK_EX | LOCK_NB) == 0) {
         ::unlink(path.c_str());
+        removeBeside(path.string());
+    }
     ::close(file);
 }
 
@@ -176,6 +179,8 @@ Outcome RecordingFiles::createNext(Technology technology)
         const bool mayOverwrite = isTarget && (_path == "-" || _options.overwrite || isOther(_path));
         auto created = (mayOverwrite ? createRecording : createNewRecording)(_path, technology);
         if (created) {
+            if (_path != "-")
+                removeBeside(_path); // of an earlier recording of this name
             _writer = *std::move(created);
             return Done();
         }
