@@ -65,6 +65,13 @@ void ContextRates::update(const Value& display, std::uint64_t message, Moment ti
         const auto same = std::ranges::find(before, context.name, &DataContext::name);
         if (same != before.end()) {
             const Counters& last = countersBefore[static_cast<std::size_t>(same - before.begin())];
+            if (last.time == time) { // stored twice at once
+                context.downlinkKbps = same->downlinkKbps;
+                context.uplinkKbps = same->uplinkKbps;
+                _contexts.push_back(std::move(context));
+                _counters.push_back(last);
+                continue;
+            }
             context.downlinkKbps = rate(last.received, counters.received, last.time, time);
             context.uplinkKbps = rate(last.sent, counters.sent, last.time, time);
         }

@@ -19,7 +19,7 @@ public:
     {
     }
 
-    /// The list was stored. Counters that have shrunk, and lists stored twice at once, give no rate.
+    /// The list was stored. Counters that have shrunk give no rate; a list stored twice at once keeps those it had.
     void update(const Value& display, std::uint64_t message, Moment time, PathTable& paths);
     const std::vector<DataContext>& contexts() const
     {
