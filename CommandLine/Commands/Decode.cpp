@@ -7,6 +7,7 @@
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/MessageText.h"
 #include "Monitor/Viewing/OfflineSession.h"
+#include "Records/Beside/Marks.h"
 
 #include <cstdio>
 #include <exception>
@@ -88,6 +89,8 @@ private:
             return true;
         }
         _session.useTechnology(*technology);
+        if (_options.output.format == OutputFormat::Events && !isStandardInput)
+            addBookmarks(path);
         RecordedMessage message;
         while (reader->next(message)) {
             if (!decodeMessage(file, message))
@@ -96,6 +99,15 @@ private:
         if (!reader->damage().empty())
             fail(file + ": " + reader->damage());
         return true;
+    }
+
+    void addBookmarks(const std::string& recording)
+    {
+        const Marks marks = readMarks(recording);
+        for (const Mark& mark : marks.marks)
+            _events->addBookmark(mark.time, mark.note);
+        if (!marks.damage.empty())
+            fail(marks.damage);
     }
 
     bool decodeMessage(const std::string& file, const RecordedMessage& message)
