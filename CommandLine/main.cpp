@@ -47,9 +47,9 @@ int run(const Arguments& arguments, const Context& context)
     case Job::Channel:
         return channel(arguments.channel);
     case Job::Mark:
-        return mark(arguments.mark);
+        return mark(arguments.mark, context);
     case Job::Report:
-        return writeReport(arguments.report);
+        return writeReport(arguments.report, context);
     case Job::Application:
         return runApplication(arguments, context);
     }

@@ -27,20 +27,20 @@ Result<std::string> markNamedRecording(const std::string& recording, const std::
     return recording;
 }
 
-Result<std::string> markRunning(const std::string& note)
+Result<std::string> markRunning(const std::string& note, SystemLog& log)
 {
     QtRunLoop runLoop; // which the ports need
-    SocketMessagePorts ports(Places::portDirectory());
+    SocketMessagePorts ports(Places::portDirectory(), log);
     const auto names = servedPorts(Places::portDirectory(), RecorderPort::NamePrefix, RecorderPort::NameEnding);
     return markRunningRecording(ports, names, note);
 }
 
 } // namespace
 
-int mark(const MarkOptions& options)
+int mark(const MarkOptions& options, const Context& context)
 {
-    const auto marked =
-        options.recording ? markNamedRecording(*options.recording, options.note) : markRunning(options.note);
+    const auto marked = options.recording ? markNamedRecording(*options.recording, options.note)
+                                          : markRunning(options.note, context.log);
     report(marked ? marksPath(*marked) + ": one more bookmark" : marked.failure().text);
     return marked ? ExitStatus::Done : ExitStatus::Failed;
 }

@@ -27,10 +27,10 @@ constexpr std::size_t MaxRemarks = 10; // of a recording
 /// Plays one recording, which may be several files, and gathers what the report shows of it.
 class RecordingAnalysis {
 public:
-    RecordingAnalysis(const ReportOptions& options, ReportedRecording& recording)
+    RecordingAnalysis(const ReportOptions& options, ReportedRecording& recording, const Context& context)
         : _options(options)
         , _recording(recording)
-        , _session(&LogGenerator::generatorFromTechnology, false)
+        , _session(&LogGenerator::generatorFromTechnology, false, context)
         , _collector(_session.displayState(), recording, options.thresholds, nullptr)
     {
     }
@@ -146,7 +146,7 @@ std::string recordingOfFile(std::string_view path)
     return (file.parent_path() / stem).string();
 }
 
-int writeReport(const ReportOptions& options)
+int writeReport(const ReportOptions& options, const Context& context)
 {
     RecordingInputs opened = openRecordings(options.files);
     for (const std::string& failure : opened.failures)
@@ -156,7 +156,7 @@ int writeReport(const ReportOptions& options)
     for (std::vector<RecordingInput>& files : recordingsOf(std::move(opened.inputs))) {
         ReportedRecording& recording = recordings.emplace_back();
         recording.title = titleOf(files);
-        RecordingAnalysis analysis(options, recording);
+        RecordingAnalysis analysis(options, recording, context);
         for (RecordingInput& file : files)
             analysis.play(file);
         isWhole = analysis.finish() && isWhole;
