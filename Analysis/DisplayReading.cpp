@@ -381,6 +381,8 @@ void DisplayReading::applyLists(const Value& display)
     bool isHinted = false;
     for (CellList* list : _touchedLists) {
         _changes.surroundings = true;
+        if (list->row().serving != ServingHint::None)
+            forgetLevelsOf(*list);
         const ListRow& row = list->row();
         if (!row.onlyWithout.empty()) {
             const Value* const other = valueAt(display, row.onlyWithout);
@@ -394,6 +396,19 @@ void DisplayReading::applyLists(const Value& display)
         applyLevels(_main, display);
     if (isHinted || !_toldData.empty())
         applyLevels(_data, display);
+}
+
+/// The list no longer holds what the serving cell's levels were taken from.
+void DisplayReading::forgetLevelsOf(const CellList& list)
+{
+    ServingTrack& track = trackOf(list.row().technology);
+    for (std::size_t level = 0; level < LevelCount; ++level) {
+        const Origin& origin = track.cell().origin(cellKeyOf(static_cast<Level>(level)));
+        const std::string& path = _paths.pathOf(origin.path);
+        if (path.size() > list.row().container.size() && path.starts_with(list.row().container)
+            && path[list.row().container.size()] == '/')
+            track.forgetLevel(static_cast<Level>(level));
+    }
 }
 
 void DisplayReading::applyHint(CellList& list, const Value& display)

@@ -34,6 +34,10 @@ public:
     {
         return _main.isKnown() && !_isOutOfService ? &_main.cell() : nullptr;
     }
+    bool isOutOfService() const
+    {
+        return _isOutOfService;
+    }
     /// EV-DO's sector; null while none is known.
     const Cell* dataSector() const
     {
@@ -83,6 +87,7 @@ private:
     void applyShared(bool isMainTold);
     void applyNetwork(const Leaf& leaf);
     void applyLists(const Value& display);
+    void forgetLevelsOf(const CellList& list);
     void applyHint(CellList& list, const Value& display);
     void applyLevels(ServingTrack& track, const Value& display);
     ServingTrack& trackOf(RadioTechnology technology)

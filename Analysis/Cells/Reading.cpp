@@ -54,9 +54,15 @@ std::optional<double> rxlev(double value)
     return level ? std::optional(*level - 110) : std::nullopt;
 }
 
+/// Six decimals are shown, so that the level comes out a little off.
 std::optional<double> filteredRSCP(double value)
 {
-    const auto level = wholeWithin(value * 256, 0, 91);
+    constexpr double Inexactness = 256 * 1e-6;
+    const double scaled = value * 256;
+    const double nearest = std::round(scaled);
+    if (std::abs(scaled - nearest) > Inexactness)
+        return std::nullopt;
+    const auto level = wholeWithin(nearest, 0, 91);
     return level ? std::optional(*level - 116) : std::nullopt;
 }
 

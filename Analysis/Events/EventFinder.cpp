@@ -68,13 +68,14 @@ EventFinder::~EventFinder()
     _analysis.removeListener(*this);
 }
 
-void EventFinder::messageAnalysed(const AppliedMessage& message, const Journal& journal, const Analysis& analysis,
-    const AnalysedChanges& changes)
+void EventFinder::messageAnalysed(
+    const AppliedMessage& message, const Journal& journal, const Analysis& analysis, const AnalysedChanges& changes)
 {
     reportBookmarks(message.time, message.number);
     _latest = message.number;
     _latestTime = message.time;
     settleDue(message.time);
+    reportRegistration(message.time);
     reportReady(); // before what this message shows
     _log.read(message, journal);
     followService(message, analysis, changes);
@@ -107,8 +108,7 @@ void EventFinder::reportBookmarks(Moment time, std::uint64_t n)
     }
 }
 
-void EventFinder::followService(
-    const AppliedMessage& message, const Analysis& analysis, const AnalysedChanges& changes)
+void EventFinder::followService(const AppliedMessage& message, const Analysis& analysis, const AnalysedChanges& changes)
 {
     const Cell* const serving = analysis.serving();
     Cell stored;
@@ -117,7 +117,7 @@ void EventFinder::followService(
     auto shown = ServiceWatch::Shown::Nothing;
     if (isAnythingStored(stored))
         shown = ServiceWatch::Shown::Cell;
-    else if (changes.serving && !serving)
+    else if (analysis.isOutOfService())
         shown = ServiceWatch::Shown::NoService;
 
     const bool wasLost = _service.isLost();
@@ -177,14 +177,17 @@ void EventFinder::followStates(const AppliedMessage& message, const Analysis& an
     const CellReport& report = analysis.report();
     if (report.connection)
         noteChange(EventKind::Connection, _connection, std::string(connectionName(*report.connection)), message);
-    noteChange(EventKind::Registration, _registration, report.registration, message);
+    if (changes.registration && !report.registration.empty()) {
+        _nextRegistration = report.registration;
+        if (!_registrationChange)
+            _registrationChange = {message.number, message.time, {}};
+    }
     if (changes.contexts)
         followContexts(report, message);
 }
 
 /// What is known for the first time is no change, and what is not known any more is none either.
-void EventFinder::noteChange(
-    EventKind kind, std::string& known, const std::string& now, const AppliedMessage& message)
+void EventFinder::noteChange(EventKind kind, std::string& known, const std::string& now, const AppliedMessage& message)
 {
     if (now.empty() || now == known)
         return;
@@ -195,6 +198,15 @@ void EventFinder::noteChange(
     event.from = before;
     event.to = now;
     push(std::move(event));
+}
+
+/// The registration is put together of what several messages of one moment tell.
+void EventFinder::reportRegistration(Moment time)
+{
+    if (!_registrationChange || time <= _registrationChange->time)
+        return;
+    noteChange(EventKind::Registration, _registration, _nextRegistration, *_registrationChange);
+    _registrationChange.reset();
 }
 
 /// Contexts of one name are told apart by their order.
@@ -272,6 +284,7 @@ void EventFinder::finish()
         else
             giveUp(*radio);
     }
+    reportRegistration(Moment::max());
     reportBookmarks(Moment::max(), _latest);
     reportReady();
 }
@@ -307,9 +320,8 @@ void EventFinder::giveUp(Radio& radio)
     if (radio.tracker.isSettling())
         radio.tracker.take();
     radio.isWaiting = false;
-    std::erase_if(_queue, [&radio](const Waiting& each) {
-        return each.radio == &radio && each.event.kind == EventKind::Cell;
-    });
+    std::erase_if(
+        _queue, [&radio](const Waiting& each) { return each.radio == &radio && each.event.kind == EventKind::Cell; });
     for (Waiting& each : _queue) {
         if (each.radio == &radio)
             each.radio = nullptr;

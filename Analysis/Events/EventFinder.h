@@ -77,8 +77,9 @@ private:
     void followStates(const AppliedMessage& message, const Analysis& analysis, const AnalysedChanges& changes);
     void followContexts(const CellReport& report, const AppliedMessage& message);
     void noteChange(EventKind kind, std::string& known, const std::string& now, const AppliedMessage& message);
-    void noteContext(const std::string& name, const std::string& from, const std::string& to,
-        const AppliedMessage& message);
+    void reportRegistration(Moment time);
+    void noteContext(
+        const std::string& name, const std::string& from, const std::string& to, const AppliedMessage& message);
 
     void settleDue(Moment time);
     void settle(Radio& radio);
@@ -97,6 +98,8 @@ private:
     std::string _plmn;
     std::string _connection;
     std::string _registration;
+    std::optional<AppliedMessage> _registrationChange; // the first message of those at one moment that tell of another
+    std::string _nextRegistration;
     std::optional<Texts> _contexts; // states by name; none before they were seen first
     std::multimap<Moment, std::string> _bookmarks; // to come
     std::optional<bool> _isConnected; // to the service; none before the first session

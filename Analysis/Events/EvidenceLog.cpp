@@ -151,6 +151,14 @@ const EvidenceSample* EvidenceLog::latestWith(EvidenceSection section, std::stri
     return found == all.rend() ? nullptr : &*found;
 }
 
+const EvidenceSample* EvidenceLog::latestOlder(EvidenceSection section, std::string_view key, Moment time) const
+{
+    const Samples& all = samples(section);
+    const auto found = std::find_if(all.rbegin(), all.rend(),
+        [&](const EvidenceSample& each) { return each.time < time && !each.text(key).empty(); });
+    return found == all.rend() ? nullptr : &*found;
+}
+
 const EvidenceLog::Known& EvidenceLog::lookUp(const Journal::PlaceRef& place)
 {
     const auto [found, isNew] = _known.try_emplace(place.get());

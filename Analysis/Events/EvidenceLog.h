@@ -72,6 +72,8 @@ public:
     }
     /// The latest sample before the message; null where there is none.
     const EvidenceSample* latestBefore(EvidenceSection section, std::uint64_t n) const;
+    /// The latest sample with a text under the key of messages that are older than the time.
+    const EvidenceSample* latestOlder(EvidenceSection section, std::string_view key, Moment time) const;
     /// The latest text under the key, before or in the message.
     const EvidenceSample* latestWith(EvidenceSection section, std::string_view key, std::uint64_t upTo) const;
 

@@ -7,6 +7,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <initializer_list>
+#include <map>
 #include <numeric>
 #include <string_view>
 
@@ -128,10 +129,11 @@ void appendEvidence(const ReportedEvent& event, std::string& out)
 {
     if (event.evidence.empty())
         return;
-    out += "<ul>";
+    out += "<br><small>";
     for (const auto& [path, value] : event.evidence)
-        out += "<li><code>" + escaped(path) + "</code> " + escaped(value) + "</li>";
-    out += "</ul>";
+        out += "<code>" + escaped(path) + "</code> " + escaped(value) + "; ";
+    out.resize(out.size() - 2);
+    out += "</small>";
 }
 
 void appendEventRow(const ReportedEvent& event, std::string& out)
@@ -160,14 +162,28 @@ void appendEventTable(
     }
 }
 
+/// "ping-pong 9, hole 6".
+std::string countsText(const std::vector<ReportedEvent>& events)
+{
+    std::map<std::string, std::size_t> counts;
+    for (const ReportedEvent& event : events)
+        ++counts[event.kind];
+    std::string out;
+    for (const auto& [kind, count] : counts)
+        out += (out.empty() ? "" : ", ") + escaped(kind) + " " + std::to_string(count);
+    return out;
+}
+
 } // namespace
 
 void appendFindings(const ReportedRecording& recording, std::string& out)
 {
     if (recording.findings.empty())
         out += "<p>Nothing remarkable in " + escaped(recording.title) + ".</p>\n";
-    else
+    else {
+        out += "<p>" + countsText(recording.findings) + "</p>\n";
         appendEventTable(recording.title, recording.findings, recording.moreFindings, out);
+    }
 }
 
 void appendOverview(const std::vector<ReportedRecording>& recordings, std::string& out)

@@ -25,8 +25,8 @@ constexpr const char* Environment =
     "  NO_COLOR                no colours in the terminal screens\n"
     "Exit status: 0 done, 1 something could not be done, 2 wrong usage.";
 
-constexpr OptionForm<OutputFormat> FormatForm {"tree|json|changes|csv|table|events|none", outputFormatNamed,
-    "is not one of tree, json, changes, csv, table, events, none"};
+constexpr OptionForm<OutputFormat> FormatForm {"tree|json|changes|csv|table|cells|summary|events|none",
+    outputFormatNamed, "is not one of tree, json, changes, csv, table, cells, summary, events, none"};
 
 constexpr OptionForm<std::string> CommandForm {"COMMAND",
     [](std::string_view text) { return text.empty() ? std::nullopt : std::optional<std::string>(text); },
@@ -34,6 +34,8 @@ constexpr OptionForm<std::string> CommandForm {"COMMAND",
 
 constexpr OptionForm<std::vector<TableColumn>> ColumnsForm {
     "PATH[=NAME],...", parseTableColumns, "is no list of columns PATH[=NAME],..."};
+
+constexpr OptionForm<TimeForm> TimeFormForm {"seconds|rfc3339", timeFormNamed, "is not one of seconds, rfc3339"};
 
 void addOutput(CLI::App& command, OutputOptions& output)
 {
@@ -47,6 +49,9 @@ void addOutput(CLI::App& command, OutputOptions& output)
         ->check([](const std::string& glob) { return glob.empty() ? "'' is no path" : ""; });
     addFormedOption(command, "--columns", output.columns, ColumnsForm,
         "With --format table: the leaves that make its columns, and what stands above them");
+    addFormedOption(command, "--time", output.time, TimeFormForm,
+        "How times are printed: seconds since 1970 (default), or as 2024-03-05T14:07:31.123456Z");
+    command.add_flag("--sources", output.withSources, "With --format cells: where in the tree each value comes from");
 }
 
 /// What no single option can say.
@@ -59,6 +64,10 @@ void checkOutput(const OutputOptions& output)
         throw CLI::ValidationError("--columns", "goes with --format table only");
     if (isTable && !output.paths.empty())
         throw CLI::ValidationError("--path", "a table has its --columns");
+    if (printsCells(output.format) && !output.paths.empty())
+        throw CLI::ValidationError("--path", "chooses leaves, of which cells and summary print none");
+    if (output.withSources && output.format != OutputFormat::Cells)
+        throw CLI::ValidationError("--sources", "goes with --format cells only");
 }
 
 /// Several may be given. The reader throws what makes the option wrong usage.

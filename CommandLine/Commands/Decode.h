@@ -2,6 +2,7 @@
 
 #include "CommandLine/Commands/EventOutput.h"
 #include "CommandLine/Output/OutputWriter.h"
+#include "Platform/Context.h"
 #include "Records/Recording.h"
 
 #include <optional>
@@ -23,6 +24,6 @@ struct DecodeOptions {
 
 /// Decodes the recordings one after the other, as one session, and prints the display to standard output. Answers the
 /// program's exit status.
-int decode(const DecodeOptions& options);
+int decode(const DecodeOptions& options, const Context& context);
 
 } // namespace spectrel

@@ -8,14 +8,16 @@
 
 namespace spectrel {
 
-EventOutput::EventOutput(DisplayState& display, const EventOptions& options, OutputFormat format, OutputWriter& output)
+EventOutput::EventOutput(DisplayState& display, const EventOptions& options, const OutputOptions& output,
+    OutputWriter& writer, OperatorNames* operators)
     : _options(options)
-    , _output(output)
-    , _analysis(display)
+    , _time(output.time)
+    , _output(writer)
+    , _analysis(display, operators)
 {
     EventListener& events = *this;
     AlarmListener& alarms = *this;
-    if (format == OutputFormat::Events) {
+    if (output.format == OutputFormat::Events) {
         _finder.emplace(_analysis, events);
         _findings.emplace(_analysis, *_finder, options.thresholds);
     }
@@ -50,7 +52,7 @@ void EventOutput::finish()
 void EventOutput::eventFound(const Event& event)
 {
     std::string line;
-    appendEventJson(event, line);
+    appendEventJson(event, _time, line);
     _output.printLine(line);
     if (_findings)
         _findings->eventFound(event);
@@ -74,7 +76,7 @@ void EventOutput::runCommand(const Event& event)
     if (!_command)
         return;
     std::string line;
-    appendEventJson(event, line);
+    appendEventJson(event, _time, line);
     if (const Outcome started = _command->run(line); !started)
         report("the alarm's command cannot be run: " + started.failure().text);
 }

@@ -35,8 +35,9 @@ struct EventOptions {
 /// are noticed: each is a line on standard error, with a bell where that is a terminal.
 class EventOutput final : private EventListener, private AlarmListener {
 public:
-    /// All are there for as long as this is.
-    EventOutput(DisplayState& display, const EventOptions& options, OutputFormat format, OutputWriter& output);
+    /// All are there for as long as this is; the names may be null.
+    EventOutput(DisplayState& display, const EventOptions& options, const OutputOptions& output, OutputWriter& writer,
+        OperatorNames* operators);
 
     /// The live session was lost, or is there again.
     void sessionDidChange(bool isConnected, const std::string& reason, Moment time);
@@ -60,6 +61,7 @@ private:
     void runCommand(const Event& event);
 
     const EventOptions& _options;
+    const TimeForm _time;
     OutputWriter& _output;
     Analysis _analysis;
     std::optional<EventFinder> _finder; // where events are printed

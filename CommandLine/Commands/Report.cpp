@@ -6,6 +6,7 @@
 #include "CommandLine/Output/ReportFile.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/ExitStatus.h"
+#include "CommandLine/Program/ProviderNames.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/MessageText.h"
 #include "Monitor/Viewing/OfflineSession.h"
@@ -27,11 +28,12 @@ constexpr std::size_t MaxRemarks = 10; // of a recording
 /// Plays one recording, which may be several files, and gathers what the report shows of it.
 class RecordingAnalysis {
 public:
-    RecordingAnalysis(const ReportOptions& options, ReportedRecording& recording)
+    RecordingAnalysis(
+        const ReportOptions& options, ReportedRecording& recording, OperatorNames& operators, const Context& context)
         : _options(options)
         , _recording(recording)
-        , _session(&LogGenerator::generatorFromTechnology, false)
-        , _collector(_session.displayState(), recording, options.thresholds, nullptr)
+        , _session(&LogGenerator::generatorFromTechnology, false, context)
+        , _collector(_session.displayState(), recording, options.thresholds, &operators)
     {
     }
 
@@ -146,17 +148,18 @@ std::string recordingOfFile(std::string_view path)
     return (file.parent_path() / stem).string();
 }
 
-int writeReport(const ReportOptions& options)
+int writeReport(const ReportOptions& options, const Context& context)
 {
     RecordingInputs opened = openRecordings(options.files);
     for (const std::string& failure : opened.failures)
         report(failure);
     bool isWhole = opened.failures.empty();
+    ProviderNames operators;
     std::vector<ReportedRecording> recordings;
     for (std::vector<RecordingInput>& files : recordingsOf(std::move(opened.inputs))) {
         ReportedRecording& recording = recordings.emplace_back();
         recording.title = titleOf(files);
-        RecordingAnalysis analysis(options, recording);
+        RecordingAnalysis analysis(options, recording, operators, context);
         for (RecordingInput& file : files)
             analysis.play(file);
         isWhole = analysis.finish() && isWhole;

@@ -1,8 +1,10 @@
 #include "CommandLine/Commands/Watch.h"
 
+#include "CommandLine/Output/CellOutput.h"
 #include "CommandLine/Program/CrashReport.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/LiveServices.h"
+#include "CommandLine/Program/ProviderNames.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/SpectrelModel.h"
 #include "Platform/Qt/TerminationSignals.h"
@@ -16,14 +18,17 @@ namespace {
 
 class Watching final : public SpectrelModelObserver {
 public:
-    explicit Watching(const WatchOptions& options)
+    Watching(const WatchOptions& options, const Context& context)
         : _options(options)
+        , _live(context)
         , _output(stdout, options.output)
         , _model(_live.services(), &LogGenerator::generatorFromTechnology, *this, LiveServices::portPrefixFor("Watch"))
         , _journal(printsChanges(options.output.format) ? &_model.displayState().followChanges() : nullptr)
     {
         if (options.output.format == OutputFormat::Events || options.events.hasAlarms())
-            _events.emplace(_model.displayState(), options.events, options.output.format, _output);
+            _events.emplace(_model.displayState(), options.events, options.output, _output, &_operators);
+        if (printsCells(options.output.format))
+            _cells.emplace(_model.displayState(), _output, options.output, &_operators);
     }
     ~Watching() override
     {
@@ -32,7 +37,7 @@ public:
 
     int run()
     {
-        Ending::install(_model.displayState(), {});
+        Ending::install(_model.displayState(), _live.context(), {});
         const TerminationSignals terminationSignals([this](int) { _live.runLoop().quit(); });
         _live.runLoop().async([this] { _model.restartMonitor(); });
         if (_options.duration)
@@ -51,10 +56,12 @@ public:
         if (_options.output.format == OutputFormat::Tree)
             _output.printLine("");
         if (_journal)
-            _output.printChanges(_refreshes, Clock::installed().now(), display, *_journal);
+            _output.printChanges(_refreshes, _live.clock().now(), display, *_journal);
+        _output.printRow(_live.clock().now(), display);
+        if (_cells)
+            _cells->refresh(_live.clock().now());
         if (_events)
-            _events->refresh(Clock::installed().now());
-        _output.printRow(Clock::installed().now(), display);
+            _events->refresh(_live.clock().now());
         flush();
         if (++_refreshes == _options.count || (_events && _events->isUntilMet()))
             _live.runLoop().quit();
@@ -63,7 +70,7 @@ public:
     void sessionDidChange() override
     {
         if (_events) {
-            _events->sessionDidChange(_model.isConnected(), _model.lostReason(), Clock::installed().now());
+            _events->sessionDidChange(_model.isConnected(), _model.lostReason(), _live.clock().now());
             flush();
         }
         if (!_model.isConnected() && !_model.lostReason().empty())
@@ -98,6 +105,8 @@ private:
     OutputWriter _output;
     SpectrelModel _model;
     Journal* const _journal; // where changes are printed
+    ProviderNames _operators;
+    std::optional<CellOutput> _cells;
     std::optional<EventOutput> _events; // where events are printed or alarms raised
     std::uint64_t _refreshes = 0;
     int _status = 0;
@@ -105,9 +114,9 @@ private:
 
 } // namespace
 
-int watch(const WatchOptions& options)
+int watch(const WatchOptions& options, const Context& context)
 {
-    return Watching(options).run();
+    return Watching(options, context).run();
 }
 
 } // namespace spectrel

@@ -160,18 +160,17 @@ int serve(ServiceOptions& options)
     ServiceManager manager;
     QtRunLoop runLoop;
     QtClock clock;
-    Clock::install(&clock);
     const std::string folder = Places::portDirectory();
     if (const auto prepared = SocketMessagePorts::prepareDirectory(folder, TelephonyProtocol::ServicePort); !prepared)
         return fail(prepared.failure().of("the message ports' folder cannot be had").text);
-    SocketMessagePorts ports(folder);
+    SocketMessagePorts ports(folder, SystemLog::none());
     if (const auto adopted = adoptSocket(manager, ports); !adopted)
         return fail(adopted.failure().text);
     const auto made = makeSource(options, runLoop, clock);
     if (!made)
         return fail(made.failure().text);
     LogSource& source = **made;
-    TelephonyService service(runLoop, ports, source);
+    TelephonyService service(runLoop, clock, ports, source);
     if (!service.start())
         return fail("cannot take the telephony service's port in " + folder + ": another service runs there");
     StatusReport report(clock, service, source);

@@ -3,6 +3,8 @@
 #include "Values/Table.h"
 
 #include <array>
+#include <limits>
+#include <utility>
 
 namespace spectrel {
 
@@ -26,7 +28,6 @@ struct ShownMode {
 constexpr auto LongestChange = 10s;
 
 constexpr std::string_view GSMDedicated = "RR_DATA_TRANSFER";
-constexpr std::string_view GSMReselecting = "RR_CELL_RESELECTION";
 
 struct ChangeState {
     std::string_view state;
@@ -68,40 +69,54 @@ ShownMode lteMode(const EvidenceLog& log, std::uint64_t before)
                           : modeWhere(connected, "Serving Physical Cell ID", true);
 }
 
-ShownMode umtsMode(const EvidenceLog& log, std::uint64_t upTo)
+/// Where the state is reported each time it changes, the one up to the move's message counts.
+const EvidenceSample* promptState(
+    const EvidenceLog& log, EvidenceSection section, std::string_view key, const CellMove& move)
 {
-    const auto* const umts = log.latestWith(EvidenceSection::UMTSState, "RRC State", upTo);
-    const auto* const utran = log.latestWith(EvidenceSection::UTRANState, "State", upTo);
+    return log.latestWith(section, key, move.n);
+}
+
+/// Where it is only reported every now and then, the one shown before the move does: the move came between the two.
+const EvidenceSample* regularState(const EvidenceLog& log, EvidenceSection section, const CellMove& move)
+{
+    const auto* const before = log.latestOlder(section, "State", move.time);
+    return before ? before : log.latestWith(section, "State", move.n);
+}
+
+ShownMode umtsMode(const EvidenceLog& log, const CellMove& move)
+{
+    const auto* const umts = promptState(log, EvidenceSection::UMTSState, "RRC State", move);
+    const auto* const utran = regularState(log, EvidenceSection::UTRANState, move);
     if (later(umts, utran) == umts)
         return modeWhere(umts, "RRC State", umts && umts->text("RRC State") == "CELL_DCH");
     return modeWhere(utran, "State", utran->text("State") == "Cell DCH");
 }
 
 /// A packet transfer is no channel of its own: the phone reselects during it.
-ShownMode gsmMode(const EvidenceLog& log, std::uint64_t upTo)
+ShownMode gsmMode(const EvidenceLog& log, const CellMove& move)
 {
-    const auto* const rr = log.latestWith(EvidenceSection::GSMState, "RR State", upTo);
-    const auto* const call = log.latestWith(EvidenceSection::CallState, "State", upTo);
+    const auto* const rr = promptState(log, EvidenceSection::GSMState, "RR State", move);
+    const auto* const call = regularState(log, EvidenceSection::CallState, move);
     if (call && later(rr, call) == call)
         return modeWhere(call, "State", call->text("State") == "Active");
     return modeWhere(rr, "RR State", rr && rr->text("RR State") == GSMDedicated && rr->text("RR Mode") != "Data");
 }
 
-ShownMode modeOn(RadioTechnology technology, const EvidenceLog& log, std::uint64_t n)
+ShownMode modeOn(RadioTechnology technology, const EvidenceLog& log, const CellMove& move)
 {
     switch (technology) {
     case RadioTechnology::LTE:
-        return lteMode(log, n);
+        return lteMode(log, move.n);
     case RadioTechnology::UMTS:
-        return umtsMode(log, n);
+        return umtsMode(log, move);
     case RadioTechnology::GSM:
-        return gsmMode(log, n);
+        return gsmMode(log, move);
     case RadioTechnology::CDMA: {
-        const auto* const state = log.latestWith(EvidenceSection::OneXState, "State", n);
+        const auto* const state = regularState(log, EvidenceSection::OneXState, move);
         return modeWhere(state, "State", state && state->text("State").starts_with("Traffic"));
     }
     case RadioTechnology::EVDO: {
-        const auto* const state = log.latestWith(EvidenceSection::EVDOState, "State", n);
+        const auto* const state = regularState(log, EvidenceSection::EVDOState, move);
         return modeWhere(state, "State", state && state->text("State").starts_with("Connected"));
     }
     }
@@ -126,7 +141,7 @@ MoveManner announced(const EvidenceLog& log, const CellMove& move, const std::ar
 MoveManner withinSystem(const EvidenceLog& log, const CellMove& move)
 {
     const RadioTechnology technology = move.from->technology;
-    ShownMode shown = modeOn(technology, log, move.n);
+    ShownMode shown = modeOn(technology, log, move);
     switch (shown.mode) {
     case Mode::Own:
         return {CauseKind::Reselection, std::move(shown.evidence)};
@@ -142,11 +157,13 @@ MoveManner withinSystem(const EvidenceLog& log, const CellMove& move)
 /// was redirected.
 MoveManner betweenSystems(const EvidenceLog& log, const CellMove& move)
 {
-    ShownMode before = modeOn(move.from->technology, log, move.n);
+    ShownMode before = modeOn(move.from->technology, log, move);
     if (before.mode == Mode::Own)
         return {CauseKind::Reselection, std::move(before.evidence)};
-    constexpr std::uint64_t WhileSettled = ~std::uint64_t(0);
-    const ShownMode after = modeOn(move.to.technology, log, WhileSettled);
+    CellMove settled = move;
+    settled.n = std::numeric_limits<std::uint64_t>::max();
+    settled.time = move.time + MoveTracker::SettlingTime;
+    const ShownMode after = modeOn(move.to.technology, log, settled);
     if (before.mode == Mode::Unknown || after.mode == Mode::Unknown || after.evidence.front().time < move.time)
         return {};
     before.evidence.push_back(after.evidence.front());

@@ -62,10 +62,13 @@ std::vector<Finding> MoveFindings::finish(Moment time)
     return found;
 }
 
-/// From A to B and back to A.
+/// From A to B and back to A. In a soft handover both serve all the while: that which of them is stronger changes is
+/// nothing to remark.
 void MoveFindings::considerPingPong(const Event& move, std::vector<Finding>& found) const
 {
-    if (_stays.empty() || !isSameCell(_stays.back().cell, *move.toCell))
+    const bool isSoft = move.cause && move.cause->kind == CauseKind::Handover
+        && move.toCell->technology != RadioTechnology::LTE && move.toCell->technology != RadioTechnology::GSM;
+    if (isSoft || _stays.empty() || !isSameCell(_stays.back().cell, *move.toCell))
         return;
     const double seconds = secondsBetween(_stays.back().left, move.time);
     if (seconds > _thresholds[Threshold::PingPongTime])
@@ -100,8 +103,8 @@ void MoveFindings::considerOvershoot(const Event& move, std::vector<Finding>& fo
             found.push_back(std::move(finding));
             return;
         }
-        const bool isNew = std::ranges::none_of(
-            between, [&](const Cell* cell) { return isSameCell(*cell, stay->cell); });
+        const bool isNew =
+            std::ranges::none_of(between, [&](const Cell* cell) { return isSameCell(*cell, stay->cell); });
         if (isNew)
             between.push_back(&stay->cell);
     }
