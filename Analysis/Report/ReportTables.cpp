@@ -139,8 +139,8 @@ void appendEvidence(const ReportedEvent& event, std::string& out)
 void appendEventRow(const ReportedEvent& event, std::string& out)
 {
     out += "<tr><th scope=\"row\">" + timeElement(event.time) + "</th>";
-    appendCellOf(escaped(event.kind), out);
-    out += "<td>" + escaped(event.text) + (event.seconds ? " (" + durationText(*event.seconds) + ")" : "");
+    out += "<td class=\"k\">" + escaped(event.kind) + "</td><td>" + escaped(event.text)
+        + (event.seconds ? " (" + durationText(*event.seconds) + ")" : "");
     if (!event.cause.empty()) {
         out += "<br><small><b>" + escaped(event.cause) + "</b>"
             + (event.causeText.empty() ? "" : ": " + escaped(event.causeText)) + "</small>";
