@@ -1,5 +1,4 @@
-// spectrel: the application with its terminal screens, and the commands watch, decode, view,
-// record, channel and report.
+// spectrel: the application with its terminal screens, and the commands.
 
 #include "CommandLine/Commands/Application.h"
 #include "CommandLine/Commands/Arguments.h"
@@ -19,7 +18,7 @@ using namespace spectrel;
 /// A live session tells the system log, a recording that is decoded again does not.
 bool isLive(Job job)
 {
-    return job != Job::Decode && job != Job::View && job != Job::Report;
+    return job != Job::Decode && job != Job::View && job != Job::Mark && job != Job::Report;
 }
 
 std::string portPrefix(Job job)
@@ -47,6 +46,8 @@ int run(const Arguments& arguments, const Context& context)
         return record(arguments.record, context);
     case Job::Channel:
         return channel(arguments.channel);
+    case Job::Mark:
+        return mark(arguments.mark);
     case Job::Report:
         return writeReport(arguments.report, context);
     case Job::Application:

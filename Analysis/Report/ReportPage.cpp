@@ -74,7 +74,7 @@ void appendLevels(const Recordings& recordings, std::string& out)
 void appendDistributions(const Recordings& recordings, std::string& out)
 {
     out += "<section>\n<h2>Distributions</h2>\n<p class=\"soft\">Which share of the values was at or below a "
-           "level.</p>\n<div class=\"side\">\n";
+           "level.</p>\n<div class=\"side pair\">\n";
     for (std::size_t i = 0; i < LevelCount; ++i) {
         const auto level = static_cast<Level>(i);
         if (std::any_of(recordings.begin(), recordings.end(),

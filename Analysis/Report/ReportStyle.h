@@ -27,7 +27,7 @@ ul{margin:.2rem 0;padding-left:1.1rem}code{font-size:.85em}details{font-size:.9r
 .d1{stroke-dasharray:7 3}.d2{stroke-dasharray:2 3}.d3{stroke-dasharray:8 3 2 3}
 .c0{--c:var(--c0)}.c1{--c:var(--c1)}.c2{--c:var(--c2)}.c3{--c:var(--c3)}.c4{--c:var(--c4)}.c5{--c:var(--c5)}.c6{--c:var(--c6)}.c7{--c:var(--c7)}.c8{--c:var(--c8)}.c9{--c:var(--c9)}
 @media print{body{max-width:none;padding:0;font-size:10pt}figure,tr,h2,h3{break-inside:avoid}h2,h3{break-after:avoid}
-*{print-color-adjust:exact;-webkit-print-color-adjust:exact}.wide{overflow:visible}details:not([open]){display:none}}
+*{print-color-adjust:exact;-webkit-print-color-adjust:exact}.wide{overflow:visible}.pair{grid-template-columns:1fr 1fr}details:not([open]){display:none}}
 )css";
 
 } // namespace spectrel

@@ -1,6 +1,7 @@
 #include "CommandLine/Commands/Arguments.h"
 
 #include "CommandLine/Options/OptionTypes.h"
+#include "Records/Beside/Marks.h"
 
 #include <CLI/CLI.hpp>
 #include <iostream>
@@ -31,6 +32,15 @@ constexpr OptionForm<OutputFormat> FormatForm {"tree|json|changes|csv|table|cell
 constexpr OptionForm<std::string> CommandForm {"COMMAND",
     [](std::string_view text) { return text.empty() ? std::nullopt : std::optional<std::string>(text); },
     "is no command"};
+
+std::optional<std::string> parseNote(std::string_view text)
+{
+    const bool isNote = !text.empty() && text.size() <= LongestNote;
+    return isNote ? std::optional<std::string>(text) : std::nullopt;
+}
+
+constexpr OptionForm<std::string> NoteForm {"TEXT", parseNote, "is no note of 1 to 4096 bytes"};
+static_assert(LongestNote == 4096);
 
 constexpr OptionForm<std::vector<TableColumn>> ColumnsForm {
     "PATH[=NAME],...", parseTableColumns, "is no list of columns PATH[=NAME],..."};
@@ -249,6 +259,16 @@ void addChannel(CLI::App& program, Arguments& arguments)
         command, "--format", channel.format, ChannelFormatForm, "How the bands are printed (default: text)");
 }
 
+void addMark(CLI::App& program, Arguments& arguments)
+{
+    CLI::App& command = *program.add_subcommand("mark", "Write a bookmark of this moment into a running recording");
+    command.callback([&arguments] { arguments.job = Job::Mark; });
+    addCommon(command, arguments);
+    addFormedOption(command, "TEXT", arguments.mark.note, NoteForm, "What there is to note")->required()->type_name("");
+    addFormedOption(command, "--recording", arguments.mark.recording, FileForm,
+        "The recording beside which it is written (default: that of the running recorder)");
+}
+
 void addReport(CLI::App& program, Arguments& arguments)
 {
     ReportOptions& report = arguments.report;
@@ -304,6 +324,7 @@ std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
     addView(program, arguments);
     addRecord(program, arguments);
     addChannel(program, arguments);
+    addMark(program, arguments);
     addReport(program, arguments);
     try {
         program.parse(argc, argv);

@@ -2,6 +2,7 @@
 
 #include "CommandLine/Commands/Channel.h"
 #include "CommandLine/Commands/Decode.h"
+#include "CommandLine/Commands/Mark.h"
 #include "CommandLine/Commands/Record.h"
 #include "CommandLine/Commands/Report.h"
 #include "CommandLine/Commands/View.h"
@@ -16,7 +17,7 @@
 
 namespace spectrel {
 
-enum class Job : std::uint8_t { Application, Watch, Decode, View, Record, Channel, Report };
+enum class Job : std::uint8_t { Application, Watch, Decode, View, Record, Channel, Mark, Report };
 
 /// Which screens the application was asked to open; by default it finds out by itself.
 enum class ScreenChoice : std::uint8_t { Automatic, Graphical, Terminal };
@@ -32,6 +33,7 @@ struct Arguments {
     WatchOptions watch;
     RecordOptions record;
     ChannelOptions channel;
+    MarkOptions mark;
     ReportOptions report;
 };
 

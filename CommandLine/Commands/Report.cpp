@@ -10,6 +10,8 @@
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/MessageText.h"
 #include "Monitor/Viewing/OfflineSession.h"
+#include "Records/Beside/Gaps.h"
+#include "Records/Beside/Marks.h"
 
 #include <algorithm>
 #include <array>
@@ -47,6 +49,7 @@ public:
         }
         noteTechnology(*technology);
         _session.useTechnology(*technology);
+        readBeside(input.path);
         if (!input.isEmpty)
             playMessages(input);
         if (!input.reader->damage().empty())
@@ -67,6 +70,23 @@ private:
         auto& names = _recording.technologies;
         if (std::find(names.begin(), names.end(), name) == names.end())
             names.push_back(name);
+    }
+
+    /// The bookmarks of a recording and its gaps.
+    void readBeside(const std::string& path)
+    {
+        if (path == "-")
+            return;
+        const Marks marks = readMarks(path);
+        for (const Mark& mark : marks.marks)
+            _collector.addBookmark(mark.time, mark.note);
+        const Gaps gaps = readGaps(path);
+        for (const Gap& gap : gaps.gaps)
+            _recording.lostMessages += gap.lost;
+        for (const std::string& damage : {marks.damage, gaps.damage}) {
+            if (!damage.empty())
+                complain(damage);
+        }
     }
 
     void playMessages(RecordingInput& input)

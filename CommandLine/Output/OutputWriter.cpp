@@ -1,7 +1,8 @@
 #include "CommandLine/Output/OutputWriter.h"
 
 #include "CommandLine/Output/DisplayPrinter.h"
-#include "CommandLine/Output/JsonText.h"
+#include "Values/JsonText.h"
+#include "Values/Moment.h"
 #include "Values/Table.h"
 
 #include <array>
