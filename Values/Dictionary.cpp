@@ -54,6 +54,14 @@ DictionaryRef Dictionary::make(std::initializer_list<Entry> entries)
     return std::make_shared<Dictionary>(entries);
 }
 
+/// The entries, with nothing remembered of where they stand.
+std::vector<Dictionary::Entry>& Dictionary::entriesToRewrite()
+{
+    _index.reset();
+    _next = 0;
+    return _entries;
+}
+
 std::size_t Dictionary::positionOf(std::string_view key) const
 {
     const std::size_t count = _entries.size();

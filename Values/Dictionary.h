@@ -66,8 +66,10 @@ public:
     }
 
 private:
+    friend class DictionaryRewriting;
     struct Index;
 
+    std::vector<Entry>& entriesToRewrite();
     std::size_t positionOf(std::string_view key) const;
     std::size_t append(std::string_view key, Value value);
 

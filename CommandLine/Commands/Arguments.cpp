@@ -5,6 +5,7 @@
 
 #include <CLI/CLI.hpp>
 #include <iostream>
+#include <limits>
 
 namespace spectrel {
 
@@ -71,14 +72,36 @@ void addLimits(CLI::App& command, std::optional<std::uint64_t>& count, const cha
     addFormedOption(command, "--duration", duration, DurationForm, "End after this time");
 }
 
-void addCommon(CLI::App& command, Arguments& arguments)
+void addVersion(CLI::App& command)
 {
     command.set_version_flag("--version", "spectrel " SPECTREL_VERSION);
+}
+
+void addCommon(CLI::App& command, Arguments& arguments)
+{
+    addVersion(command);
     addFormedOption(
         command, "--resources", arguments.resources, FolderForm, "Take the display templates from this folder");
     addFormedOption(
         command, "--log", arguments.logFile, FileForm, "Write every system-log line to this file: <PRIORITY>TEXT");
 }
+
+std::optional<std::uint32_t> parseChannel(std::string_view text)
+{
+    const auto number = parseWholeNumber(text, 0, std::numeric_limits<std::uint32_t>::max());
+    return number ? std::optional(static_cast<std::uint32_t>(*number)) : std::nullopt;
+}
+
+std::optional<double> parseFrequency(std::string_view text)
+{
+    return parseNumber(text, 0, 1e6);
+}
+
+constexpr OptionForm<ChannelTechnology> ChannelTechnologyForm {
+    "lte|utran|gsm|cdma", channelTechnologyNamed, "is not one of lte, utran, gsm, cdma"};
+constexpr OptionForm<ChannelFormat> ChannelFormatForm {"text|json", channelFormatNamed, "is not one of text, json"};
+constexpr OptionForm<std::uint32_t> ChannelForm {"NUMBER", parseChannel, "is no channel number"};
+constexpr OptionForm<double> FrequencyForm {"FREQUENCY", parseFrequency, "is no frequency in MHz"};
 
 void addScreens(CLI::App& command, Arguments& arguments)
 {
@@ -143,10 +166,11 @@ void addRecord(CLI::App& program, Arguments& arguments)
     addCommon(command, arguments);
     RecordingFilesOptions& files = arguments.record.files;
     addFormedOption(command, "FILE", files.target, FileForm,
-        "The capture file; an existing one is overwritten. A folder (or a new one: FOLDER/) takes numbered files, on "
-        "from those that are there. - is standard output")
+        "The capture file, a new one. A folder (or a new one: FOLDER/) takes numbered files, on from those that are "
+        "there. - is standard output")
         ->required()
         ->type_name("");
+    command.add_flag("--overwrite", files.overwrite, "Write over the capture file, where it is there");
     addFormedOption(command, "--rollover", files.largestFile, SizeForm,
         "Begin a further file before one has more bytes than this, such as 100M");
     addFormedOption(command, "--rollover-time", files.longestFile, DurationForm,
@@ -166,9 +190,26 @@ void addMark(CLI::App& program, Arguments& arguments)
         "The recording beside which it is written (default: that of the running recorder)");
 }
 
+void addChannel(CLI::App& program, Arguments& arguments)
+{
+    ChannelOptions& channel = arguments.channel;
+    CLI::App& command = *program.add_subcommand("channel", "Print the bands and frequencies of a channel number");
+    command.callback([&arguments] { arguments.job = Job::Channel; });
+    addVersion(command);
+    addFormedOption(command, "TECH", channel.technology, ChannelTechnologyForm, "Whose channel")->required();
+    addFormedOption(command, "NUMBER", channel.number, ChannelForm, "A downlink or uplink channel number");
+    addFormedOption(command, "--mhz", channel.mhz, FrequencyForm,
+        "Instead of a number: a downlink or uplink centre frequency in MHz");
+    command.add_option("--band", channel.band, "Only this band, such as 3 or 'DCS 1800'")->type_name("BAND");
+    addFormedOption(
+        command, "--format", channel.format, ChannelFormatForm, "How the bands are printed (default: text)");
+}
+
 /// What no single option can tell.
 void checkTogether(const Arguments& arguments)
 {
+    if (arguments.job == Job::Channel && arguments.channel.number.has_value() == arguments.channel.mhz.has_value())
+        throw CLI::ValidationError("channel", "takes either a channel NUMBER or --mhz FREQUENCY");
     checkOutput(arguments.decode.output);
     checkOutput(arguments.watch.output);
     if (arguments.decode.each && arguments.decode.output.format != OutputFormat::Json)
@@ -195,6 +236,7 @@ std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
     addView(program, arguments);
     addRecord(program, arguments);
     addMark(program, arguments);
+    addChannel(program, arguments);
     try {
         program.parse(argc, argv);
         checkTogether(arguments);

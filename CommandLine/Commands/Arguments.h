@@ -1,5 +1,6 @@
 #pragma once
 
+#include "CommandLine/Commands/Channel.h"
 #include "CommandLine/Commands/Decode.h"
 #include "CommandLine/Commands/Mark.h"
 #include "CommandLine/Commands/Record.h"
@@ -15,7 +16,7 @@
 
 namespace spectrel {
 
-enum class Job : std::uint8_t { Application, Watch, Decode, View, Record, Mark };
+enum class Job : std::uint8_t { Application, Watch, Decode, View, Record, Mark, Channel };
 
 /// Which screens the application was asked to open; by default it finds out by itself.
 enum class ScreenChoice : std::uint8_t { Automatic, Graphical, Terminal };
@@ -31,6 +32,7 @@ struct Arguments {
     WatchOptions watch;
     RecordOptions record;
     MarkOptions mark;
+    ChannelOptions channel;
 };
 
 /// Reads the command line. An exit status when the program is done with that: after --help, --version or wrong usage,

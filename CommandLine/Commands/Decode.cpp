@@ -15,9 +15,9 @@ namespace {
 /// Runs the files through one session and prints as it goes.
 class Decoding {
 public:
-    explicit Decoding(const DecodeOptions& options)
+    Decoding(const DecodeOptions& options, const Context& context)
         : _options(options)
-        , _session(&LogGenerator::generatorFromTechnology, options.snapshotDirectory.has_value())
+        , _session(&LogGenerator::generatorFromTechnology, options.snapshotDirectory.has_value(), context)
         , _journal(printsChanges(options.output.format) ? &_session.displayState().followChanges() : nullptr)
         , _output(stdout, options.output)
     {
@@ -116,9 +116,9 @@ private:
 
 } // namespace
 
-int decode(const DecodeOptions& options)
+int decode(const DecodeOptions& options, const Context& context)
 {
-    return Decoding(options).run();
+    return Decoding(options, context).run();
 }
 
 } // namespace spectrel

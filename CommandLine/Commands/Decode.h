@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CommandLine/Output/OutputWriter.h"
+#include "Platform/Context.h"
 #include "Records/Recording.h"
 
 #include <optional>
@@ -21,6 +22,6 @@ struct DecodeOptions {
 
 /// Decodes the recordings one after the other, as one session, and prints the display to standard output. Answers the
 /// program's exit status.
-int decode(const DecodeOptions& options);
+int decode(const DecodeOptions& options, const Context& context);
 
 } // namespace spectrel

@@ -22,9 +22,10 @@ constexpr std::chrono::milliseconds FlushDelay {500};
 
 class Recorder final : public SessionSink {
 public:
-    explicit Recorder(const RecordOptions& options)
+    Recorder(const RecordOptions& options, const Context& context)
         : _options(options)
         , _files(options.files)
+        , _live(context)
         , _session(_live.services(), *this, LiveServices::portPrefixFor("Record"))
         , _marks(_live.services().ports, LiveServices::portPrefixFor("Record"),
               {[this] { return recording(); }, [this](const std::string& note) { return mark(note); }})
@@ -55,7 +56,7 @@ public:
 
     void useTechnology(const Value& technology) override
     {
-        _generator = LogGenerator::generatorFromTechnology(technology);
+        _generator = LogGenerator::generatorFromTechnology(technology, _live.context());
     }
     LogGenerator* generator() override
     {
@@ -89,14 +90,14 @@ private:
         const auto technology = technologyOfConstant(_session.technology());
         if (!technology || _status != 0)
             return;
-        if (const auto begun = _files.begin(*technology, Clock::installed().now()); !begun)
+        if (const auto begun = _files.begin(*technology, _live.clock().now()); !begun)
             fail(begun.failure().text);
     }
 
     void write(Technology technology, ByteView body)
     {
         const std::size_t before = _files.count();
-        if (const auto written = _files.write(technology, Clock::installed().now(), body); !written)
+        if (const auto written = _files.write(technology, _live.clock().now(), body); !written)
             return fail(written.failure().text);
         if (before > 0 && _files.count() > before)
             report("recording into " + _files.path());
@@ -125,7 +126,7 @@ private:
         const auto file = recording();
         if (!file)
             return file;
-        if (auto appended = appendMark(*file, {Clock::installed().now(), note}); !appended)
+        if (auto appended = appendMark(*file, {_live.clock().now(), note}); !appended)
             return appended.failure();
         return file;
     }
@@ -150,9 +151,9 @@ private:
 
 } // namespace
 
-int record(const RecordOptions& options)
+int record(const RecordOptions& options, const Context& context)
 {
-    return Recorder(options).run();
+    return Recorder(options, context).run();
 }
 
 } // namespace spectrel

@@ -2,12 +2,17 @@
 
 #include "Records/Beside/Beside.h"
 #include "Records/Capture/CaptureFormat.h"
+#include "Values/OwnFile.h"
 
 #include <algorithm>
 #include <cerrno>
 #include <charconv>
 #include <cstdio>
+#include <fcntl.h>
 #include <filesystem>
+#include <limits>
+#include <sys/file.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
 namespace spectrel {
@@ -51,12 +56,24 @@ std::vector<std::pair<std::uint64_t, fs::path>> numberedFiles(const std::string&
     return files;
 }
 
-/// With what stands beside it.
-void removeRecording(const std::string& path)
+/// With what stands beside it. A file that somebody writes is locked, and stays.
+void removeUnlessWritten(const fs::path& path)
 {
-    std::error_code error;
-    fs::remove(path, error);
-    removeBeside(path);
+    const int file = ::open(path.c_str(), O_RDONLY | O_NOFOLLOW | O_NONBLOCK | O_CLOEXEC);
+    if (file < 0)
+        return;
+    if (::flock(file, LOCK_EX | LOCK_NB) == 0) {
+        ::unlink(path.c_str());
+        removeBeside(path.string());
+    }
+    ::close(file);
+}
+
+/// Whether there is something else than a file, such as a device.
+bool isOther(const std::string& path)
+{
+    struct stat status { };
+    return ::lstat(path.c_str(), &status) == 0 && !S_ISREG(status.st_mode);
 }
 
 } // namespace
@@ -77,20 +94,34 @@ Outcome RecordingFiles::prepare()
     std::error_code error;
     _isFolder = target.ends_with('/') || fs::is_directory(target, error);
     if (_isFolder) {
-        fs::create_directories(target, error);
-        if (error)
-            return Failure {error.message()}.of(target);
+        if (auto made = makeOwnFolders(target); !made)
+            return made;
     }
     const std::string folder = _isFolder ? target : fs::path(target).parent_path().string();
     if (target != "-" && ::access(folder.empty() ? "." : folder.c_str(), W_OK) != 0)
         return Failure::ofSystem().of(target);
+    return checkTarget();
+}
+
+/// Whether the first file's name is free, or may be taken.
+Outcome RecordingFiles::checkTarget() const
+{
+    struct stat status { };
+    if (_options.target == "-" || _isFolder || ::lstat(_options.target.c_str(), &status) != 0)
+        return Done();
+    if (S_ISREG(status.st_mode) && !_options.overwrite)
+        return Failure {_options.target + ": is there already (--overwrite writes over it)", Failure::Code::Exists};
     return Done();
 }
 
-std::uint64_t RecordingFiles::latestNumber() const
+/// Behind the highest of the folder.
+Result<std::uint64_t> RecordingFiles::nextNumber() const
 {
     const auto files = numberedFiles(_options.target);
-    return files.empty() ? 0 : files.back().first;
+    const std::uint64_t latest = files.empty() ? 0 : files.back().first;
+    if (latest == std::numeric_limits<std::uint64_t>::max())
+        return Failure {files.back().second.string() + ": has the highest number that there is; no file can follow it"};
+    return latest + 1;
 }
 
 Outcome RecordingFiles::begin(Technology technology, Moment time)
@@ -138,20 +169,22 @@ Outcome RecordingFiles::beginNext(Technology technology, Moment time)
 /// Two recorders never share a file, for a number that is taken is passed over.
 Outcome RecordingFiles::createNext(Technology technology)
 {
-    if (_isFolder)
-        _number = latestNumber();
     for (;;) {
-        ++_number;
+        const auto number = _isFolder ? nextNumber() : Result<std::uint64_t>(_number + 1);
+        if (!number)
+            return number.failure();
+        _number = *number;
         _path = numberedPath(technology);
         const bool isTarget = _path == _options.target;
-        auto created = (isTarget ? createRecording : createNewRecording)(_path, technology);
+        const bool mayOverwrite = isTarget && (_path == "-" || _options.overwrite || isOther(_path));
+        auto created = (mayOverwrite ? createRecording : createNewRecording)(_path, technology);
         if (created) {
-            if (_path != "-")
+            if (_path != "-" && !isOther(_path))
                 removeBeside(_path); // of an earlier recording of this name
             _writer = *std::move(created);
             return Done();
         }
-        if (created.failure().code != Failure::Code::Exists) {
+        if (isTarget || created.failure().code != Failure::Code::Exists) {
             _writer.reset();
             return created.failure().of(spoken(_path));
         }
@@ -177,12 +210,12 @@ void RecordingFiles::removeOldest()
     if (_isFolder) {
         const auto files = numberedFiles(_options.target);
         for (std::size_t i = 0; i + *_options.keep < files.size(); ++i)
-            removeRecording(files[i].second);
+            removeUnlessWritten(files[i].second);
         return;
     }
     _written.push_back(_path);
     if (_written.size() > *_options.keep) {
-        removeRecording(_written.front());
+        removeUnlessWritten(_written.front());
         _written.erase(_written.begin());
     }
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CommandLine/Output/OutputWriter.h"
+#include "Platform/Context.h"
 
 #include <chrono>
 #include <cstdint>
@@ -17,6 +18,6 @@ struct WatchOptions {
 
 /// Prints a live session, once at each refresh, until interrupted or until what was asked for has been printed. Answers
 /// the program's exit status.
-int watch(const WatchOptions& options);
+int watch(const WatchOptions& options, const Context& context);
 
 } // namespace spectrel

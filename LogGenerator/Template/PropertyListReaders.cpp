@@ -58,11 +58,11 @@ const std::optional<Value>& PropertyListPayloads::of(RecordView record)
     return _parsed;
 }
 
-LogCode_0xFF0000::LogCode_0xFF0000(RecordView record, PropertyListPayloads& payloads)
+LogCode_0xFF0000::LogCode_0xFF0000(RecordView record, PropertyListPayloads& payloads, SystemLog& log)
 {
     const auto& files = payloads.of(record);
     if (!files) {
-        SPECTREL_LOG(Priority::Error, "SIM File dictionary data could not be constructed");
+        SPECTREL_LOG(log, Priority::Error, "SIM File dictionary data could not be constructed");
         throw UnknownDataException();
     }
     _files = *files;
@@ -80,12 +80,12 @@ ContextArrayReader::ContextArrayReader(RecordView record, PropertyListPayloads& 
         _contexts = contexts->list();
 }
 
-CellInfoArrayReader::CellInfoArrayReader(RecordView record, PropertyListPayloads& payloads)
+CellInfoArrayReader::CellInfoArrayReader(RecordView record, PropertyListPayloads& payloads, SystemLog& log)
 {
     if (const auto& cells = payloads.of(record))
         _cells = *cells;
     else
-        SPECTREL_LOG(Priority::Error, "Cell Info Array data could not be constructed");
+        SPECTREL_LOG(log, Priority::Error, "Cell Info Array data could not be constructed");
 }
 
 std::vector<DictionaryRef> CellInfoArrayReader::servingCells(std::span<const std::string_view> technologies) const

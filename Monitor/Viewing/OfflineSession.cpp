@@ -12,9 +12,10 @@ namespace {
 constexpr std::size_t RawLot = 1024 * 1024;
 } // namespace
 
-OfflineSession::OfflineSession(GeneratorFactory makeGenerator, bool keepsHistory)
+OfflineSession::OfflineSession(GeneratorFactory makeGenerator, bool keepsHistory, const Context& context)
     : _keepsHistory(keepsHistory)
-    , _display(std::move(makeGenerator))
+    , _display(
+          std::move(makeGenerator), {_clock, context.resources, context.log, context.console, context.diagnosticLog})
 {
 }
 

@@ -20,8 +20,11 @@ namespace spectrel {
 class OfflineSession {
 public:
     /// `keepsHistory`: run the refresh ticks and keep the raw messages, as a snapshot needs them; otherwise the raw
-    /// messages are forgotten, so that memory does not grow with the recording.
-    OfflineSession(GeneratorFactory makeGenerator, bool keepsHistory);
+    /// messages are forgotten, so that memory does not grow with the recording. The clock of the context does not
+    /// count.
+    OfflineSession(GeneratorFactory makeGenerator, bool keepsHistory, const Context& context);
+    OfflineSession(const OfflineSession&) = delete;
+    OfflineSession& operator=(const OfflineSession&) = delete;
 
     /// In a pause of the recording that is longer than this the ticks end until the next message.
     static constexpr std::chrono::minutes LongestPause {10};

@@ -105,6 +105,21 @@ TEST(ReadArgumentsTest, ViewTakesAFileItsTechnologyAndTheScreens)
     EXPECT_EQ(arguments.view.technology, Technology::LTE);
 }
 
+TEST(ReadArgumentsTest, ChannelTakesANumberOrAFrequency)
+{
+    Arguments arguments;
+    EXPECT_EQ(read({"channel", "gsm", "600", "--band", "PCS 1900", "--format", "json"}, arguments), std::nullopt);
+    EXPECT_EQ(arguments.job, Job::Channel);
+    EXPECT_EQ(arguments.channel.technology, ChannelTechnology::GSM);
+    EXPECT_EQ(arguments.channel.number, 600u);
+    EXPECT_EQ(arguments.channel.band, "PCS 1900");
+    EXPECT_EQ(arguments.channel.format, ChannelFormat::Json);
+    Arguments frequency;
+    EXPECT_EQ(read({"channel", "cdma", "--mhz", "881.52"}, frequency), std::nullopt);
+    EXPECT_EQ(frequency.channel.mhz, 881.52);
+    EXPECT_EQ(frequency.channel.number, std::nullopt);
+}
+
 /// What is told on standard error about the words, which are wrong usage.
 std::string complaintAbout(const std::vector<const char*>& words)
 {
@@ -187,7 +202,7 @@ TEST(ReadArgumentsTest, StandardOutputTakesNoOptionOfSeveralFiles)
 
 TEST(ReadArgumentsTest, EveryCommandTellsHelpAndVersion)
 {
-    for (const char* command : {"watch", "decode", "view", "record", "mark"}) {
+    for (const char* command : {"watch", "decode", "view", "record", "mark", "channel"}) {
         for (const char* option : {"--help", "--version"}) {
             Arguments arguments;
             testing::internal::CaptureStdout();
@@ -201,7 +216,8 @@ TEST(ReadArgumentsTest, WrongUsageIsStatus2)
 {
     for (const std::vector<const char*>& words : std::vector<std::vector<const char*>> {{"--gui", "--terminal"},
              {"play"}, {"watch", "--count", "0"}, {"watch", "--duration", "soon"}, {"record"}, {"decode"}, {"view"},
-             {"view", "a", "b"}, {"view", "--gui", "--terminal", "a"}, {"view", "--technology", "5g", "a"}}) {
+             {"view", "a", "b"}, {"channel"}, {"channel", "lte"}, {"channel", "lte", "-1"},
+             {"view", "--gui", "--terminal", "a"}, {"view", "--technology", "5g", "a"}}) {
         Arguments arguments;
         EXPECT_EQ(read(words, arguments), ExitStatus::WrongUsage) << words.front();
     }

@@ -24,13 +24,19 @@ struct PropertyListLimits {
 /// list's order; a key given twice keeps its last value.
 std::optional<Value> parsePropertyList(ByteView bytes);
 
+/// The same into a value that may hold an earlier list: its containers and texts are used again, as far as nobody else
+/// holds them, so that lists which differ little from one to the next take no memory anew. Absent, and false, when the
+/// list does not parse.
+bool readPropertyList(ByteView bytes, Value& value);
+
 /// The XML form (format code 100), UTF-8, as every reader of property lists takes it; dictionary entries in their
 /// order. None when the value cannot be written: absent, deeper or larger than the limits, a text that XML cannot carry
 /// (control characters, malformed UTF-8), a date outside the years 0 to 9999.
 std::optional<std::string> serialisePropertyList(const Value& value);
 
-/// Writes the XML form straight to the path, mode 0600 also where the file exists. A file without room for the list
-/// stays as it was, one that was not there is not left behind.
+/// Writes the XML form straight to the path, mode 0600 also where the file exists. A file that is there is overwritten
+/// only where it is this user's own and no link (`openOwnFile`). One without room for the list stays as it was, one
+/// that was not there is not left behind.
 Outcome writePropertyListToFile(const Value& value, const std::string& path);
 
 /// Reads a whole file as a property list; none when it cannot be read or does not parse.

@@ -52,7 +52,8 @@ protected:
     FakeResources resources;
     const ScratchFolder scratch;
     const std::string folder = scratch.path().string();
-    OfflineSession session {&LogGenerator::generatorFromTechnology, true};
+    OfflineSession session {
+        &LogGenerator::generatorFromTechnology, true, {.resources = resources, .log = log, .console = log}};
 };
 
 TEST_F(OfflineSessionTest, MessageAtTheVeryTimeOfATickComesBeforeIt)
@@ -118,7 +119,8 @@ protected:
     }
 
     std::string ticks;
-    OfflineSession decoding {&LogGenerator::generatorFromTechnology, false};
+    OfflineSession decoding {
+        &LogGenerator::generatorFromTechnology, false, {.resources = resources, .log = log, .console = log}};
 };
 
 TEST_F(OfflineTicksTest, TicksFallEveryTwoSecondsWhetherMessagesComeOrNot)

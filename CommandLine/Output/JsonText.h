@@ -1,0 +1,3 @@
+#pragma once
+
+#include "Values/JsonText.h" // IWYU pragma: export
