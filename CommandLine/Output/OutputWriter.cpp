@@ -37,12 +37,15 @@ std::optional<OutputFormat> outputFormatNamed(std::string_view name)
         std::string_view name;
         OutputFormat format;
     };
-    static constexpr std::array<NamedFormat, 6> Formats {{
+    static constexpr std::array<NamedFormat, 9> Formats {{
         {"tree", OutputFormat::Tree},
         {"json", OutputFormat::Json},
         {"changes", OutputFormat::Changes},
         {"csv", OutputFormat::Csv},
         {"table", OutputFormat::Table},
+        {"cells", OutputFormat::Cells},
+        {"summary", OutputFormat::Summary},
+        {"events", OutputFormat::Events},
         {"none", OutputFormat::None},
     }};
     const auto* known = findRow(Formats, name, &NamedFormat::name);
@@ -91,14 +94,15 @@ void OutputWriter::printChanges(std::uint64_t n, Moment time, const Value& displ
 {
     _changes.update(display, journal, [&](const std::string& path, const std::string* value) {
         if (_format == OutputFormat::Csv) {
-            _gathered += std::to_string(n) + "," + secondsForm(time) + ",";
+            _gathered += std::to_string(n) + "," + timeText(time, _options.time) + ",";
             appendCsvField(path, _gathered);
             _gathered += ',';
             appendCsvField(value ? std::string_view(*value) : std::string_view(), _gathered);
             _gathered += "\r\n";
             return;
         }
-        _gathered += "{\"n\": " + std::to_string(n) + ", \"time\": " + secondsForm(time) + ", \"path\": ";
+        _gathered +=
+            "{\"n\": " + std::to_string(n) + ", \"time\": " + jsonTimeText(time, _options.time) + ", \"path\": ";
         appendJsonText(path, _gathered);
         _gathered += ", \"value\": ";
         if (value)
@@ -114,7 +118,7 @@ void OutputWriter::printRow(Moment time, const Value& display)
 {
     if (_format != OutputFormat::Table)
         return;
-    _gathered += secondsForm(time);
+    _gathered += timeText(time, _options.time);
     for (const TableColumn& column : _options.columns) {
         _gathered += ',';
         appendCsvField(leafAtPath(display, column.path).value_or(""), _gathered);

@@ -1,3 +1,0 @@
-#pragma once
-
-#include "Values/JsonText.h" // IWYU pragma: export
