@@ -68,6 +68,15 @@ std::string joined(const std::vector<std::string>& texts, std::string_view betwe
     return out;
 }
 
+/// The names of a few, else the first and the last.
+std::string filesText(const std::vector<std::string>& files)
+{
+    constexpr std::size_t Few = 4;
+    return files.size() <= Few
+        ? joined(files, ", ")
+        : files.front() + " to " + files.back() + " (" + std::to_string(files.size()) + " files)";
+}
+
 std::size_t countOf(const ReportedRecording& recording, ReportedEvent::Mark mark)
 {
     return static_cast<std::size_t>(std::count_if(recording.events.begin(), recording.events.end(),
@@ -195,7 +204,7 @@ void appendOverview(const std::vector<ReportedRecording>& recordings, std::strin
     out += "</tr></thead>\n<tbody>\n";
     const auto row = [&recordings, &out](
                          std::string_view title, auto textOf) { appendRow(title, recordings, textOf, out); };
-    row("files", [](const ReportedRecording& it) { return joined(it.files, ", "); });
+    row("files", [](const ReportedRecording& it) { return filesText(it.files); });
     row("basebands", [](const ReportedRecording& it) { return joined(it.technologies, ", "); });
     row("from", [](const ReportedRecording& it) { return it.messages ? dateText(it.first) + " UTC" : ""; });
     row("to", [](const ReportedRecording& it) { return it.messages ? dateText(it.last) + " UTC" : ""; });

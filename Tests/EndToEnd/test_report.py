@@ -100,6 +100,21 @@ class Report(Place):
         self.assertIn("drive.pcap, drive-2.pcap", page.text)
         self.assertIn("<td>60</td>", page.text)
 
+    def test_bookmarks_and_gaps_are_read(self):
+        file = self.drive()
+        self.write("drive.marks", b'{"time": 1700000005.5, "note": "a <bridge>"}\n')
+        self.write("drive.gaps", b'{"time": 1700000006.5, "lost": 17}\n')
+        page = self.page(file)
+        self.assertIn("a &lt;bridge&gt;", page.text)
+        self.assertTrue(any("lost messages" in row and "17" in row for row in page.rows()))
+
+    def test_a_level_that_served_is_charted_with_its_moves(self):
+        page = self.page(os.path.join(GOLDEN, "lte-five-minutes.pcap"))
+        (rsrp,) = [chart for chart in page.charts() if chart.find("title").text.startswith("RSRP of")]
+        shapes = [path.get("class", "") for path in rsrp.iter("path")]
+        self.assertTrue([shape for shape in shapes if shape.startswith("l c")], "no line of a serving cell")
+        self.assertIn("move", shapes)
+
     def test_others_stand_side_by_side(self):
         page = self.page(self.drive("before.pcap"), self.drive("after.pcap", start=1_600_000_000.0))
         self.assertIn("<title>Radio report: after, before</title>", page.text)
