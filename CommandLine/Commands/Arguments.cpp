@@ -279,8 +279,7 @@ void addReport(CLI::App& program, Arguments& arguments)
     command
         .add_option("FILE", report.files,
             "The recordings. Files that `record` has numbered (drive.pcap, drive-2.pcap) are one recording; others "
-            "stand "
-            "side by side. - is standard input")
+            "stand side by side. - is standard input")
         ->required()
         ->type_name("");
     addFormedOption(command, "-o,--output", report.output, FileForm,

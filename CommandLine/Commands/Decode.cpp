@@ -7,6 +7,7 @@
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/MessageText.h"
 #include "Monitor/Viewing/OfflineSession.h"
+#include "Records/Beside/Marks.h"
 
 #include <cstdio>
 #include <exception>
@@ -88,6 +89,8 @@ private:
             return true;
         }
         _session.useTechnology(*technology);
+        if (!isStandardInput)
+            readBookmarks(path);
         RecordedMessage message;
         while (reader->next(message)) {
             if (!decodeMessage(file, message))
@@ -96,6 +99,17 @@ private:
         if (!reader->damage().empty())
             fail(file + ": " + reader->damage());
         return true;
+    }
+
+    void readBookmarks(const std::string& path)
+    {
+        if (_options.output.format != OutputFormat::Events)
+            return;
+        const Marks read = readMarks(path);
+        for (const Mark& mark : read.marks)
+            _events->addBookmark(mark.time, mark.note);
+        if (!read.damage.empty())
+            fail(read.damage);
     }
 
     bool decodeMessage(const std::string& file, const RecordedMessage& message)
