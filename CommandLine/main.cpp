@@ -1,4 +1,4 @@
-// spectrel: the application with its terminal screens, and its commands.
+// spectrel: the application with its terminal screens, and the commands.
 
 #include "CommandLine/Commands/Application.h"
 #include "CommandLine/Commands/Arguments.h"
@@ -18,7 +18,7 @@ using namespace spectrel;
 /// A live session tells the system log, a recording that is decoded again does not.
 bool isLive(Job job)
 {
-    return job != Job::Decode && job != Job::View && job != Job::Mark;
+    return job != Job::Decode && job != Job::View && job != Job::Mark && job != Job::Report;
 }
 
 std::string portPrefix(Job job)
@@ -48,6 +48,8 @@ int run(const Arguments& arguments, const Context& context)
         return mark(arguments.mark, context);
     case Job::Channel:
         return channel(arguments.channel);
+    case Job::Report:
+        return writeReport(arguments.report, context);
     case Job::Application:
         return runApplication(arguments, context);
     }

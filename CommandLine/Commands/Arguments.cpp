@@ -244,16 +244,6 @@ void addRecord(CLI::App& program, Arguments& arguments)
     addLimits(command, arguments.record.count, "End after this many messages", arguments.record.duration);
 }
 
-void addMark(CLI::App& program, Arguments& arguments)
-{
-    CLI::App& command = *program.add_subcommand("mark", "Write a bookmark of this moment into a running recording");
-    command.callback([&arguments] { arguments.job = Job::Mark; });
-    addCommon(command, arguments);
-    addFormedOption(command, "TEXT", arguments.mark.note, NoteForm, "What there is to note")->required()->type_name("");
-    addFormedOption(command, "--recording", arguments.mark.recording, FileForm,
-        "The recording beside which it is written (default: that of the running recorder)");
-}
-
 void addChannel(CLI::App& program, Arguments& arguments)
 {
     ChannelOptions& channel = arguments.channel;
@@ -267,6 +257,40 @@ void addChannel(CLI::App& program, Arguments& arguments)
     command.add_option("--band", channel.band, "Only this band, such as 3 or 'DCS 1800'")->type_name("BAND");
     addFormedOption(
         command, "--format", channel.format, ChannelFormatForm, "How the bands are printed (default: text)");
+}
+
+void addMark(CLI::App& program, Arguments& arguments)
+{
+    CLI::App& command = *program.add_subcommand("mark", "Write a bookmark of this moment into a running recording");
+    command.callback([&arguments] { arguments.job = Job::Mark; });
+    addCommon(command, arguments);
+    addFormedOption(command, "TEXT", arguments.mark.note, NoteForm, "What there is to note")->required()->type_name("");
+    addFormedOption(command, "--recording", arguments.mark.recording, FileForm,
+        "The recording beside which it is written (default: that of the running recorder)");
+}
+
+void addReport(CLI::App& program, Arguments& arguments)
+{
+    ReportOptions& report = arguments.report;
+    CLI::App& command =
+        *program.add_subcommand("report", "Write recordings as one HTML page: levels, cells, events and findings");
+    command.callback([&arguments] { arguments.job = Job::Report; });
+    addCommon(command, arguments);
+    command
+        .add_option("FILE", report.files,
+            "The recordings. Files that `record` has numbered (drive.pcap, drive-2.pcap) are one recording; others "
+            "stand "
+            "side by side. - is standard input")
+        ->required()
+        ->type_name("");
+    addFormedOption(command, "-o,--output", report.output, FileForm,
+        "The page; a report that is there is overwritten, any other file is not. - is standard output")
+        ->required();
+    addTechnology(command, report.technology);
+    addRepeatedOption(
+        command, "--threshold", [&report](const std::string& text) { return report.thresholds.set(text); },
+        "Set what a finding depends on; may be given several times")
+        ->type_name("NAME=VALUE");
 }
 
 /// What no single option can tell.
@@ -299,8 +323,9 @@ std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
     addDecode(program, arguments);
     addView(program, arguments);
     addRecord(program, arguments);
-    addMark(program, arguments);
     addChannel(program, arguments);
+    addMark(program, arguments);
+    addReport(program, arguments);
     try {
         program.parse(argc, argv);
         checkTogether(arguments);

@@ -4,6 +4,7 @@
 #include "CommandLine/Commands/Decode.h"
 #include "CommandLine/Commands/Mark.h"
 #include "CommandLine/Commands/Record.h"
+#include "CommandLine/Commands/Report.h"
 #include "CommandLine/Commands/View.h"
 #include "CommandLine/Commands/Watch.h"
 #include "CommandLine/Program/ExitStatus.h"
@@ -16,7 +17,7 @@
 
 namespace spectrel {
 
-enum class Job : std::uint8_t { Application, Watch, Decode, View, Record, Mark, Channel };
+enum class Job : std::uint8_t { Application, Watch, Decode, View, Record, Channel, Mark, Report };
 
 /// Which screens the application was asked to open; by default it finds out by itself.
 enum class ScreenChoice : std::uint8_t { Automatic, Graphical, Terminal };
@@ -31,8 +32,9 @@ struct Arguments {
     ViewOptions view;
     WatchOptions watch;
     RecordOptions record;
-    MarkOptions mark;
     ChannelOptions channel;
+    MarkOptions mark;
+    ReportOptions report;
 };
 
 /// Reads the command line. An exit status when the program is done with that: after --help, --version or wrong usage,

@@ -24,8 +24,8 @@ class Recorder final : public SessionSink {
 public:
     Recorder(const RecordOptions& options, const Context& context)
         : _options(options)
-        , _files(options.files)
         , _live(context)
+        , _files(options.files, _live.clock())
         , _session(_live.services(), *this, LiveServices::portPrefixFor("Record"))
         , _marks(_live.services().ports, LiveServices::portPrefixFor("Record"),
               {[this] { return recording(); }, [this](const std::string& note) { return mark(note); }})
@@ -90,14 +90,14 @@ private:
         const auto technology = technologyOfConstant(_session.technology());
         if (!technology || _status != 0)
             return;
-        if (const auto begun = _files.begin(*technology, _live.clock().now()); !begun)
+        if (const auto begun = _files.begin(*technology); !begun)
             fail(begun.failure().text);
     }
 
     void write(Technology technology, ByteView body)
     {
         const std::size_t before = _files.count();
-        if (const auto written = _files.write(technology, _live.clock().now(), body); !written)
+        if (const auto written = _files.write(technology, body); !written)
             return fail(written.failure().text);
         if (before > 0 && _files.count() > before)
             report("recording into " + _files.path());
@@ -139,8 +139,8 @@ private:
     }
 
     const RecordOptions& _options;
-    RecordingFiles _files;
     LiveServices _live;
+    RecordingFiles _files;
     std::unique_ptr<LogGenerator> _generator; // for its start command: nothing is decoded
     Session _session;
     RecorderPort _marks;

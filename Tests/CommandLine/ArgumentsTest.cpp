@@ -202,7 +202,7 @@ TEST(ReadArgumentsTest, StandardOutputTakesNoOptionOfSeveralFiles)
 
 TEST(ReadArgumentsTest, EveryCommandTellsHelpAndVersion)
 {
-    for (const char* command : {"watch", "decode", "view", "record", "mark", "channel"}) {
+    for (const char* command : {"watch", "decode", "view", "record", "channel", "mark"}) {
         for (const char* option : {"--help", "--version"}) {
             Arguments arguments;
             testing::internal::CaptureStdout();
