@@ -36,6 +36,10 @@ public:
     {
         return _reading ? _reading->serving() : nullptr;
     }
+    bool isOutOfService() const
+    {
+        return _reading && _reading->isOutOfService();
+    }
     const CellReport& report()
     {
         if (!_isReportBuilt && _reading)
@@ -124,6 +128,11 @@ void Analysis::refresh(Moment time)
 const Cell* Analysis::serving() const
 {
     return _state->serving();
+}
+
+bool Analysis::isOutOfService() const
+{
+    return _state->isOutOfService();
 }
 
 const CellReport& Analysis::report() const

@@ -63,6 +63,8 @@ public:
 
     /// The serving cell as of the last message; null while none is known. Stays where it is until the next message.
     const Cell* serving() const;
+    /// Whether the display says that no cell serves.
+    bool isOutOfService() const;
     /// Everything, as of the last message, with its time.
     const CellReport& report() const;
     /// A path in the display tree; empty for no origin.

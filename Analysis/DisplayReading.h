@@ -28,6 +28,10 @@ public:
     {
         return _main.isKnown() && !_isOutOfService ? &_main.cell() : nullptr;
     }
+    bool isOutOfService() const
+    {
+        return _isOutOfService;
+    }
     /// EV-DO's sector; null while none is known.
     const Cell* dataSector() const
     {

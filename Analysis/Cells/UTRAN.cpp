@@ -58,6 +58,12 @@ constexpr auto States = std::to_array<ConnectionRow::Text>({
 
 constexpr auto Connections = std::to_array<ConnectionRow>({{"/RRC Info", "State", UMTS, States}});
 
+/// Out of service the radio resource control has no mode, and the cell allows emergency calls only.
+constexpr auto NoService = std::to_array<NoServiceRow>({
+    {"/RRC Info", "State", "Unknown RRC Mode", UMTS},
+    {Info, "Allowed Access", "Emergency Calls Only", UMTS},
+});
+
 } // namespace
 
 const CellTable& utranCells()
@@ -66,6 +72,7 @@ const CellTable& utranCells()
         .leaves = Leaves,
         .lists = Lists,
         .connections = Connections,
+        .noService = NoService,
         .contexts = {"/PDP Context Info", "APN", "State", "Bytes Received", "Bytes Sent"},
         .umtsNumbering = ChannelNumbering::UTRATDD};
     return table;

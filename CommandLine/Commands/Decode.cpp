@@ -1,5 +1,6 @@
 #include "CommandLine/Commands/Decode.h"
 
+#include "CommandLine/Commands/EventOutput.h"
 #include "CommandLine/Output/CellOutput.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/ProviderNames.h"
@@ -24,6 +25,8 @@ public:
         , _journal(printsChanges(options.output.format) ? &_session.displayState().followChanges() : nullptr)
         , _output(stdout, options.output)
     {
+        if (options.output.format == OutputFormat::Events || options.events.hasAlarms())
+            _events.emplace(_session.displayState(), options.events, options.output, _output, &_operators);
         if (options.output.format == OutputFormat::Table)
             _session.setTickHandler([this](Moment tick) { _output.printRow(tick, _session.display()); });
         if (printsCells(options.output.format)) {
@@ -38,11 +41,15 @@ public:
             if (!decodeFile(file))
                 break;
         }
+        if (_events)
+            _events->finish();
         if (!_options.each)
             _output.printDisplay(_session.display());
         if (_session.messages() > 0)
             printLast();
         saveSnapshot();
+        if (_options.events.until && !_events->isUntilMet())
+            fail("the alarm '" + _options.events.until->text + "' was not raised");
         if (!_output.flush())
             fail("standard output: cannot be written");
         return _status;
@@ -64,7 +71,7 @@ private:
         _status = 1;
     }
 
-    /// False when a message has ended the decoding.
+    /// False when a message or an alarm has ended the decoding.
     bool decodeFile(const std::string& path)
     {
         const bool isStandardInput = path == "-";
@@ -110,7 +117,7 @@ private:
             _output.printNumberedJson(n, _session.display());
         else if (_journal)
             _output.printChanges(n, message.time, _session.display(), *_journal);
-        return true;
+        return !_events || !_events->isUntilMet();
     }
 
     void saveSnapshot()
@@ -127,6 +134,7 @@ private:
     OutputWriter _output;
     ProviderNames _operators;
     std::optional<CellOutput> _cells;
+    std::optional<EventOutput> _events; // where events are printed
     std::uint64_t _n = 0;
     int _status = 0;
 };

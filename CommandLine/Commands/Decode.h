@@ -1,5 +1,6 @@
 #pragma once
 
+#include "CommandLine/Commands/EventOutput.h"
 #include "CommandLine/Output/OutputWriter.h"
 #include "Platform/Context.h"
 #include "Records/Recording.h"
@@ -18,6 +19,7 @@ struct DecodeOptions {
     bool keepGoing = false; // past a message that would end the running application
     std::optional<Technology> technology; // where a file does not say
     std::optional<std::string> snapshotDirectory;
+    EventOptions events;
 };
 
 /// Decodes the recordings one after the other, as one session, and prints the display to standard output. Answers the

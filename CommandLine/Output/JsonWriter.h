@@ -1,6 +1,6 @@
 #pragma once
 
-#include "CommandLine/Output/JsonText.h"
+#include "Values/JsonText.h"
 
 #include <charconv>
 #include <optional>

@@ -1,7 +1,8 @@
 #include "CommandLine/Output/OutputWriter.h"
 
 #include "CommandLine/Output/DisplayPrinter.h"
-#include "CommandLine/Output/JsonText.h"
+#include "Values/JsonText.h"
+#include "Values/Moment.h"
 #include "Values/Table.h"
 
 #include <array>
@@ -36,7 +37,7 @@ std::optional<OutputFormat> outputFormatNamed(std::string_view name)
         std::string_view name;
         OutputFormat format;
     };
-    static constexpr std::array<NamedFormat, 8> Formats {{
+    static constexpr std::array<NamedFormat, 9> Formats {{
         {"tree", OutputFormat::Tree},
         {"json", OutputFormat::Json},
         {"changes", OutputFormat::Changes},
@@ -44,6 +45,7 @@ std::optional<OutputFormat> outputFormatNamed(std::string_view name)
         {"table", OutputFormat::Table},
         {"cells", OutputFormat::Cells},
         {"summary", OutputFormat::Summary},
+        {"events", OutputFormat::Events},
         {"none", OutputFormat::None},
     }};
     const auto* known = findRow(Formats, name, &NamedFormat::name);

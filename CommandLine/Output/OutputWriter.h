@@ -17,9 +17,9 @@
 
 namespace spectrel {
 
-enum class OutputFormat : std::uint8_t { Tree, Json, Changes, Csv, Table, Cells, Summary, None };
+enum class OutputFormat : std::uint8_t { Tree, Json, Changes, Csv, Table, Cells, Summary, Events, None };
 
-/// "tree", "json", "changes", "csv", "table", "cells", "summary", "none".
+/// "tree", "json", "changes", "csv", "table", "cells", "summary", "events", "none".
 std::optional<OutputFormat> outputFormatNamed(std::string_view name);
 
 /// Whether displays are printed as their changes.

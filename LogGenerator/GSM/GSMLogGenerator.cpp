@@ -85,13 +85,14 @@ Value GSMLogGenerator::processObject(const Value& object, SystemLog& log)
     if (object.string())
         return object;
     if (const auto& dictionary = object.dictionary()) {
-        auto copy = Dictionary::make();
+        auto copy = std::make_shared<Dictionary>();
+        copy->reserve(dictionary->count());
         for (const auto& [key, value] : dictionary->entries())
             copy->set(key, collapsed(value, log));
         return copy;
     }
     if (const auto& list = object.list()) {
-        auto copy = List::make();
+        auto copy = std::make_shared<List>();
         for (std::size_t index = 1; index < list->count(); ++index) // without the first element, on purpose
             copy->append(collapsed((*list)[index], log));
         return copy;

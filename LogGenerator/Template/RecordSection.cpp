@@ -76,7 +76,8 @@ void RecordSection::listNeighborCells(const CellInfoArrayReader& reader, const C
 {
     List entries;
     for (const DictionaryRef& cell : reader.neighborCells(cells.technologies)) {
-        auto entry = Dictionary::make();
+        auto entry = std::make_shared<Dictionary>();
+        entry->reserve(cells.fields.size());
         storeCell(log(), *cell, cells.fields, *entry);
         entries.append(entry);
     }

@@ -35,6 +35,29 @@ TEST_F(PropertyListReadersTest, RecordsThatTellTheSameAreParsedOnce)
     EXPECT_EQ((*ContextArrayReader(RecordView(same), payloads).contexts())[0].dictionary(), node);
 }
 
+TEST_F(PropertyListReadersTest, RecordsOfOtherCodesInBetweenChangeNothingOfThat)
+{
+    const RecordBuilder record = contexts("a");
+    const DictionaryRef node = (*ContextArrayReader(RecordView(record), payloads).contexts())[0].dictionary();
+    const RecordBuilder cells = RecordBuilder::withPropertyList(CellInfoArrayReader::Code, Value(List::make()));
+    EXPECT_TRUE(CellInfoArrayReader(RecordView(cells), payloads).holdsAnything());
+    EXPECT_EQ((*ContextArrayReader(RecordView(record), payloads).contexts())[0].dictionary(), node);
+}
+
+TEST_F(PropertyListReadersTest, NodesThatSomebodyHoldsAreNotWrittenOver)
+{
+    const RecordBuilder record = contexts("a");
+    const DictionaryRef node = (*ContextArrayReader(RecordView(record), payloads).contexts())[0].dictionary();
+    EXPECT_EQ(shown(contexts("b")), "{\"APN\": \"b\"}");
+    EXPECT_EQ(displayText(node), "{\"APN\": \"a\"}");
+}
+
+TEST_F(PropertyListReadersTest, AnEmptyPayloadDoesNotParse)
+{
+    const RecordBuilder record = RecordBuilder::withPayload(ContextArrayReader::Code, Bytes());
+    EXPECT_FALSE(ContextArrayReader(RecordView(record), payloads).contexts());
+}
+
 TEST_F(PropertyListReadersTest, AnotherRecordIsParsedAnew)
 {
     EXPECT_EQ(shown(contexts("a")), "{\"APN\": \"a\"}");
