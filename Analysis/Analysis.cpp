@@ -5,6 +5,8 @@
 
 #include <algorithm>
 #include <optional>
+#include <string_view>
+#include <utility>
 
 namespace spectrel {
 
@@ -63,12 +65,11 @@ private:
     AnalysedChanges followGenerator()
     {
         const LogGenerator* const generator = _display.generator();
-        if (generator == _generator)
+        const std::string_view name = generator ? generator->className() : std::string_view();
+        if (name == _generator)
             return {};
-        _generator = generator;
-        const CellTable* const table = generator ? cellTableOf(generator->className()) : nullptr;
-        if (_reading && table == &_reading->table())
-            return {};
+        _generator = name;
+        const CellTable* const table = cellTableOf(name);
         const bool hadServing = serving();
         _reading.reset();
         if (table)
@@ -83,7 +84,7 @@ private:
     DisplayState& _display;
     OperatorNames* _operators;
     PathTable _paths;
-    const LogGenerator* _generator = nullptr;
+    std::string _generator; // the class whose display this is
     std::optional<DisplayReading> _reading;
     CellReport _report;
     bool _isReportBuilt = false;

@@ -19,7 +19,8 @@ public:
     {
     }
 
-    /// The list was stored. Counters that have shrunk, and lists stored twice at once, give no rate.
+    /// The list was stored. Counters that have shrunk give no rate; a list stored again within a tenth of a second
+    /// keeps those it had.
     void update(const Value& display, std::uint64_t message, Moment time, PathTable& paths);
     const std::vector<DataContext>& contexts() const
     {

@@ -322,55 +322,68 @@ void DisplayReading::applyShared(bool isMainTold)
         for (const Leaf* leaf : std::exchange(_early, {}))
             applyNetwork(*leaf);
     }
+    const bool isAnother = !isMainTold && _main.isKnown() && namesAnotherNetwork();
+    if (isAnother)
+        _earlySince = _step;
     for (const Leaf* leaf : _touchedLeaves) {
         if (!isShared(leaf))
             continue;
-        const bool isOther = leaf->row->meaning == Meaning::Area && leaf->number && _main.cell().area
-            && identityOf(RadioTechnology::GSM, Meaning::Area, *leaf->number) != _main.cell().area;
-        if (!isMainTold && _main.isKnown() && (isOther || (!_early.empty() && _earlySince.message == _step.message))) {
-            if (_early.empty())
-                _earlySince = _step;
+        if (isAnother)
             _early.push_back(leaf);
-        } else {
+        else
             applyNetwork(*leaf);
-        }
     }
+}
+
+/// Whether the message has a network or area that is not that of the serving cell.
+bool DisplayReading::namesAnotherNetwork()
+{
+    return std::ranges::any_of(_touchedLeaves, [this](const Leaf* leaf) {
+        if (!leaf->row || leaf->text.empty())
+            return false;
+        if (leaf->row->meaning == Meaning::Area && leaf->number && _main.cell().area) {
+            const auto area = identityOf(_main.cell().technology, Meaning::Area, *leaf->number);
+            return area && area != _main.cell().area;
+        }
+        if (leaf->row->meaning != Meaning::NetworkCode || _main.cell().plmn.empty())
+            return false;
+        const std::string network = readNetwork();
+        return !network.empty() && network != _main.cell().plmn;
+    });
+}
+
+/// The network whose codes the display shows; empty for none.
+std::string DisplayReading::readNetwork()
+{
+    const auto textOf = [this](Meaning meaning) -> std::string_view {
+        const auto row = std::ranges::find(_table.leaves, meaning, &LeafRow::meaning);
+        return row == _table.leaves.end() ? std::string_view() : leafAt(row->container, row->key).text;
+    };
+    return _network.read(textOf(Meaning::CountryCode), textOf(Meaning::NetworkCode));
 }
 
 void DisplayReading::applyNetwork(const Leaf& leaf)
 {
     const LeafRow& row = *leaf.row;
-    std::string network;
-    switch (row.meaning) {
-    case Meaning::Area:
-        if (leaf.number)
-            _changes.serving |= _main.store({row.meaning, row.level, *leaf.number, leaf.origin}, row.rank);
-        return;
-    case Meaning::OperatorName:
+    if (row.meaning == Meaning::Area && leaf.number)
+        _changes.serving |= _main.store({row.meaning, row.level, *leaf.number, leaf.origin}, row.rank);
+    else if (row.meaning == Meaning::OperatorName)
         _main.storeOperator(leaf.text, leaf.origin);
-        return;
-    case Meaning::PLMN:
-        network = isNetworkCode(leaf.text) ? leaf.text : std::string();
-        break;
-    default: {
-        // The country comes with the network code, except from records that lack one of them.
-        const auto textOf = [&](Meaning meaning) -> std::string_view {
-            const auto found = std::ranges::find(_table.leaves, meaning, &LeafRow::meaning);
-            return found == _table.leaves.end() ? std::string_view()
-                                                : std::string_view(leafAt(found->container, found->key).text);
-        };
-        if (row.meaning == Meaning::CountryCode)
-            return; // read with the network code
-        network = _network.read(textOf(Meaning::CountryCode), textOf(Meaning::NetworkCode));
-    }
-    }
+    else if (row.meaning == Meaning::PLMN)
+        storeNetwork(isNetworkCode(leaf.text) ? leaf.text : std::string(), leaf.origin);
+    else if (row.meaning == Meaning::NetworkCode) // read with the country's
+        storeNetwork(readNetwork(), leaf.origin);
+}
+
+void DisplayReading::storeNetwork(const std::string& network, const Origin& origin)
+{
     if (network.empty())
         return _main.forgetNetwork();
-    _main.storeNetwork(network, leaf.origin);
+    _main.storeNetwork(network, origin);
     if (_operators && std::exchange(_operatorOf, network) != network)
         _operatorName = _operators->nameOf(network);
     if (_main.cell().operatorName.empty() && !_operatorName.empty())
-        _main.storeOperator(_operatorName, leaf.origin);
+        _main.storeOperator(_operatorName, origin);
     _changes.serving = true;
 }
 

@@ -23,12 +23,6 @@ public:
 
     /// Reads what the message has changed.
     AnalysedChanges apply(const AppliedMessage& message, const Journal& journal, const Value& display);
-    /// Whether this is the table it reads by.
-    const CellTable& table() const
-    {
-        return _table;
-    }
-
     /// The serving cell; null while none is known.
     const Cell* serving() const
     {
@@ -85,7 +79,10 @@ private:
     void collect(const Leaf& leaf, std::optional<RadioTechnology> technology, std::vector<Told>& told) const;
     void applyTold(ServingTrack& track, RadioTechnology technology, const std::vector<Told>& told);
     void applyShared(bool isMainTold);
+    bool namesAnotherNetwork();
     void applyNetwork(const Leaf& leaf);
+    std::string readNetwork();
+    void storeNetwork(const std::string& network, const Origin& origin);
     void applyLists(const Value& display);
     void forgetLevelsOf(const CellList& list);
     void applyHint(CellList& list, const Value& display);

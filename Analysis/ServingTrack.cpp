@@ -78,8 +78,10 @@ bool ServingTrack::store(const ReadValue& value, std::uint8_t rank)
     }
     const auto cellBefore = _cell.cell;
     const auto channelBefore = _cell.channel;
-    if (!storeValue(_cell, value))
+    if (!storeValue(_cell, value)) {
+        forgetFrom(value.origin.path);
         return false;
+    }
     _isPartsStale |= cellBefore != _cell.cell;
     _isBandStale |= channelBefore != _cell.channel;
     _cell.stored = std::max(_cell.stored, value.origin.time);

@@ -42,7 +42,8 @@ public:
     void begin(RadioTechnology technology, Step step);
     /// The cell was first told by an earlier message than it seemed.
     void beginAt(Step step);
-    /// False for a value out of range. A level with a higher rank than one of the same message does not count.
+    /// False for a value out of range: what came from its leaf before is not known any more. A level with a higher rank
+    /// than one of the same message does not count.
     bool store(const ReadValue& value, std::uint8_t rank);
     void storeNetwork(std::string_view network, const Origin& origin);
     void storeOperator(std::string_view name, const Origin& origin);

@@ -3,7 +3,7 @@
 A mismatch writes NAME.FORMAT.fail and shows the difference. After reading it, accept the new output with
     SPECTREL_BIN_DIR=build/dev/bin python3 Tests/EndToEnd/test_golden.py --accept
 
-NAME.changes may stand there compressed, as NAME.changes.gz. A new recording is made with
+Each may stand there compressed, such as NAME.changes.gz. A new recording is made with
     spectrel-telephonyd --simulate TECH --seed N --write Tests/Golden/NAME.pcap --duration 5m
 """
 
@@ -17,7 +17,7 @@ import unittest
 from harness import Place
 
 GOLDEN = os.path.join(os.path.dirname(os.path.abspath(__file__)), "..", "Golden")
-FORMATS = ("json", "changes", "tree")
+FORMATS = ("json", "changes", "tree", "cells")
 LONG = 200_000
 
 
