@@ -11,6 +11,8 @@ namespace spectrel {
 namespace {
 
 constexpr std::string_view NoContext = "none";
+/// Contexts are reported every few seconds: those that show later were not there at first.
+constexpr std::chrono::seconds FirstLook {10};
 
 std::string_view subjectOf(EventKind kind)
 {
@@ -72,6 +74,8 @@ void EventFinder::messageAnalysed(
     const AppliedMessage& message, const Journal& journal, const Analysis& analysis, const AnalysedChanges& changes)
 {
     reportBookmarks(message.time, message.number);
+    if (_first == Moment())
+        _first = message.time;
     _latest = message.number;
     _latestTime = message.time;
     settleDue(message.time);
@@ -219,9 +223,11 @@ void EventFinder::followContexts(const CellReport& report, const AppliedMessage&
             name = context.name + " (" + std::to_string(number) + ")";
         now.emplace(std::move(name), context.state.empty() ? "shown" : context.state);
     }
-    const auto before = std::exchange(_contexts, std::optional(now));
-    if (!before)
+    auto before = std::exchange(_contexts, std::optional(now));
+    if (!before && message.time - _first <= FirstLook)
         return;
+    if (!before)
+        before.emplace(); // an empty list leaves no trace in the journal
     for (const auto& [name, state] : *before) {
         if (!now.contains(name))
             noteContext(name, state, std::string(NoContext), message);

@@ -106,6 +106,7 @@ private:
     std::deque<Waiting> _queue;
     std::uint64_t _latest = 0; // message
     Moment _latestTime {};
+    Moment _first {}; // time of the first message
 };
 
 } // namespace spectrel

@@ -31,6 +31,8 @@ constexpr std::array<std::string_view, 7> UMTSRankingKeys {
 constexpr std::array<std::string_view, 1> StateKeys {"State"};
 constexpr std::array<std::string_view, 4> UTRANNeighbourKeys {"UARFCN", "Cell ID", "Filter RSCP", "Status"};
 
+constexpr std::string_view NothingYet = "-"; // the display's text for what no record has told
+
 struct SectionRow {
     std::string_view path; // of the dictionary, or of the list whose entries hold the keys
     bool isList;
@@ -125,7 +127,7 @@ void EvidenceLog::read(const AppliedMessage& message, const Journal& journal)
             place = change.place.get();
             known = &lookUp(change.place);
         }
-        if (known->section < 0 || change.kind == Journal::Kind::Removed)
+        if (known->section < 0 || change.kind == Journal::Kind::Removed || journal.valueOf(change) == NothingYet)
             continue;
         const auto section = static_cast<EvidenceSection>(known->section);
         const std::size_t position = positionOf(section, nameIn(*place, journal.keyOf(change)));

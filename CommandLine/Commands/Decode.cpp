@@ -93,8 +93,8 @@ private:
             return true;
         }
         _session.useTechnology(*technology);
-        if (!isStandardInput)
-            readBookmarks(path);
+        if (_options.output.format == OutputFormat::Events && !isStandardInput)
+            addBookmarks(path);
         RecordedMessage message;
         while (reader->next(message)) {
             if (!decodeMessage(file, message))
@@ -105,15 +105,13 @@ private:
         return true;
     }
 
-    void readBookmarks(const std::string& path)
+    void addBookmarks(const std::string& recording)
     {
-        if (_options.output.format != OutputFormat::Events)
-            return;
-        const Marks read = readMarks(path);
-        for (const Mark& mark : read.marks)
+        const Marks marks = readMarks(recording);
+        for (const Mark& mark : marks.marks)
             _events->addBookmark(mark.time, mark.note);
-        if (!read.damage.empty())
-            fail(read.damage);
+        if (!marks.damage.empty())
+            fail(marks.damage);
     }
 
     bool decodeMessage(const std::string& file, const RecordedMessage& message)

@@ -17,7 +17,7 @@ import unittest
 from harness import Place
 
 GOLDEN = os.path.join(os.path.dirname(os.path.abspath(__file__)), "..", "Golden")
-FORMATS = ("json", "changes", "tree", "cells")
+FORMATS = ("json", "changes", "tree", "cells", "events")
 LONG = 200_000
 
 

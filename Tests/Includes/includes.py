@@ -12,7 +12,7 @@ import typing
 
 STANDARD = {'cxxabi.h'}  # comes with the standard library, under a name of its own
 OPERATING_SYSTEM = {
-    'fcntl.h', 'langinfo.h', 'locale.h', 'netdb.h', 'poll.h', 'syslog.h', 'termios.h', 'time.h', 'unistd.h',
+    'fcntl.h', 'langinfo.h', 'locale.h', 'netdb.h', 'poll.h', 'spawn.h', 'syslog.h', 'termios.h', 'time.h', 'unistd.h',
     'netinet/*', 'sys/*'}
 
 INCLUDE = re.compile(r'\s*#\s*include\s*(["<])([^">]+)[">]')
