@@ -6,6 +6,7 @@
 
 #include <algorithm>
 #include <charconv>
+#include <chrono>
 #include <string>
 #include <string_view>
 #include <utility>
@@ -13,6 +14,9 @@
 namespace spectrel {
 
 namespace {
+
+/// Stores closer together than this give no rate: counters are not read so exactly.
+constexpr std::chrono::milliseconds MinInterval {100};
 
 std::string_view textOf(const Value& entry, std::string_view key)
 {
@@ -65,7 +69,7 @@ void ContextRates::update(const Value& display, std::uint64_t message, Moment ti
         const auto same = std::ranges::find(before, context.name, &DataContext::name);
         if (same != before.end()) {
             const Counters& last = countersBefore[static_cast<std::size_t>(same - before.begin())];
-            if (last.time == time) { // stored twice at once
+            if (time - last.time < MinInterval) {
                 context.downlinkKbps = same->downlinkKbps;
                 context.uplinkKbps = same->uplinkKbps;
                 _contexts.push_back(std::move(context));

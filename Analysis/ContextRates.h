@@ -19,7 +19,8 @@ public:
     {
     }
 
-    /// The list was stored. Counters that have shrunk give no rate; a list stored twice at once keeps those it had.
+    /// The list was stored. Counters that have shrunk give no rate; a list stored again within a tenth of a second
+    /// keeps those it had.
     void update(const Value& display, std::uint64_t message, Moment time, PathTable& paths);
     const std::vector<DataContext>& contexts() const
     {
