@@ -1,5 +1,6 @@
 #include "CommandLine/Output/OutputWriter.h"
 
+#include "CommandLine/Output/CsvField.h"
 #include "CommandLine/Output/DisplayPrinter.h"
 #include "Values/JsonText.h"
 #include "Values/Moment.h"
@@ -12,22 +13,6 @@ namespace spectrel {
 namespace {
 
 constexpr std::size_t WriteSize = 64 * 1024;
-
-/// A field of RFC 4180: quoted where it holds a separator, a quote or a line end.
-void appendCsvField(std::string_view field, std::string& out)
-{
-    if (field.find_first_of(",\"\r\n") == std::string_view::npos) {
-        out += field;
-        return;
-    }
-    out += '"';
-    for (const char character : field) {
-        if (character == '"')
-            out += '"';
-        out += character;
-    }
-    out += '"';
-}
 
 } // namespace
 
@@ -59,16 +44,8 @@ OutputWriter::OutputWriter(std::FILE* stream, const OutputOptions& options)
     , _paths(options.paths)
     , _changes(_paths)
 {
-    if (_format == OutputFormat::Csv) {
+    if (_format == OutputFormat::Csv)
         _gathered += "n,time,path,value\r\n";
-    } else if (_format == OutputFormat::Table) {
-        _gathered += "time";
-        for (const TableColumn& column : options.columns) {
-            _gathered += ',';
-            appendCsvField(column.name, _gathered);
-        }
-        _gathered += "\r\n";
-    }
 }
 
 void OutputWriter::printDisplay(const Value& display)
@@ -111,19 +88,6 @@ void OutputWriter::printChanges(std::uint64_t n, Moment time, const Value& displ
             _gathered += "null";
         _gathered += "}\n";
     });
-    flushWhenLarge();
-}
-
-void OutputWriter::printRow(Moment time, const Value& display)
-{
-    if (_format != OutputFormat::Table)
-        return;
-    _gathered += timeText(time, _options.time);
-    for (const TableColumn& column : _options.columns) {
-        _gathered += ',';
-        appendCsvField(leafAtPath(display, column.path).value_or(""), _gathered);
-    }
-    _gathered += "\r\n";
     flushWhenLarge();
 }
 

@@ -46,7 +46,7 @@ struct OutputOptions {
 /// Prints displays in one format to a stream, in large writes.
 class OutputWriter {
 public:
-    /// Csv and Table begin with their header at once. The options outlive this.
+    /// Csv begins with its header at once. The options outlive this.
     OutputWriter(std::FILE* stream, const OutputOptions& options);
 
     /// The whole display: a tree, or JSON on one line. Nothing for the other formats.
@@ -55,8 +55,6 @@ public:
     void printNumberedJson(std::uint64_t n, const Value& display);
     /// What has changed since the last call, in Changes or Csv form; the journal follows the display.
     void printChanges(std::uint64_t n, Moment time, const Value& display, Journal& journal);
-    /// One row of a Table; nothing for the other formats.
-    void printRow(Moment time, const Value& display);
     void printLine(std::string_view line);
     /// Writes out what has gathered. False once the stream has failed (a full disk, a closed pipe).
     bool flush();
