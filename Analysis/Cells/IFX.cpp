@@ -39,6 +39,8 @@ constexpr auto Connections = std::to_array<ConnectionRow>({{"/Call", "State", st
 
 constexpr auto Registration = std::to_array<RegistrationRow>({{"/Registration", "State"}});
 
+constexpr auto NoService = std::to_array<NoServiceRow>({{"/Registration", "State", "No service", GSM}});
+
 } // namespace
 
 const CellTable& ifxCells()
@@ -48,6 +50,7 @@ const CellTable& ifxCells()
         .lists = Lists,
         .connections = Connections,
         .registration = Registration,
+        .noService = NoService,
         .contexts = {"/Packet Data/Contexts", "APN", "State", "Bytes Received", "Bytes Sent", "/Packet Data"}};
     return table;
 }

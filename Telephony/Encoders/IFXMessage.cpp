@@ -32,15 +32,18 @@ std::string criterion(const IFXCell& cell)
 
 Value registration(const IFXReport& report)
 {
+    const auto forbidden = List::make({"PLMN", "001-02", "001-03"});
+    if (!report.isInService)
+        return Dictionary::make({{"State", "No service"}, {"Forbidden", forbidden}});
     return Dictionary::make({
-        {"State", report.isInService ? "Registered, home" : "No service"},
+        {"State", "Registered, home"},
         {"Network", Dictionary::make({{"PLMN", Network}, {"Name", "Test Network"}})},
         {"Area",
             Dictionary::make({
                 {"LAC", std::to_string(report.serving.locationArea)},
                 {"RAC", std::to_string(report.serving.routingArea)},
             })},
-        {"Forbidden", List::make({"PLMN", "001-02", "001-03"})},
+        {"Forbidden", forbidden},
     });
 }
 
@@ -119,14 +122,14 @@ Value packetData(const IFXReport& report)
 
 Value ifxState(const IFXReport& report)
 {
-    return Dictionary::make({
-        {"Registration", registration(report)},
-        {"Serving Cell", servingCell(report)},
-        {"Neighbour Cells", neighbourCells(report)},
-        {"Call", call(report)},
-        {"Packet Data", packetData(report)},
-        {"SIM", Dictionary::make({{"State", Dictionary::make({{"Card", "Ready"}})}})},
-    });
+    const auto state = Dictionary::make({{"Registration", registration(report)}});
+    if (report.isInService)
+        state->set("Serving Cell", servingCell(report));
+    state->set("Neighbour Cells", neighbourCells(report));
+    state->set("Call", call(report));
+    state->set("Packet Data", packetData(report));
+    state->set("SIM", Dictionary::make({{"State", Dictionary::make({{"Card", "Ready"}})}}));
+    return state;
 }
 
 Bytes ifxMessage(const IFXReport& report, Moment)

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <utility>
 
 namespace spectrel {
 
@@ -152,13 +153,16 @@ void CDMAWorld::serve(std::size_t sector, MoveCause cause)
     _serving = sector;
 }
 
-/// EV-DO has the same sector, but sleeps while the phone talks; after that it finds the pilot anew.
+/// EV-DO has the same sector, but sleeps while the phone talks; after that it finds the pilot anew, and then its
+/// session.
 void CDMAWorld::followWithEVDO()
 {
-    if (activity() == Activity::Voice || _servingEVDO == _serving)
+    const bool wasTalking = std::exchange(_isTalking, activity() == Activity::Voice);
+    if (_isTalking || _servingEVDO == _serving)
         return;
+    const bool isConnected = activity() == Activity::Data && !wasTalking;
     _moves.moved(evdoNameOf(_sectors[_servingEVDO].system), evdoNameOf(serving()),
-        activity() == Activity::Data ? ByHandover : byReselection(ReselectionRule::EqualPriority));
+        isConnected ? ByHandover : byReselection(ReselectionRule::EqualPriority));
     _servingEVDO = _serving;
 }
 

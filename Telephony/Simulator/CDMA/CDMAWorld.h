@@ -117,6 +117,7 @@ private:
     MoveLog _moves;
     std::chrono::milliseconds _elapsed {0};
     bool _isInService = true;
+    bool _isTalking = false;
     bool _isFrameBad = false;
     EVDOTraffic _traffic;
     EVDOCounts _countsAtSecond;

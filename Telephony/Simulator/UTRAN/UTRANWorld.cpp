@@ -1,5 +1,7 @@
 #include "Telephony/Simulator/UTRAN/UTRANWorld.h"
 
+#include "Telephony/Simulator/Demand.h"
+
 #include <algorithm>
 #include <array>
 #include <cmath>
@@ -109,6 +111,7 @@ void UTRANWorld::advance(std::chrono::milliseconds step)
 {
     _moves.begin();
     advanceRoad(step);
+    keepTime(_inServiceFor, isInService(), step);
     reselect(step);
     controlPower();
     _calls.advance(step, _dice);
@@ -171,10 +174,10 @@ void UTRANWorld::reselect(std::chrono::milliseconds step)
     }
 }
 
-/// Of a move from the serving cell, now.
+/// Of a move from the serving cell, now. What was ranked while there was no service has been selected, not reselected.
 MoveCause UTRANWorld::causeOfMove() const
 {
-    if (!isInService())
+    if (_inServiceFor < TReselection)
         return AfterServiceLost;
     return _connection.isOnDedicatedChannel() ? ByHandover : byReselection(ReselectionRule::EqualPriority);
 }
@@ -318,6 +321,7 @@ void UTRANWorld::arrive(Technology, MoveKind)
 {
     _serving = strongest();
     _candidateFor = 0ms;
+    _inServiceFor = TReselection;
 }
 
 void UTRANWorld::leave()

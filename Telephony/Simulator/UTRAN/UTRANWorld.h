@@ -104,6 +104,7 @@ private:
     std::size_t _serving = 0;
     std::size_t _candidate = 0; // ranked above the serving cell
     std::chrono::milliseconds _candidateFor {0};
+    std::chrono::milliseconds _inServiceFor {1000}; // that long before the beginning, too
     Habit _calls;
     Habit _transfers;
     RRCConnection _connection;

@@ -248,6 +248,17 @@ TEST_F(CDMARecordsTest, SystemInformationIsThatOfTheServingSector)
     });
 }
 
+TEST_F(CDMARecordsTest, PhoneWithoutServiceAcquires)
+{
+    CDMAReport report = CDMAWorld(Scene::Still, 1).report();
+    report.isInService = false;
+    deliver(cdmaSearcherRecord(report, Time));
+    deliver(evdoAirLinkRecord(report, Time));
+    EXPECT_EQ(text("k1xDeviceState"), "Acquisition [3]");
+    EXPECT_EQ(text("k1xEVDODeviceState"), "Acquisition [1]");
+    EXPECT_EQ(text("kServingPNOffset"), "Invalid Value");
+}
+
 TEST_F(CDMARecordsTest, OneCarrierCountsNothingWhileTheOtherHasTheRadio)
 {
     drive(10, [](const CDMAWorld& world) {

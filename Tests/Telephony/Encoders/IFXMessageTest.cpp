@@ -73,6 +73,17 @@ TEST_F(IFXMessageTest, StateIsShownAsItIs)
     EXPECT_EQ(log.takeLog(), "") << "nothing but texts, dictionaries and lists";
 }
 
+TEST_F(IFXMessageTest, PhoneWithoutServiceNamesNoServingCell)
+{
+    IFXReport report;
+    const Value served = ifxState(report);
+    EXPECT_TRUE(served.dictionary()->contains("Serving Cell"));
+    report.isInService = false;
+    const Value lost = ifxState(report);
+    EXPECT_FALSE(lost.dictionary()->contains("Serving Cell"));
+    EXPECT_EQ((*(*lost.dictionary())["Registration"].dictionary())["State"], Value("No service"));
+}
+
 TEST_F(IFXMessageTest, BasebandReportsAtOnceAndThenSteadily)
 {
     for (const auto& [scene, expected] :
