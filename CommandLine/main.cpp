@@ -2,6 +2,7 @@
 
 #include "CommandLine/Commands/Application.h"
 #include "CommandLine/Commands/Arguments.h"
+#include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/LiveServices.h"
 #include "CommandLine/Program/Logging.h"
 #include "CommandLine/Program/ProgramFolders.h"
@@ -10,6 +11,7 @@
 #include "Platform/Resources.h"
 
 #include <csignal>
+#include <system_error>
 
 namespace {
 
@@ -50,6 +52,17 @@ int run(const Arguments& arguments)
     return ExitStatus::Failed;
 }
 
+/// The system may give not even what every program needs, such as descriptors.
+int runUnlessExhausted(const Arguments& arguments)
+{
+    try {
+        return run(arguments);
+    } catch (const std::system_error& error) {
+        report(error.what());
+        return ExitStatus::Failed;
+    }
+}
+
 } // namespace
 
 int main(int argc, char** argv)
@@ -71,6 +84,6 @@ int main(int argc, char** argv)
     Logging logging;
     if (!logging.start(arguments.logFile, isLive(arguments.job) ? Logging::Use::Live : Logging::Use::Offline))
         return ExitStatus::Failed;
-    const int status = run(arguments);
+    const int status = runUnlessExhausted(arguments);
     return logging.finish() ? status : ExitStatus::Failed;
 }

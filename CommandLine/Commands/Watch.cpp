@@ -5,9 +5,10 @@
 #include "CommandLine/Program/LiveServices.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/SpectrelModel.h"
+#include "Platform/Qt/PatientOutput.h"
 #include "Platform/Qt/TerminationSignals.h"
 
-#include <cstdio>
+#include <string>
 
 namespace spectrel {
 
@@ -15,9 +16,11 @@ namespace {
 
 class Watching final : public SpectrelModelObserver {
 public:
-    explicit Watching(const WatchOptions& options)
+    Watching(const WatchOptions& options, PatientOutput& reader, LiveServices& live)
         : _options(options)
-        , _output(stdout, options.format)
+        , _live(live)
+        , _reader(reader)
+        , _output(reader.stream(), options.format)
         , _model(_live.services(), &LogGenerator::generatorFromTechnology, *this, LiveServices::portPrefixFor("Watch"))
         , _journal(printsChanges(options.format) ? &_model.displayState().followChanges() : nullptr)
     {
@@ -30,12 +33,21 @@ public:
     int run()
     {
         Ending::install(_model.displayState(), {});
-        const TerminationSignals terminationSignals([this](int) { _live.runLoop().quit(); });
+        bool isAskedToEnd = false;
+        const TerminationSignals terminationSignals([&](int) {
+            isAskedToEnd = true;
+            _live.runLoop().quit();
+        });
+        _reader.setChangeHandler([this] { readerDidChange(); });
         _live.runLoop().async([this] { _model.restartMonitor(); });
         if (_options.duration)
             _live.runLoop().after(*_options.duration, [this] { _live.runLoop().quit(); });
         _output.flush();
         _live.runLoop().run();
+        _reader.setChangeHandler({});
+        const auto taken = _reader.finish(_live.runLoop(), [&isAskedToEnd] { return isAskedToEnd; });
+        if (!taken && _status == 0)
+            fail(taken.failure().text);
         return _status;
     }
 
@@ -48,11 +60,9 @@ public:
             _output.printLine("");
         if (_journal)
             _output.printChanges(_refreshes, Clock::installed().now(), display, *_journal);
-        if (!_output.flush()) {
-            report("standard output: cannot be written");
-            _status = 1;
-            _live.runLoop().quit();
-        }
+        if (!_output.flush())
+            return fail("cannot be written");
+        _model.setHeld(_reader.waiting() > PatientOutput::Plenty);
         if (++_refreshes == _options.count)
             _live.runLoop().quit();
     }
@@ -64,8 +74,23 @@ public:
     }
 
 private:
+    void fail(const std::string& why)
+    {
+        report("standard output: " + why);
+        _status = 1;
+        _live.runLoop().quit();
+    }
+    void readerDidChange()
+    {
+        if (_reader.failure() && _status == 0)
+            fail("cannot be written");
+        else
+            _model.setHeld(false);
+    }
+
     const WatchOptions& _options;
-    LiveServices _live;
+    LiveServices& _live;
+    PatientOutput& _reader;
     OutputWriter _output;
     SpectrelModel _model;
     Journal* const _journal; // where changes are printed
@@ -77,7 +102,13 @@ private:
 
 int watch(const WatchOptions& options)
 {
-    return Watching(options).run();
+    LiveServices live;
+    const auto output = PatientOutput::open("-");
+    if (!output) {
+        report(output.failure().of("standard output").text);
+        return 1;
+    }
+    return Watching(options, **output, live).run();
 }
 
 } // namespace spectrel

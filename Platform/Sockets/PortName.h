@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Platform/Sockets/FileDescriptor.h"
+#include "Values/Result.h"
 
 #include <optional>
 #include <string>
@@ -18,8 +19,8 @@ std::optional<sockaddr_un> portAddress(const std::string& directory, std::string
 /// latest.
 class NameLock {
 public:
-    /// None when another process, or another object of this one, holds the name.
-    static std::optional<NameLock> take(const std::string& directory, std::string_view name);
+    /// Fails with `Exists` when another process, or another object of this one, holds the name.
+    static Result<NameLock> take(const std::string& directory, std::string_view name);
 
     NameLock(NameLock&&) = default;
     NameLock& operator=(NameLock&&) = delete;

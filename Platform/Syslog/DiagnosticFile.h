@@ -18,6 +18,11 @@ public:
     ~DiagnosticFile() override;
 
     void write(std::string_view line) override;
+    /// False when a line could not be written since the log began.
+    bool flush()
+    {
+        return _file->flush();
+    }
 
 private:
     explicit DiagnosticFile(std::unique_ptr<FileLog> file);
