@@ -36,5 +36,13 @@ TEST_F(DiagnosticFileTest, FileThatCannotBeMadeIsTold)
     EXPECT_EQ(DiagnosticLog::installed(), nullptr);
 }
 
+TEST(DiagnosticFileTest, LinesThatFindNoRoomAreReported)
+{
+    const auto log = *DiagnosticFile::create("/dev/full");
+    EXPECT_TRUE(log->flush());
+    log->write("a line");
+    EXPECT_FALSE(log->flush());
+}
+
 } // namespace
 } // namespace spectrel
