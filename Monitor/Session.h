@@ -2,6 +2,7 @@
 
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/DisplayState.h"
+#include "Platform/Context.h"
 #include "Platform/Lifetime.h"
 #include "Platform/MessagePort.h"
 #include "Platform/RunLoop.h"
@@ -73,6 +74,7 @@ public:
         RunLoop& runLoop;
         MessagePorts& ports;
         TelephonyServer& telephony;
+        Context context {};
     };
 
     static constexpr std::chrono::seconds RetryDelay {5};

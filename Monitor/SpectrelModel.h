@@ -123,6 +123,7 @@ private:
     }
 
     RunLoop& _runLoop;
+    const Clock& _clock;
     SpectrelModelObserver& _observer;
     Lifetime _lifetime;
     std::size_t _intake = 0; // bytes applied since the last refresh

@@ -2,6 +2,8 @@
 
 #include "Values/List.h"
 
+#include <cstdint>
+#include <cstring>
 #include <set>
 
 namespace spectrel {
@@ -13,6 +15,34 @@ constexpr std::size_t NotFound = static_cast<std::size_t>(-1);
 
 /// Above this many entries a search goes through the sorted index; below, a walk is faster.
 constexpr std::size_t LargestWalked = 48;
+
+std::uint64_t wordAt(const char* place)
+{
+    std::uint64_t word;
+    std::memcpy(&word, place, sizeof word);
+    return word;
+}
+
+/// Whether two texts are equal: keys are short, so that the call of a general comparison would cost more than itself.
+bool isSame(std::string_view left, std::string_view right)
+{
+    const std::size_t size = left.size();
+    if (size != right.size())
+        return false;
+    if (size < sizeof(std::uint64_t)) {
+        for (std::size_t at = 0; at < size; ++at) {
+            if (left[at] != right[at])
+                return false;
+        }
+        return true;
+    }
+    const std::size_t lastWord = size - sizeof(std::uint64_t);
+    for (std::size_t at = 0; at < lastWord; at += sizeof(std::uint64_t)) {
+        if (wordAt(left.data() + at) != wordAt(right.data() + at))
+            return false;
+    }
+    return wordAt(left.data() + lastWord) == wordAt(right.data() + lastWord);
+}
 
 /// Orders positions by the keys they hold; a text finds its position without being copied.
 struct ByKey {
@@ -54,10 +84,18 @@ DictionaryRef Dictionary::make(std::initializer_list<Entry> entries)
     return std::make_shared<Dictionary>(entries);
 }
 
+/// The entries, with nothing remembered of where they stand.
+std::vector<Dictionary::Entry>& Dictionary::entriesToRewrite()
+{
+    _index.reset();
+    _next = 0;
+    return _entries;
+}
+
 std::size_t Dictionary::positionOf(std::string_view key) const
 {
     const std::size_t count = _entries.size();
-    if (_next < count && _entries[_next].key == key)
+    if (_next < count && isSame(_entries[_next].key, key))
         return _next++;
     if (count > LargestWalked) {
         if (!_index) {
@@ -72,7 +110,7 @@ std::size_t Dictionary::positionOf(std::string_view key) const
         return *found;
     }
     for (std::size_t position = 0; position < count; ++position) {
-        if (_entries[position].key == key) {
+        if (isSame(_entries[position].key, key)) {
             _next = position + 1;
             return position;
         }
@@ -82,8 +120,10 @@ std::size_t Dictionary::positionOf(std::string_view key) const
 
 std::size_t Dictionary::append(std::string_view key, Value value)
 {
-    _entries.push_back({std::string(key), std::move(value)});
-    const std::size_t position = _entries.size() - 1;
+    const std::size_t position = _entries.size();
+    Entry& entry = _entries.emplace_back();
+    entry.key = key;
+    entry.value = std::move(value);
     if (_index)
         _index->insert(position);
     _next = 0;
@@ -120,7 +160,7 @@ void Dictionary::setText(std::string_view key, std::string_view text)
     if (_observer)
         _observer->willStoreText(key, position == NotFound ? NoValue : _entries[position].value, text);
     if (position == NotFound)
-        append(key, text);
+        append(key, Value(text));
     else
         _entries[position].value.assignText(text);
 }

@@ -51,6 +51,11 @@ public:
     void setText(std::string_view key, std::string_view text);
     void remove(std::string_view key);
     void removeAll();
+    /// Makes room for so many entries.
+    void reserve(std::size_t count)
+    {
+        _entries.reserve(count);
+    }
 
     /// A new dictionary with the same entries and no observer; containers inside stay shared.
     DictionaryRef copy() const;
@@ -66,8 +71,10 @@ public:
     }
 
 private:
+    friend class DictionaryRewriting;
     struct Index;
 
+    std::vector<Entry>& entriesToRewrite();
     std::size_t positionOf(std::string_view key) const;
     std::size_t append(std::string_view key, Value value);
 

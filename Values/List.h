@@ -56,6 +56,8 @@ public:
     }
 
 private:
+    friend class ListRewriting;
+
     std::unique_ptr<ContainerObserver> _observer;
     std::vector<Value> _elements;
 };

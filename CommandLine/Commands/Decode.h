@@ -1,6 +1,8 @@
 #pragma once
 
+#include "CommandLine/Commands/EventOutput.h"
 #include "CommandLine/Output/OutputWriter.h"
+#include "Platform/Context.h"
 #include "Records/Recording.h"
 
 #include <optional>
@@ -12,15 +14,16 @@ namespace spectrel {
 /// What `spectrel decode` was asked for.
 struct DecodeOptions {
     std::vector<std::string> files;
-    OutputFormat format = OutputFormat::Tree;
+    OutputOptions output;
     bool each = false; // with Json: one line for each message
     bool keepGoing = false; // past a message that would end the running application
     std::optional<Technology> technology; // where a file does not say
     std::optional<std::string> snapshotDirectory;
+    EventOptions events;
 };
 
 /// Decodes the recordings one after the other, as one session, and prints the display to standard output. Answers the
 /// program's exit status.
-int decode(const DecodeOptions& options);
+int decode(const DecodeOptions& options, const Context& context);
 
 } // namespace spectrel

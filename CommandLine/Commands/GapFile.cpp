@@ -1,24 +1,17 @@
 #include "CommandLine/Commands/GapFile.h"
 
+#include "Records/Beside/Gaps.h"
 #include "Values/OwnFile.h"
 
 #include <chrono>
 #include <cstdio>
-#include <filesystem>
 #include <unistd.h>
 
 namespace spectrel {
 
-std::string GapFile::pathFor(const std::string& recording)
-{
-    return std::filesystem::path(recording).replace_extension(".gaps").string();
-}
-
 GapFile::GapFile(const std::string& recording)
-    : _path(pathFor(recording))
+    : _path(gapsPath(recording))
 {
-    if (_path != recording)
-        ::unlink(_path.c_str());
 }
 
 GapFile::~GapFile()

@@ -12,9 +12,6 @@ namespace spectrel {
 /// there only where some are.
 class GapFile {
 public:
-    /// "drive.gaps" beside "drive.pcap".
-    static std::string pathFor(const std::string& recording);
-    /// Removes what belongs to a former recording of the name.
     explicit GapFile(const std::string& recording);
     GapFile(const GapFile&) = delete;
     GapFile& operator=(const GapFile&) = delete;

@@ -2,14 +2,18 @@
 
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/LiveServices.h"
+#include "CommandLine/Program/RecorderPort.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/Session.h"
 #include "Platform/Qt/PatientOutput.h"
 #include "Platform/Qt/TerminationSignals.h"
+#include "Records/Beside/Marks.h"
 #include "Records/Recording.h"
 
+#include <filesystem>
 #include <functional>
 #include <memory>
+#include <string>
 #include <sys/stat.h>
 #include <utility>
 
@@ -41,6 +45,8 @@ public:
         , _output(std::move(output))
         , _files(options.files, live.clock(), streamOf(_output.get()))
         , _session(_live.services(), *this, LiveServices::portPrefixFor("Record"))
+        , _marks(_live.services().ports, LiveServices::portPrefixFor("Record"),
+              {[this] { return recording(); }, [this](const std::string& note) { return mark(note); }})
     {
     }
 
@@ -66,7 +72,7 @@ public:
 
     void useTechnology(const Value& technology) override
     {
-        _generator = LogGenerator::generatorFromTechnology(technology);
+        _generator = LogGenerator::generatorFromTechnology(technology, _live.context());
     }
     LogGenerator* generator() override
     {
@@ -160,6 +166,29 @@ private:
             _live.runLoop().after(FlushDelay, [this] { flush(); });
     }
 
+    /// The file that is being written, for whoever asks from another folder.
+    Result<std::string> recording() const
+    {
+        if (_output)
+            return Failure {
+                RecordingFiles::spoken(_options.files.target) + " is recorded to, beside which no bookmark can stand"};
+        if (_files.count() == 0)
+            return Failure {"the recorder has no file yet, for no session is open"};
+        std::error_code error;
+        const auto path = std::filesystem::absolute(_files.path(), error);
+        return error ? _files.path() : path.string();
+    }
+
+    Result<std::string> mark(const std::string& note) const
+    {
+        const auto file = recording();
+        if (!file)
+            return file;
+        if (auto appended = appendMark(*file, {_live.clock().now(), note}); !appended)
+            return appended.failure();
+        return file;
+    }
+
     void flush()
     {
         _flushIsDue = false;
@@ -211,6 +240,7 @@ private:
     RecordingFiles _files;
     std::unique_ptr<LogGenerator> _generator; // for its start command: nothing is decoded
     Session _session;
+    RecorderPort _marks;
     std::uint64_t _messages = 0;
     std::uint64_t _lost = 0;
     std::uint64_t _lostForRoom = 0; // since the disk is full
@@ -222,9 +252,9 @@ private:
 
 } // namespace
 
-int record(const RecordOptions& options)
+int record(const RecordOptions& options, const Context& context)
 {
-    LiveServices live;
+    LiveServices live(context);
     std::unique_ptr<PatientOutput> output;
     if (isStream(options.files.target)) {
         auto opened = PatientOutput::open(options.files.target);

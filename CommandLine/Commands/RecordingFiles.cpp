@@ -1,5 +1,6 @@
 #include "CommandLine/Commands/RecordingFiles.h"
 
+#include "Records/Beside/Beside.h"
 #include "Records/Capture/CaptureFormat.h"
 #include "Values/OwnFile.h"
 
@@ -56,18 +57,16 @@ std::vector<std::pair<std::uint64_t, fs::path>> numberedFiles(const std::string&
     return files;
 }
 
-/// A file that somebody writes is locked, and stays; what stands beside one goes with it. False when it stays.
+/// With what stands beside it. A file that somebody writes is locked, and stays; false then.
 bool removeUnlessWritten(const fs::path& path)
 {
     const int file = ::open(path.c_str(), O_RDONLY | O_NOFOLLOW | O_NONBLOCK | O_CLOEXEC);
     if (file < 0)
         return false;
     const bool isRemoved = ::flock(file, LOCK_EX | LOCK_NB) == 0 && ::unlink(path.c_str()) == 0;
+    if (isRemoved)
+        removeBeside(path.string());
     ::close(file);
-    for (const char* beside : {".gaps", ".marks"}) {
-        if (isRemoved)
-            ::unlink(fs::path(path).replace_extension(beside).c_str());
-    }
     return isRemoved;
 }
 
@@ -193,6 +192,8 @@ Outcome RecordingFiles::createNext(Technology technology)
         while (!created && created.failure().code == Failure::Code::NoRoom && makeRoom())
             created = create(technology, isTarget);
         if (created) {
+            if (!_stream)
+                removeBeside(_path); // of an earlier recording of this name
             _writer = *std::move(created);
             return Done();
         }

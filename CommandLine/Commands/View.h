@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Platform/Context.h"
 #include "Records/Recording.h"
 
 #include <optional>
@@ -17,6 +18,6 @@ struct ViewOptions {
 
 /// Browses a recording or a snapshot in the screens that the arguments and the surroundings ask for. No session is
 /// started, nothing is saved and no preference is written. Answers the program's exit status.
-int view(const Arguments& arguments);
+int view(const Arguments& arguments, const Context& context);
 
 } // namespace spectrel

@@ -1,13 +1,16 @@
 #include "CommandLine/Commands/Watch.h"
 
+#include "CommandLine/Output/CellOutput.h"
 #include "CommandLine/Program/CrashReport.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/LiveServices.h"
+#include "CommandLine/Program/ProviderNames.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/SpectrelModel.h"
 #include "Platform/Qt/PatientOutput.h"
 #include "Platform/Qt/TerminationSignals.h"
 
+#include <optional>
 #include <string>
 
 namespace spectrel {
@@ -20,10 +23,14 @@ public:
         : _options(options)
         , _live(live)
         , _reader(reader)
-        , _output(reader.stream(), options.format)
+        , _output(reader.stream(), options.output)
         , _model(_live.services(), &LogGenerator::generatorFromTechnology, *this, LiveServices::portPrefixFor("Watch"))
-        , _journal(printsChanges(options.format) ? &_model.displayState().followChanges() : nullptr)
+        , _journal(printsChanges(options.output.format) ? &_model.displayState().followChanges() : nullptr)
     {
+        if (options.output.format == OutputFormat::Events || options.events.hasAlarms())
+            _events.emplace(_model.displayState(), options.events, options.output, _output, &_operators);
+        if (printsCells(options.output.format))
+            _cells.emplace(_model.displayState(), _output, options.output, &_operators);
     }
     ~Watching() override
     {
@@ -32,7 +39,7 @@ public:
 
     int run()
     {
-        Ending::install(_model.displayState(), {});
+        Ending::install(_model.displayState(), _live.context(), {});
         bool isAskedToEnd = false;
         const TerminationSignals terminationSignals([&](int) {
             isAskedToEnd = true;
@@ -44,6 +51,7 @@ public:
             _live.runLoop().after(*_options.duration, [this] { _live.runLoop().quit(); });
         _output.flush();
         _live.runLoop().run();
+        finish();
         _reader.setChangeHandler({});
         const auto taken = _reader.finish(_live.runLoop(), [&isAskedToEnd] { return isAskedToEnd; });
         if (!taken && _status == 0)
@@ -56,19 +64,27 @@ public:
         _model.topLevelNodes(); // builds the display, and the history entry of this refresh
         const Value& display = _model.displayState().display();
         _output.printDisplay(display);
-        if (_options.format == OutputFormat::Tree)
+        if (_options.output.format == OutputFormat::Tree)
             _output.printLine("");
         if (_journal)
-            _output.printChanges(_refreshes, Clock::installed().now(), display, *_journal);
-        if (!_output.flush())
-            return fail("cannot be written");
+            _output.printChanges(_refreshes, _live.clock().now(), display, *_journal);
+        _output.printRow(_live.clock().now(), display);
+        if (_cells)
+            _cells->refresh(_live.clock().now());
+        if (_events)
+            _events->refresh(_live.clock().now());
+        flush();
         _model.setHeld(_reader.waiting() > PatientOutput::Plenty);
-        if (++_refreshes == _options.count)
+        if (++_refreshes == _options.count || (_events && _events->isUntilMet()))
             _live.runLoop().quit();
     }
 
     void sessionDidChange() override
     {
+        if (_events) {
+            _events->sessionDidChange(_model.isConnected(), _model.lostReason(), _live.clock().now());
+            flush();
+        }
         if (!_model.isConnected() && !_model.lostReason().empty())
             report("Connecting... (" + _model.lostReason() + ")");
     }
@@ -88,21 +104,43 @@ private:
             _model.setHeld(false);
     }
 
+    void flush()
+    {
+        if (!_output.flush() && _status == 0)
+            fail("cannot be written");
+    }
+
+    void finish()
+    {
+        if (!_events)
+            return;
+        _events->finish();
+        if (!_output.flush())
+            _status = 1;
+        if (_options.events.until && !_events->isUntilMet()) {
+            report("the alarm '" + _options.events.until->text + "' was not raised");
+            _status = 1;
+        }
+    }
+
     const WatchOptions& _options;
     LiveServices& _live;
     PatientOutput& _reader;
     OutputWriter _output;
     SpectrelModel _model;
     Journal* const _journal; // where changes are printed
+    ProviderNames _operators;
+    std::optional<CellOutput> _cells;
+    std::optional<EventOutput> _events; // where events are printed or alarms raised
     std::uint64_t _refreshes = 0;
     int _status = 0;
 };
 
 } // namespace
 
-int watch(const WatchOptions& options)
+int watch(const WatchOptions& options, const Context& context)
 {
-    LiveServices live;
+    LiveServices live(context);
     const auto output = PatientOutput::open("-");
     if (!output) {
         report(output.failure().of("standard output").text);

@@ -1,7 +1,8 @@
 #include "CommandLine/Output/OutputWriter.h"
 
 #include "CommandLine/Output/DisplayPrinter.h"
-#include "CommandLine/Output/JsonText.h"
+#include "Values/JsonText.h"
+#include "Values/Moment.h"
 #include "Values/Table.h"
 
 #include <array>
@@ -11,16 +12,6 @@ namespace spectrel {
 namespace {
 
 constexpr std::size_t WriteSize = 64 * 1024;
-
-/// Seconds since 1970 with six decimals.
-std::string timeText(Moment time)
-{
-    const auto seconds = std::chrono::floor<std::chrono::seconds>(time);
-    char text[40];
-    std::snprintf(text, sizeof text, "%lld.%06lld", static_cast<long long>(seconds.time_since_epoch().count()),
-        static_cast<long long>((time - seconds).count()));
-    return text;
-}
 
 /// A field of RFC 4180: quoted where it holds a separator, a quote or a line end.
 void appendCsvField(std::string_view field, std::string& out)
@@ -46,31 +37,46 @@ std::optional<OutputFormat> outputFormatNamed(std::string_view name)
         std::string_view name;
         OutputFormat format;
     };
-    static constexpr std::array<NamedFormat, 5> Formats {{
+    static constexpr std::array<NamedFormat, 9> Formats {{
         {"tree", OutputFormat::Tree},
         {"json", OutputFormat::Json},
         {"changes", OutputFormat::Changes},
         {"csv", OutputFormat::Csv},
+        {"table", OutputFormat::Table},
+        {"cells", OutputFormat::Cells},
+        {"summary", OutputFormat::Summary},
+        {"events", OutputFormat::Events},
         {"none", OutputFormat::None},
     }};
     const auto* known = findRow(Formats, name, &NamedFormat::name);
     return known ? std::optional(known->format) : std::nullopt;
 }
 
-OutputWriter::OutputWriter(std::FILE* stream, OutputFormat format)
+OutputWriter::OutputWriter(std::FILE* stream, const OutputOptions& options)
     : _stream(stream)
-    , _format(format)
+    , _options(options)
+    , _format(options.format)
+    , _paths(options.paths)
+    , _changes(_paths)
 {
-    if (format == OutputFormat::Csv)
+    if (_format == OutputFormat::Csv) {
         _gathered += "n,time,path,value\r\n";
+    } else if (_format == OutputFormat::Table) {
+        _gathered += "time";
+        for (const TableColumn& column : options.columns) {
+            _gathered += ',';
+            appendCsvField(column.name, _gathered);
+        }
+        _gathered += "\r\n";
+    }
 }
 
 void OutputWriter::printDisplay(const Value& display)
 {
     if (_format == OutputFormat::Tree) {
-        appendTree(display, _gathered);
+        appendTree(display, _gathered, _paths);
     } else if (_format == OutputFormat::Json) {
-        appendJson(display, _gathered);
+        appendJson(display, _gathered, _paths);
         _gathered += '\n';
     }
     flushWhenLarge();
@@ -79,7 +85,7 @@ void OutputWriter::printDisplay(const Value& display)
 void OutputWriter::printNumberedJson(std::uint64_t n, const Value& display)
 {
     _gathered += "{\"n\": " + std::to_string(n) + ", \"display\": ";
-    appendJson(display, _gathered);
+    appendJson(display, _gathered, _paths);
     _gathered += "}\n";
     flushWhenLarge();
 }
@@ -88,14 +94,15 @@ void OutputWriter::printChanges(std::uint64_t n, Moment time, const Value& displ
 {
     _changes.update(display, journal, [&](const std::string& path, const std::string* value) {
         if (_format == OutputFormat::Csv) {
-            _gathered += std::to_string(n) + "," + timeText(time) + ",";
+            _gathered += std::to_string(n) + "," + timeText(time, _options.time) + ",";
             appendCsvField(path, _gathered);
             _gathered += ',';
             appendCsvField(value ? std::string_view(*value) : std::string_view(), _gathered);
             _gathered += "\r\n";
             return;
         }
-        _gathered += "{\"n\": " + std::to_string(n) + ", \"time\": " + timeText(time) + ", \"path\": ";
+        _gathered +=
+            "{\"n\": " + std::to_string(n) + ", \"time\": " + jsonTimeText(time, _options.time) + ", \"path\": ";
         appendJsonText(path, _gathered);
         _gathered += ", \"value\": ";
         if (value)
@@ -104,6 +111,19 @@ void OutputWriter::printChanges(std::uint64_t n, Moment time, const Value& displ
             _gathered += "null";
         _gathered += "}\n";
     });
+    flushWhenLarge();
+}
+
+void OutputWriter::printRow(Moment time, const Value& display)
+{
+    if (_format != OutputFormat::Table)
+        return;
+    _gathered += timeText(time, _options.time);
+    for (const TableColumn& column : _options.columns) {
+        _gathered += ',';
+        appendCsvField(leafAtPath(display, column.path).value_or(""), _gathered);
+    }
+    _gathered += "\r\n";
     flushWhenLarge();
 }
 

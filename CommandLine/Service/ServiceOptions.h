@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Records/Recording.h"
-#include "Telephony/Simulator/Journey.h"
+#include "Telephony/Simulator/Scene.h"
 #include "Telephony/Sources/ReplaySource.h"
 
 #include <chrono>
@@ -18,6 +18,7 @@ struct SimulateOptions {
     std::uint32_t seed = 1;
     double rate = 1;
     std::string file; // write a recording and end
+    std::string truth; // with that: a file for what the simulated world decided; empty: none
     std::chrono::milliseconds duration = std::chrono::minutes(1);
 };
 

@@ -15,7 +15,7 @@ namespace spectrel {
 /// `SimInfo objSimInfo {*this};`
 class ClassIndex : protected SectionRegistry {
 public:
-    ClassIndex() = default;
+    explicit ClassIndex(const Context& given = {});
     ClassIndex(const ClassIndex&) = delete;
     ClassIndex& operator=(const ClassIndex&) = delete;
     /// Writes "Deallocing ClassIndex" to the console.

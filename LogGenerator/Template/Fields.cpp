@@ -41,6 +41,7 @@ void storeFields(RecordView record, std::span<const Field> fields, Dictionary& i
 DictionaryRef entryWithFields(RecordView record, std::span<const Field> fields, std::size_t start)
 {
     auto entry = std::make_shared<Dictionary>();
+    entry->reserve(fields.size());
     storeFields(record, fields, *entry, start);
     return entry;
 }

@@ -48,24 +48,30 @@ std::vector<DictionaryRef> cellsOf(
 
 } // namespace
 
-const std::optional<Value>& PropertyListPayloads::of(RecordView record)
+PropertyListPayloads::Payload& PropertyListPayloads::latestOf(std::uint32_t code)
 {
-    const ByteView payload = recordPayload(record);
-    if (!std::ranges::equal(payload, _latest)) {
-        _parsed = parsePropertyList(payload);
-        _latest.assign(payload.begin(), payload.end());
-    }
-    return _parsed;
+    const auto found = std::ranges::find(_latest, code, &Payload::code);
+    return found == _latest.end() ? _latest.emplace_back(Payload {code, {}, {}}) : *found;
 }
 
-LogCode_0xFF0000::LogCode_0xFF0000(RecordView record, PropertyListPayloads& payloads)
+const Value& PropertyListPayloads::of(RecordView record)
 {
-    const auto& files = payloads.of(record);
-    if (!files) {
-        SPECTREL_LOG(Priority::Error, "SIM File dictionary data could not be constructed");
+    const ByteView bytes = recordPayload(record);
+    Payload& latest = latestOf(routingCode(record));
+    if (!std::ranges::equal(bytes, latest.bytes)) {
+        readPropertyList(bytes, latest.parsed);
+        latest.bytes.assign(bytes.begin(), bytes.end());
+    }
+    return latest.parsed;
+}
+
+LogCode_0xFF0000::LogCode_0xFF0000(RecordView record, PropertyListPayloads& payloads, SystemLog& log)
+    : _files(payloads.of(record))
+{
+    if (_files.isAbsent()) {
+        SPECTREL_LOG(log, Priority::Error, "SIM File dictionary data could not be constructed");
         throw UnknownDataException();
     }
-    _files = *files;
 }
 
 const Value& LogCode_0xFF0000::operator[](std::string_view key) const
@@ -75,17 +81,15 @@ const Value& LogCode_0xFF0000::operator[](std::string_view key) const
 }
 
 ContextArrayReader::ContextArrayReader(RecordView record, PropertyListPayloads& payloads)
+    : _contexts(payloads.of(record).list())
 {
-    if (const auto& contexts = payloads.of(record))
-        _contexts = contexts->list();
 }
 
-CellInfoArrayReader::CellInfoArrayReader(RecordView record, PropertyListPayloads& payloads)
+CellInfoArrayReader::CellInfoArrayReader(RecordView record, PropertyListPayloads& payloads, SystemLog& log)
+    : _cells(payloads.of(record))
 {
-    if (const auto& cells = payloads.of(record))
-        _cells = *cells;
-    else
-        SPECTREL_LOG(Priority::Error, "Cell Info Array data could not be constructed");
+    if (_cells.isAbsent())
+        SPECTREL_LOG(log, Priority::Error, "Cell Info Array data could not be constructed");
 }
 
 std::vector<DictionaryRef> CellInfoArrayReader::servingCells(std::span<const std::string_view> technologies) const

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Platform/SystemLog.h"
 #include "Records/RecordView.h"
 #include "Values/Bytes.h"
 #include "Values/List.h"
@@ -7,7 +8,6 @@
 
 #include <cstdint>
 #include <exception>
-#include <optional>
 #include <span>
 #include <string_view>
 #include <vector>
@@ -16,16 +16,23 @@
 /// object for the duration of one update.
 namespace spectrel {
 
-/// The payloads, parsed. The latest is kept, as several sections read the same record one after the other, and many a
-/// record says what the one before it said. Whoever holds its nodes only reads them.
+/// The payloads, parsed. The latest of each log code is kept, as several sections read the same record one after the
+/// other, and many a record says what the one before it said. Whoever holds its nodes only reads them.
 class PropertyListPayloads {
 public:
-    /// The payload's property list; none when it does not parse. Lives until the next call.
-    const std::optional<Value>& of(RecordView record);
+    /// The payload's property list; absent when it does not parse. Lives until the next call. The next one of the code
+    /// is written over it, except over the nodes that somebody holds.
+    const Value& of(RecordView record);
 
 private:
-    Bytes _latest;
-    std::optional<Value> _parsed;
+    struct Payload {
+        std::uint32_t code;
+        Bytes bytes;
+        Value parsed;
+    };
+    Payload& latestOf(std::uint32_t code);
+
+    std::vector<Payload> _latest;
 };
 
 /// SIM files, code 0xFF0000: a dictionary.
@@ -36,7 +43,7 @@ public:
     /// Raised when the payload does not parse. Nothing catches it: the process ends.
     class UnknownDataException : public std::exception { };
 
-    LogCode_0xFF0000(RecordView record, PropertyListPayloads& payloads);
+    LogCode_0xFF0000(RecordView record, PropertyListPayloads& payloads, SystemLog& log);
     /// The value under a key; absent when there is none.
     const Value& operator[](std::string_view key) const;
 
@@ -66,7 +73,7 @@ public:
     static constexpr std::uint32_t Code = 0xFF0001;
 
     /// Logs "Cell Info Array data could not be constructed" when the payload does not parse.
-    CellInfoArrayReader(RecordView record, PropertyListPayloads& payloads);
+    CellInfoArrayReader(RecordView record, PropertyListPayloads& payloads, SystemLog& log);
     /// False when the payload did not parse.
     bool holdsAnything() const
     {

@@ -34,7 +34,7 @@ public:
 
     /// `runLoop`, `observer` and `clock` outlive the model; the clock is set to the moment shown.
     RecordingModel(RunLoop& runLoop, GeneratorFactory makeGenerator, SpectrelModelObserver& observer,
-        ViewedClock& clock, RecordingTrack track, Report report);
+        ViewedClock& clock, RecordingTrack track, Report report, const Context& context);
 
     bool isConnected() const override
     {
@@ -114,6 +114,7 @@ private:
     SpectrelModelObserver& _observer;
     ViewedClock& _clock;
     RecordingTrack _track;
+    Context _context;
     Report _report;
     Lifetime _lifetime; // of jobs on the queue
 

@@ -26,8 +26,8 @@ public:
         const std::string& path, std::optional<Technology> technology, const Clock& deviceClock, std::string& reason);
 
     /// Once. `report` gets a line for each message that would have ended the running application.
-    std::unique_ptr<MonitorModel> makeModel(
-        RunLoop& runLoop, GeneratorFactory makeGenerator, SpectrelModelObserver& observer, Report report);
+    std::unique_ptr<MonitorModel> makeModel(RunLoop& runLoop, GeneratorFactory makeGenerator,
+        SpectrelModelObserver& observer, Report report, const Context& context);
     /// Stands at the moment shown.
     const Clock& clock() const
     {

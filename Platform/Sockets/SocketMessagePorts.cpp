@@ -28,7 +28,7 @@ FileDescriptor makeSocket()
 }
 
 /// A socket listening at the address. A file that is there is a dead process's: the caller holds the name's lock.
-Result<FileDescriptor> listenAt(const sockaddr_un& address)
+Result<FileDescriptor> listenAt(const sockaddr_un& address, SystemLog& log)
 {
     FileDescriptor socket = makeSocket();
     ::unlink(address.sun_path);
@@ -36,14 +36,15 @@ Result<FileDescriptor> listenAt(const sockaddr_un& address)
         && ::listen(socket.number(), Backlog) == 0)
         return socket;
     const Failure failure = Failure::ofSystem().of(address.sun_path);
-    SPECTREL_LOG(Priority::Error, "Message port %s", failure.text.c_str());
+    SPECTREL_LOG(log, Priority::Error, "Message port %s", failure.text.c_str());
     return failure;
 }
 
 } // namespace
 
-SocketMessagePorts::SocketMessagePorts(std::string directory)
+SocketMessagePorts::SocketMessagePorts(std::string directory, SystemLog& log)
     : _directory(std::move(directory))
+    , _log(log)
 {
 }
 
@@ -51,7 +52,7 @@ Outcome SocketMessagePorts::prepareDirectory(const std::string& directory, std::
 {
     if (auto made = makePrivateDirectory(directory); !made)
         return made;
-    if (!portAddress(directory, name))
+    if (!portAddress(directory, name, SystemLog::none()))
         return Failure {directory + ": with a port's name the path is longer than 107 bytes"};
     return Done();
 }
@@ -64,30 +65,30 @@ MessagePorts::LocalResult SocketMessagePorts::createLocal(
         if (auto existing = held->second.lock(); existing && existing->isValid())
             return {std::move(existing), true, std::nullopt};
     }
-    const auto address = portAddress(_directory, name);
+    const auto address = portAddress(_directory, name, _log);
     if (!address)
         return {nullptr, false, Failure {std::string(name) + ": cannot be a port's name", Failure::Code::Refused}};
     if (const auto made = makePrivateDirectory(_directory); !made) {
-        SPECTREL_LOG(Priority::Error, "Message ports: %s", made.failure().text.c_str());
+        SPECTREL_LOG(_log, Priority::Error, "Message ports: %s", made.failure().text.c_str());
         return {nullptr, false, made.failure()};
     }
     auto lock = NameLock::take(_directory, name);
     if (!lock)
         return {nullptr, false, lock.failure()};
     const auto adopted = _adopted.extract(std::string(name));
-    auto socket = adopted ? Result<FileDescriptor>(std::move(adopted.mapped())) : listenAt(*address);
+    auto socket = adopted ? Result<FileDescriptor>(std::move(adopted.mapped())) : listenAt(*address, _log);
     if (!socket)
         return {nullptr, false, socket.failure()};
     // The file of a socket that was made elsewhere is not ours to remove.
     auto port = std::make_shared<SocketLocalPort>(std::string(name), adopted ? std::string() : address->sun_path,
-        *std::move(lock), *std::move(socket), std::move(handler));
+        *std::move(lock), *std::move(socket), std::move(handler), _log);
     _locals.insert_or_assign(std::string(name), port);
     return {std::move(port), false, std::nullopt};
 }
 
 Outcome SocketMessagePorts::adopt(std::string_view name, FileDescriptor socket)
 {
-    const auto expected = portAddress(_directory, name);
+    const auto expected = portAddress(_directory, name, _log);
     sockaddr_un address = {};
     socklen_t length = sizeof address;
     if (!expected || ::getsockname(socket.number(), reinterpret_cast<sockaddr*>(&address), &length) != 0
@@ -101,14 +102,14 @@ Outcome SocketMessagePorts::adopt(std::string_view name, FileDescriptor socket)
 
 std::shared_ptr<RemoteMessagePort> SocketMessagePorts::createRemote(std::string_view name)
 {
-    const auto address = portAddress(_directory, name);
+    const auto address = portAddress(_directory, name, _log);
     if (!address)
         return nullptr;
     FileDescriptor socket = makeSocket();
     if (!socket || ::connect(socket.number(), reinterpret_cast<const sockaddr*>(&*address), sizeof *address) != 0
         || !wire::isPeerOfThisUser(socket.number()))
         return nullptr;
-    return std::make_shared<SocketRemotePort>(std::string(name), std::move(socket));
+    return std::make_shared<SocketRemotePort>(std::string(name), std::move(socket), _log);
 }
 
 } // namespace spectrel

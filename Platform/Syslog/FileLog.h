@@ -34,7 +34,8 @@ private:
         }
     };
     FileLog(std::FILE* file, Writing writing)
-        : _file(file)
+        : SystemLog(EveryPriority)
+        , _file(file)
         , _writing(writing)
     {
     }

@@ -14,8 +14,7 @@ namespace {
 
 using Activity = CDMAActivity;
 
-constexpr std::uint8_t BandClass = 1; // 1.8 to 2.0 GHz
-constexpr std::uint16_t OneXChannel = 425;
+using CDMACarriers::BandClass;
 
 /// What stands in one subpacket, without its head.
 struct Subpacket {
@@ -47,6 +46,9 @@ std::uint8_t oneXDeviceState(const CDMAReport& report)
     constexpr std::uint8_t Paging = 6;
     constexpr std::uint8_t Sleep = 7;
     constexpr std::uint8_t Traffic = 8;
+    constexpr std::uint8_t Acquisition = 3;
+    if (!report.isInService)
+        return Acquisition;
     if (report.activity == Activity::Voice)
         return Traffic;
     return report.isAwake ? Paging : Sleep;
@@ -61,8 +63,8 @@ std::uint8_t gainOf(double power)
 Bytes rfContent(const CDMAReport& report)
 {
     Bytes content {BandClass, BandClass};
-    append16(content, OneXChannel);
-    append16(content, OneXChannel);
+    append16(content, CDMACarriers::OneX);
+    append16(content, CDMACarriers::OneX);
     content.push_back(gainOf(report.received));
     content.push_back(gainOf(report.receivedBySecond));
     append16(content, static_cast<std::uint16_t>(std::lround(report.transmitted * 10)));
@@ -126,9 +128,12 @@ std::uint16_t energyOf(double ratio)
     return static_cast<std::uint16_t>(std::clamp<long>(std::lround(ratio * 512), 1, 0xFFFF));
 }
 
-std::uint8_t evdoDeviceState(Activity activity)
+std::uint8_t evdoDeviceState(const CDMAReport& report)
 {
-    switch (activity) {
+    constexpr std::uint8_t Acquisition = 1;
+    if (!report.isInService)
+        return Acquisition;
+    switch (report.activity) {
     case Activity::Voice:
         return 0; // inactive
     case Activity::Idle:
@@ -143,7 +148,7 @@ std::uint8_t evdoDeviceState(Activity activity)
 
 bool hasEVDO(const CDMAReport& report)
 {
-    return report.activity != Activity::Voice;
+    return report.activity != Activity::Voice && report.isInService;
 }
 
 std::uint8_t wholePower(double power)
@@ -203,17 +208,16 @@ Bytes cdmaFrameRecord(const CDMAReport& report, Moment time)
 
 Bytes evdoAirLinkRecord(const CDMAReport& report, Moment time)
 {
-    constexpr std::uint16_t Channel = 325;
     constexpr std::uint8_t SessionOpen = 4;
     constexpr std::uint32_t UATI = 0x0A4C17; // low 24 bits of the terminal's address
     return RecordWriter(0x1183, time)
-        .u16(BandClass << 11 | Channel)
+        .u16(BandClass << 11 | CDMACarriers::EVDO)
         .u8(wholePower(report.received))
         .u8(wholePower(report.receivedBySecond))
         .u8(wholePower(report.transmitted))
         .u16(hasEVDO(report) ? report.serving.pn : UnassignedPN)
         .zeros(16) // rates asked for and granted
-        .u8(evdoDeviceState(report.activity))
+        .u8(evdoDeviceState(report))
         .u8(SessionOpen)
         .u16(UATI)
         .u8(UATI >> 16)

@@ -3,6 +3,7 @@
 #include "Platform/Clock.h"
 #include "Records/Recording.h"
 #include "Telephony/Simulator/Journey.h"
+#include "Telephony/Simulator/Move.h"
 #include "Values/Bytes.h"
 
 #include <chrono>
@@ -20,11 +21,15 @@ public:
     using Emit = std::function<void(ByteView record)>;
 
     virtual ~Baseband() = default;
+    /// May be another one after a step: the records of that step are the old one's, and a listener is to be greeted
+    /// anew.
     virtual Technology technology() const = 0;
     /// The slow records, which a new channel gets at once.
     virtual void greet(Moment now, const Emit& emit) const = 0;
     /// Moves by one step and reports what is due then, stamped with `now`.
     virtual void advance(Moment now, const Emit& emit) = 0;
+    /// What its world decided in the last step; before the first step, where it began.
+    virtual std::span<const Move> moves() const = 0;
 };
 
 /// One kind of record and how often it comes.
@@ -36,8 +41,8 @@ template <typename World> struct Cadence {
 
 /// A baseband whose records come steadily. The same seed gives the same drive.
 ///
-/// `World` is built from a scene and a seed and has `advance(std::chrono::milliseconds)`. Records within a step come in
-/// the order of the cadences; one that `make` leaves empty is not sent.
+/// `World` is built from a scene and a seed and has `advance(std::chrono::milliseconds)` and `moves()`. Records within
+/// a step come in the order of the cadences; one that `make` leaves empty is not sent.
 template <typename World> class SteadyBaseband final : public Baseband {
 public:
     /// `cadences` outlive the baseband.
@@ -70,6 +75,19 @@ public:
         }
     }
 
+    std::span<const Move> moves() const override
+    {
+        return _world.moves();
+    }
+    World& world()
+    {
+        return _world;
+    }
+    const World& world() const
+    {
+        return _world;
+    }
+
 private:
     void report(const Cadence<World>& cadence, Moment now, const Emit& emit) const
     {
@@ -84,7 +102,7 @@ private:
     std::chrono::milliseconds _elapsed {0};
 };
 
-/// The simulated baseband of a technology; null where there is none.
+/// The simulated baseband of a technology; null where it has no such scene. On a journey it begins with the technology.
 std::unique_ptr<Baseband> makeBaseband(Technology technology, Scene scene, std::uint32_t seed);
 
 // One for each technology that can be simulated.

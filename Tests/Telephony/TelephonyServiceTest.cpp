@@ -127,7 +127,7 @@ protected:
     FakeRunLoop loop;
     FakeMessagePorts ports;
     ListSource source;
-    TelephonyService service {loop, ports, source};
+    TelephonyService service {loop, loop, ports, source};
 };
 
 TEST_F(TelephonyServiceTest, ChannelIsOpenedWithAPortOfItsOwn)
@@ -292,7 +292,7 @@ TEST_F(TelephonyServiceTest, ChangeOfBasebandEndsAllChannelsAndTheServiceStays)
 
 TEST_F(TelephonyServiceTest, LossIsAMessageWithAnIdOfItsOwn)
 {
-    auto channel = LogChannel::open(loop, ports, source, 9, "client", [] {});
+    auto channel = LogChannel::open(loop, loop, ports, source, 9, "client", [] {});
     ASSERT_NE(channel, nullptr);
     ports.sent.clear();
     EXPECT_TRUE(channel->reportLoss(29'593));
@@ -308,7 +308,7 @@ TEST_F(TelephonyServiceTest, LossIsAMessageWithAnIdOfItsOwn)
 
 TEST_F(TelephonyServiceTest, SecondServiceIsRefused)
 {
-    TelephonyService second(loop, ports, source);
+    TelephonyService second(loop, loop, ports, source);
     const auto started = second.start();
     ASSERT_FALSE(started);
     EXPECT_EQ(started.failure().code, Failure::Code::Exists);

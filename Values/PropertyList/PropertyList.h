@@ -24,6 +24,11 @@ struct PropertyListLimits {
 /// list's order; a key given twice keeps its last value.
 std::optional<Value> parsePropertyList(ByteView bytes);
 
+/// The same into a value that may hold an earlier list: its containers and texts are used again, as far as nobody else
+/// holds them, so that lists which differ little from one to the next take no memory anew. Absent, and false, when the
+/// list does not parse.
+bool readPropertyList(ByteView bytes, Value& value);
+
 /// The XML form (format code 100), UTF-8, as every reader of property lists takes it; dictionary entries in their
 /// order. None when the value cannot be written: absent, deeper or larger than the limits, a text that XML cannot carry
 /// (control characters, malformed UTF-8), a date outside the years 0 to 9999.

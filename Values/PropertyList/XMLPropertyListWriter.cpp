@@ -3,6 +3,7 @@
 #include "Values/List.h"
 #include "Values/PropertyList/PropertyList.h"
 #include "Values/PropertyList/PropertyListScalars.h"
+#include "Values/PropertyList/XMLPropertyListForm.h"
 #include "Values/UTF8.h"
 
 #include <algorithm>
@@ -15,11 +16,6 @@ namespace spectrel {
 
 namespace {
 
-constexpr std::string_view Head =
-    "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
-    "<!DOCTYPE plist PUBLIC \"-//Apple//DTD PLIST 1.0//EN\" \"http://www.apple.com/DTDs/PropertyList-1.0.dtd\">\n"
-    "<plist version=\"1.0\">\n";
-constexpr std::string_view Foot = "</plist>\n";
 constexpr std::size_t BytesPerDataLine = 57; // 76 characters
 
 /// The length of the well-formed UTF-8 character at the front that XML can carry; 0 when there is none.
@@ -80,10 +76,10 @@ private:
 
 std::optional<std::string> XMLWriter::write(const Value& value)
 {
-    _out = Head;
+    _out = XMLPropertyListHead;
     if (!writeValue(value, 0))
         return std::nullopt;
-    _out += Foot;
+    _out += XMLPropertyListFoot;
     return _out.size() <= PropertyListLimits::SerialisedBytes ? std::optional(std::move(_out)) : std::nullopt;
 }
 

@@ -4,12 +4,16 @@
 #include "Telephony/Reports/UMTSCell.h"
 #include "Telephony/Simulator/Dice.h"
 #include "Telephony/Simulator/Journey.h"
+#include "Telephony/Simulator/Move.h"
 #include "Telephony/Simulator/Propagation.h"
 
 #include <chrono>
 #include <vector>
 
 namespace spectrel {
+
+CellName nameOf(const UMTSCell& cell);
+CellName nameOf(const GSMCell& cell);
 
 /// A ring road past NodeBs and GSM base stations. Through one stretch, a valley, UMTS does not reach.
 class GSMUMTSRoad {
@@ -19,6 +23,10 @@ public:
     /// Drives on, and hears every cell anew.
     void advance(std::chrono::milliseconds step, Dice& dice);
 
+    Scene scene() const
+    {
+        return _journey.scene();
+    }
     const std::vector<UMTSCell>& umts() const
     {
         return _umts;
@@ -45,6 +53,7 @@ private:
     void addGSMCell(double position, bool is1800, Dice& dice);
     void measure();
 
+    double _length; // metres
     Journey _journey;
     std::vector<UMTSCell> _umts;
     std::vector<GSMCell> _gsm;

@@ -4,9 +4,11 @@
 #include "Telephony/Simulator/Dice.h"
 #include "Telephony/Simulator/Journey.h"
 #include "Telephony/Simulator/MastRoad.h"
+#include "Telephony/Simulator/Move.h"
 
 #include <chrono>
 #include <cstdint>
+#include <span>
 #include <vector>
 
 namespace spectrel {
@@ -26,6 +28,10 @@ public:
     }
     /// The strongest other cells that can be heard, strongest first.
     std::vector<IFXCell> neighbours() const;
+    bool isInService() const
+    {
+        return _isInService;
+    }
     bool isTalking() const;
     /// Seconds since the call began; 0 without one.
     std::chrono::seconds talkingFor() const;
@@ -49,18 +55,27 @@ public:
     {
         return static_cast<std::uint64_t>(_sent);
     }
+    /// What was decided in the last step.
+    std::span<const Move> moves() const
+    {
+        return _moves.moves();
+    }
     /// All of it, for the message.
     IFXReport report() const;
 
 private:
     void measure();
+    void reselect();
     std::size_t strongest() const;
 
+    bool _isAlwaysTalking;
+    bool _isInService = true;
     Dice _dice;
     MastRoad _road;
     std::vector<IFXCell> _cells; // one a mast
     std::size_t _serving = 0;
     std::chrono::milliseconds _elapsed {0};
+    MoveLog _moves;
     unsigned _quality = 0;
     unsigned _cellsVisited = 1;
     double _received = 0;

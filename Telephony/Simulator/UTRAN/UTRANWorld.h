@@ -2,14 +2,17 @@
 
 #include "Telephony/Reports/UTRANCell.h"
 #include "Telephony/Reports/UTRANReports.h"
+#include "Telephony/Simulator/Coverage.h"
 #include "Telephony/Simulator/Dice.h"
 #include "Telephony/Simulator/Journey.h"
+#include "Telephony/Simulator/Move.h"
 #include "Telephony/Simulator/Propagation.h"
 #include "Telephony/Simulator/RRCConnection.h"
 #include "Telephony/Simulator/Usage.h"
 
 #include <chrono>
 #include <cstdint>
+#include <span>
 #include <vector>
 
 namespace spectrel {
@@ -49,6 +52,11 @@ public:
     std::vector<GSMNeighbour> gsmNeighbours() const;
     /// Empty unless the phone is on a dedicated channel.
     TransportReport transportChannels() const;
+    /// What was decided in the last step.
+    std::span<const Move> moves() const
+    {
+        return _moves.moves();
+    }
     std::uint64_t bytesReceived() const
     {
         return static_cast<std::uint64_t>(_received);
@@ -58,16 +66,36 @@ public:
         return static_cast<std::uint64_t>(_sent);
     }
 
+    // On a journey between technologies, as `TechnologyPart` says.
+    void advanceAway(std::chrono::milliseconds step);
+    Coverage coverage() const;
+    double servingMargin() const;
+    CellName servingName() const;
+    bool isOnOwnChannel() const;
+    bool isSettled() const;
+    void arrive(Technology from, MoveKind how);
+    void leave();
+    void setOthers(const Coverage& utran, const Coverage& gsm);
+
 private:
+    bool isCalling() const
+    {
+        return _journey.scene() == Scene::Handover || _calls.isOn();
+    }
     void buildRoad();
+    void advanceRoad(std::chrono::milliseconds step);
+    std::size_t strongest() const;
     void measure();
     void reselect(std::chrono::milliseconds step);
+    MoveCause causeOfMove() const;
     bool isNamed(const UTRANCell& cell) const;
     bool isMeasured(const UTRANCell& cell) const;
     bool isDetected(const UTRANCell& cell) const;
     void controlPower();
 
     Dice _dice;
+    double _roadLength; // metres
+    Valley _siteLess; // no sites there
     Journey _journey;
     std::vector<UTRANCell> _cells;
     std::vector<Shadowing> _shadowing; // one for each cell
@@ -79,6 +107,7 @@ private:
     Habit _calls;
     Habit _transfers;
     RRCConnection _connection;
+    MoveLog _moves;
     double _signalToInterference = 0; // dB, of the dedicated channels
     double _received = 0;
     double _sent = 0;
