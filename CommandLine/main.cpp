@@ -2,6 +2,7 @@
 
 #include "CommandLine/Commands/Application.h"
 #include "CommandLine/Commands/Arguments.h"
+#include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/LiveServices.h"
 #include "CommandLine/Program/Logging.h"
 #include "CommandLine/Program/ProgramFolders.h"
@@ -10,6 +11,7 @@
 #include "Platform/Qt/QtClock.h"
 
 #include <csignal>
+#include <system_error>
 
 namespace {
 
@@ -56,6 +58,17 @@ int run(const Arguments& arguments, const Context& context)
     return ExitStatus::Failed;
 }
 
+/// The system may give not even what every program needs, such as descriptors.
+int runUnlessExhausted(const Arguments& arguments, const Context& context)
+{
+    try {
+        return run(arguments, context);
+    } catch (const std::system_error& error) {
+        report(error.what());
+        return ExitStatus::Failed;
+    }
+}
+
 } // namespace
 
 int main(int argc, char** argv)
@@ -78,6 +91,6 @@ int main(int argc, char** argv)
     Logging logging;
     if (!logging.start(arguments.logFile, isLive(arguments.job) ? Logging::Use::Live : Logging::Use::Offline))
         return ExitStatus::Failed;
-    const int status = run(arguments, {clock, resources, logging.log(), console, logging.diagnostics()});
+    const int status = runUnlessExhausted(arguments, {clock, resources, logging.log(), console, logging.diagnostics()});
     return logging.finish() ? status : ExitStatus::Failed;
 }

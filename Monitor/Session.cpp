@@ -80,7 +80,7 @@ bool Session::createPorts()
     if (_portPrefix.empty())
         return false;
     const std::string localName = _portPrefix + std::string(PortSuffix);
-    auto [port, existed] = _services.ports.createLocal(localName, [this](std::int32_t id, ByteView body) {
+    auto [port, existed, failure] = _services.ports.createLocal(localName, [this](std::int32_t id, ByteView body) {
         handleMessage(id, body);
         return std::nullopt;
     });
@@ -237,6 +237,17 @@ void Session::handleMessage(std::int32_t id, ByteView body) noexcept
     // Nothing catches what a record raises: the process ends here, and the terminate handler finds the message.
     if (id == TelephonyProtocol::LogChannelId)
         _sink.receive(body);
+    else if (id == TelephonyProtocol::LossId)
+        handleLoss(body);
+}
+
+void Session::handleLoss(ByteView body)
+{
+    const auto report = parsePropertyList(body);
+    const auto lost =
+        report && report->dictionary() ? (*report->dictionary())[TelephonyProtocol::LostKey].int32() : std::nullopt;
+    if (lost && *lost > 0)
+        _sink.messagesWereLost(static_cast<std::uint64_t>(*lost));
 }
 
 void Session::handleInvalidation(const LocalMessagePort* port)

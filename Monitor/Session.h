@@ -54,6 +54,11 @@ public:
     virtual LogGenerator* generator() = 0;
     /// One log message body. What it raises ends the process.
     virtual void receive(ByteView body) = 0;
+    /// So many messages were lost before the next one: this program was too slow for the service.
+    virtual void messagesWereLost(std::uint64_t count)
+    {
+        static_cast<void>(count);
+    }
     /// A refresh tick, or news of the connection to the service.
     virtual void sessionDidTick() { }
     /// The session was opened or lost, or the reason why there is none has changed.
@@ -109,6 +114,7 @@ public:
 
 private:
     void handleMessage(std::int32_t id, ByteView body) noexcept;
+    void handleLoss(ByteView body);
     void handleInvalidation(const LocalMessagePort* port);
     bool openLogChannel(const std::string& localName, std::string& serviceName);
     std::optional<Value> askTechnology();

@@ -27,9 +27,18 @@ void SpectrelModel::updateWithData(ByteView data)
         _session.pause();
 }
 
+void SpectrelModel::setHeld(bool isHeld)
+{
+    _isHeld = isHeld;
+    if (isHeld)
+        _session.pause(); // ends with the next tick
+}
+
 void SpectrelModel::sessionDidTick()
 {
     _intake = 0;
+    if (_isHeld)
+        _session.pause();
     if (!_display.takeNews())
         return;
     _nodes.reset();

@@ -67,6 +67,8 @@ public:
     {
         _session.start();
     }
+    /// Whether whoever shows the display keeps up: while not, no messages are taken.
+    void setHeld(bool isHeld);
     void restartMonitor() override
     {
         _session.restart();
@@ -125,6 +127,7 @@ private:
     SpectrelModelObserver& _observer;
     Lifetime _lifetime;
     std::size_t _intake = 0; // bytes applied since the last refresh
+    bool _isHeld = false;
     DisplayState _display;
     NodeRef _nodes;
     std::unique_ptr<PathIndex> _nodesByPath; // set and cleared together with the tree

@@ -1,5 +1,7 @@
 #include "Platform/Console.h"
 
+#include "Platform/ErrorOutput.h"
+
 #include <cstdio>
 
 namespace spectrel {
@@ -22,7 +24,7 @@ Console& Console::none()
 
 void StandardErrorConsole::line(std::string_view text)
 {
-    std::fprintf(stderr, "%.*s\n", static_cast<int>(text.size()), text.data());
+    writeErrorLine("", text);
 }
 
 void StandardOutputConsole::line(std::string_view text)

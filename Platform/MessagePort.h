@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Values/Bytes.h"
+#include "Values/Result.h"
 
 #include <chrono>
 #include <cstddef>
@@ -72,8 +73,9 @@ public:
 class MessagePorts {
 public:
     struct LocalResult {
-        std::shared_ptr<LocalMessagePort> port; // null: the name is held by another live process, or cannot be had
+        std::shared_ptr<LocalMessagePort> port; // null: there is none
         bool existed = false; // the port of that name was made earlier by this very process
+        std::optional<Failure> failure = std::nullopt; // without a port: why; `Exists`: another process holds the name
     };
 
     virtual ~MessagePorts() = default;

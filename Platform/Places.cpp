@@ -3,6 +3,7 @@
 #include "Values/OwnFile.h"
 
 #include <cerrno>
+#include <cstdio>
 #include <cstdlib>
 #include <filesystem>
 #include <sys/stat.h>
@@ -29,6 +30,14 @@ std::string baseDirectory(const char* name, const char* belowHome)
         return value;
     const std::string home = variable("HOME");
     return (home.empty() ? "/tmp/spectrel-" + std::to_string(::getuid()) : home) + "/" + belowHome;
+}
+
+/// "1777"
+std::string modeText(mode_t mode)
+{
+    char digits[8];
+    std::snprintf(digits, sizeof digits, "%o", mode & 07777);
+    return digits;
 }
 
 } // namespace
@@ -90,8 +99,9 @@ Outcome makePrivateDirectory(const std::string& path)
         return Failure::ofSystem().of(path);
     if (!S_ISDIR(status.st_mode) || status.st_uid != ::geteuid())
         return Failure {path + ": not a folder of this user", Failure::Code::Refused};
-    if ((status.st_mode & 0777) != 0700 && ::chmod(path.c_str(), 0700) != 0)
-        return Failure::ofSystem().of(path);
+    if ((status.st_mode & (S_IWGRP | S_IWOTH)) != 0)
+        return Failure {
+            path + ": others can write there (mode " + modeText(status.st_mode) + ")", Failure::Code::Refused};
     return Done();
 }
 

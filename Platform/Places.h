@@ -16,8 +16,8 @@ struct Places {
     static std::string resourcesDirectory(); // Resources/ beside the program, the installed data directory otherwise
 };
 
-/// Makes a private folder (mode 0700) with its parents. Fails, naming the folder, when it cannot be made or belongs to
-/// somebody else.
+/// Makes a private folder (mode 0700) with its parents. One that is there stays as it is: it may be read by others.
+/// Fails, naming the folder, when it cannot be made, belongs to somebody else, is a link, or can be written by others.
 Outcome makePrivateDirectory(const std::string& path);
 
 } // namespace spectrel

@@ -27,6 +27,11 @@ public:
     virtual const std::string& name() const = 0;
     /// Whether another writer may come after one has ended.
     virtual bool takesFurtherWriters() const = 0;
+    /// Whether programs of others can write, such as a web page over TCP: a stream then has to say what it is.
+    virtual bool isOpenToOthers() const
+    {
+        return false;
+    }
     virtual void start(Listener& listener) = 0;
     /// A paused input reads nothing, so that its writer has to wait.
     virtual void setPaused(bool isPaused) = 0;

@@ -35,6 +35,11 @@ inline constexpr const char* SetStateKey = "SetState";
 inline constexpr const char* StreamingState = "Streaming";
 inline constexpr const char* OrdinaryCodesKey = "SetZephyrLogCodes";
 inline constexpr const char* ExtraCodesKey = "SetRkExtraCodes";
+/// Between log messages, on the client's port: {"Lost": integer} with this message id says that so many messages that
+/// the client had asked for were dropped before the next one, because it was too slow. Who does not care ignores the
+/// id.
+inline constexpr std::int32_t LossId = 2;
+inline constexpr const char* LostKey = "Lost";
 /// A request that cannot be understood is answered by {"Error": text} where an answer is wanted.
 
 } // namespace spectrel::TelephonyProtocol

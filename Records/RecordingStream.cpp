@@ -23,8 +23,9 @@ bool startsPcapng(ByteView bytes)
 
 class CutStream final : public RecordingStream {
 public:
-    explicit CutStream(std::optional<Technology> technology)
+    CutStream(std::optional<Technology> technology, StreamHeader header)
         : _fallback(technology)
+        , _header(header)
     {
     }
     void append(ByteView bytes) override
@@ -61,6 +62,7 @@ private:
     bool addToRun(std::uint64_t offset, const StreamCutter::Piece& damage);
 
     std::optional<Technology> _fallback;
+    StreamHeader _header;
     std::optional<Technology> _technology;
     StreamBuffer _buffer;
     std::unique_ptr<StreamCutter> _cutter; // once the first bytes have told the kind
@@ -82,6 +84,8 @@ bool CutStream::chooseCutter()
         refuse("it is pcapng; only classic pcap and DLF are relayed");
     } else if (startsCapture(bytes)) {
         _cutter = std::make_unique<CaptureStream>(_fallback);
+    } else if (_header == StreamHeader::Required && !startsWithVersionReport(bytes)) {
+        refuse("it starts with the header of neither a capture nor DLF, which is asked for where others can write");
     } else if (_fallback) {
         _cutter = std::make_unique<DLFStream>(*_fallback);
     } else if (startsWithVersionReport(bytes)) {
@@ -148,9 +152,9 @@ StreamStep CutStream::stepFor(StreamCutter::Found found)
 
 } // namespace
 
-std::unique_ptr<RecordingStream> makeRecordingStream(std::optional<Technology> technology)
+std::unique_ptr<RecordingStream> makeRecordingStream(std::optional<Technology> technology, StreamHeader header)
 {
-    return std::make_unique<CutStream>(technology);
+    return std::make_unique<CutStream>(technology, header);
 }
 
 } // namespace spectrel

@@ -19,6 +19,9 @@ enum class StreamStep : std::uint8_t {
     Refused, // `reason` says why nothing of this stream can be used; final
 };
 
+/// Whether a stream has to begin with the header of a capture or of DLF, or may be bare items and messages.
+enum class StreamHeader : std::uint8_t { Optional, Required };
+
 /// Bytes of a stream that were no message.
 struct SkippedBytes {
     std::uint64_t offset = 0; // from the stream's first byte
@@ -52,6 +55,7 @@ public:
 };
 
 /// `technology`: where the stream does not name it.
-std::unique_ptr<RecordingStream> makeRecordingStream(std::optional<Technology> technology);
+std::unique_ptr<RecordingStream> makeRecordingStream(
+    std::optional<Technology> technology, StreamHeader header = StreamHeader::Optional);
 
 } // namespace spectrel

@@ -10,7 +10,8 @@
 namespace spectrel {
 
 /// Live messages on their way to one client: what it has no room for waits here. The queue is bounded; beyond it the
-/// oldest go, and the loss is reported once the client takes messages again.
+/// oldest go. Once the client takes messages again the loss is reported, to the client at the place where they are
+/// missing.
 class ChannelQueue {
 public:
     static constexpr std::size_t MaxMessages = 4096;
@@ -35,12 +36,14 @@ public:
 
 private:
     void dropOldest();
+    bool reportLoss();
 
     MessageSink& _sink;
     std::deque<Bytes> _waiting;
     std::size_t _bytes = 0; // of those waiting
     std::uint64_t _lost = 0;
-    std::uint64_t _reportedLost = 0;
+    std::uint64_t _reportedLost = 0; // to the client
+    std::uint64_t _printedLost = 0;
 };
 
 } // namespace spectrel

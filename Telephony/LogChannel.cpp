@@ -7,6 +7,8 @@
 #include "Values/List.h"
 #include "Values/PropertyList/PropertyList.h"
 
+#include <algorithm>
+#include <limits>
 #include <utility>
 
 namespace spectrel {
@@ -144,7 +146,7 @@ void LogChannel::startStreaming(Subscription subscription)
 
 bool LogChannel::deliver(ByteView message)
 {
-    if (!_subscription || !_subscription->wants(message)) {
+    if (!wants(message)) {
         ++_status.notAskedFor;
         return true;
     }
@@ -155,6 +157,17 @@ bool LogChannel::deliver(ByteView message)
     _status.isFull = status == SendStatus::SendTimeout;
     if (status == SendStatus::Success)
         ++_status.sent;
+    return !_status.isFull;
+}
+
+bool LogChannel::reportLoss(std::uint64_t messages)
+{
+    constexpr std::uint64_t MostReported = std::numeric_limits<std::int32_t>::max();
+    const auto lost = static_cast<std::int32_t>(std::min(messages, MostReported));
+    const SendStatus status = _client->sendRequest(Protocol::LossId,
+        serialised(Dictionary::make({{Protocol::LostKey, Value::integer(lost)}})), std::chrono::nanoseconds::zero(),
+        std::chrono::nanoseconds::zero(), ReplyMode::None, nullptr);
+    _status.isFull = status == SendStatus::SendTimeout;
     return !_status.isFull;
 }
 

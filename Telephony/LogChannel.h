@@ -61,6 +61,11 @@ public:
     ~LogChannel() override;
 
     bool deliver(ByteView message) override;
+    bool wants(ByteView message) const override
+    {
+        return _subscription && _subscription->wants(message);
+    }
+    bool reportLoss(std::uint64_t messages) override;
 
     /// Of the port for requests.
     const std::string& portName() const

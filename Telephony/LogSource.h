@@ -18,6 +18,18 @@ public:
     /// Delivers one message, or lets it go when the client did not ask for its code. False when the client has no room
     /// now: nothing was delivered, and `LogStream::resume` is called once there is room.
     virtual bool deliver(ByteView message) = 0;
+    /// Whether the client asked for it; one that is not wanted is delivered at any time, and let go.
+    virtual bool wants(ByteView message) const
+    {
+        static_cast<void>(message);
+        return true;
+    }
+    /// Says to the client that so many messages were lost before the next one. False when it has no room now.
+    virtual bool reportLoss(std::uint64_t messages)
+    {
+        static_cast<void>(messages);
+        return true;
+    }
 };
 
 /// One channel's stream; it ends with its destruction.

@@ -1,12 +1,12 @@
 #include "Telephony/ServiceLine.h"
 
-#include <cstdio>
+#include "Platform/ErrorOutput.h"
 
 namespace spectrel {
 
 void printServiceLine(const std::string& line)
 {
-    std::fprintf(stderr, "spectrel-telephonyd: %s\n", line.c_str());
+    writeErrorLine("spectrel-telephonyd", line);
 }
 
 } // namespace spectrel

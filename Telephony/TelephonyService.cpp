@@ -41,16 +41,16 @@ TelephonyService::~TelephonyService()
     _port->invalidate();
 }
 
-bool TelephonyService::start()
+Outcome TelephonyService::start()
 {
-    const auto [port, existed] = _ports.createLocal(
+    const auto made = _ports.createLocal(
         Protocol::ServicePort, [this](std::int32_t id, ByteView body) { return handleRequest(id, body); });
-    if (!port || existed)
-        return false;
-    _port = port;
+    if (!made.port || made.existed)
+        return made.failure.value_or(Failure {"another service runs there", Failure::Code::Exists});
+    _port = made.port;
     _port->serve();
     _source.setBasebandHandler([this] { endChannels(); });
-    return true;
+    return Done();
 }
 
 /// Another baseband is to speak now: the clients are to ask for its technology, and choose their codes, anew.

@@ -4,6 +4,7 @@
 #include "Platform/RunLoop.h"
 #include "Telephony/LogChannel.h"
 #include "Telephony/LogSource.h"
+#include "Values/Result.h"
 
 #include <cstddef>
 #include <functional>
@@ -25,8 +26,8 @@ public:
     TelephonyService(const TelephonyService&) = delete;
     TelephonyService& operator=(const TelephonyService&) = delete;
 
-    /// Takes the service's port; false when another service holds it.
-    bool start();
+    /// Takes the service's port; fails with `Exists` when another service holds it.
+    Outcome start();
     std::size_t channels() const
     {
         return _channels.size();

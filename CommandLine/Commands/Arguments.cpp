@@ -1,6 +1,7 @@
 #include "CommandLine/Commands/Arguments.h"
 
 #include "CommandLine/Options/OptionTypes.h"
+#include "CommandLine/Program/ErrorLine.h"
 #include "Records/Beside/Marks.h"
 
 #include <CLI/CLI.hpp>
@@ -329,7 +330,11 @@ std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
         program.parse(argc, argv);
         checkTogether(arguments);
     } catch (const CLI::Success& answered) {
-        return program.exit(answered); // --help and --version, on standard output
+        program.exit(answered); // --help and --version, on standard output
+        if (std::cout.flush())
+            return ExitStatus::Done;
+        report("standard output: cannot be written");
+        return ExitStatus::Failed;
     } catch (const CLI::ParseError& error) {
         std::cerr << "spectrel: " << error.what() << " (see spectrel --help)\n";
         return ExitStatus::WrongUsage;

@@ -14,6 +14,7 @@
 #include <sys/file.h>
 #include <sys/stat.h>
 #include <unistd.h>
+#include <utility>
 
 namespace spectrel {
 
@@ -56,31 +57,25 @@ std::vector<std::pair<std::uint64_t, fs::path>> numberedFiles(const std::string&
     return files;
 }
 
-/// With what stands beside it. A file that somebody writes is locked, and stays.
-void removeUnlessWritten(const fs::path& path)
+/// With what stands beside it. A file that somebody writes is locked, and stays; false then.
+bool removeUnlessWritten(const fs::path& path)
 {
     const int file = ::open(path.c_str(), O_RDONLY | O_NOFOLLOW | O_NONBLOCK | O_CLOEXEC);
     if (file < 0)
-        return;
-    if (::flock(file, LOCK_EX | LOCK_NB) == 0) {
-        ::unlink(path.c_str());
+        return false;
+    const bool isRemoved = ::flock(file, LOCK_EX | LOCK_NB) == 0 && ::unlink(path.c_str()) == 0;
+    if (isRemoved)
         removeBeside(path.string());
-    }
     ::close(file);
-}
-
-/// Whether there is something else than a file, such as a device.
-bool isOther(const std::string& path)
-{
-    struct stat status { };
-    return ::lstat(path.c_str(), &status) == 0 && !S_ISREG(status.st_mode);
+    return isRemoved;
 }
 
 } // namespace
 
-RecordingFiles::RecordingFiles(RecordingFilesOptions options, const Clock& clock)
+RecordingFiles::RecordingFiles(RecordingFilesOptions options, const Clock& clock, RecordingOutput stream)
     : _options(std::move(options))
     , _clock(clock)
+    , _stream(std::move(stream))
 {
 }
 
@@ -98,8 +93,8 @@ Outcome RecordingFiles::prepare()
         if (auto made = makeOwnFolders(target); !made)
             return made;
     }
-    const std::string folder = _isFolder ? target : fs::path(target).parent_path().string();
-    if (target != "-" && ::access(folder.empty() ? "." : folder.c_str(), W_OK) != 0)
+    const std::string place = folder();
+    if (!_stream && ::access(place.empty() ? "." : place.c_str(), W_OK) != 0)
         return Failure::ofSystem().of(target);
     return checkTarget();
 }
@@ -108,21 +103,21 @@ Outcome RecordingFiles::prepare()
 Outcome RecordingFiles::checkTarget() const
 {
     struct stat status { };
-    if (_options.target == "-" || _isFolder || ::lstat(_options.target.c_str(), &status) != 0)
+    if (_stream || _isFolder || _options.overwrite || ::lstat(_options.target.c_str(), &status) != 0)
         return Done();
-    if (S_ISREG(status.st_mode) && !_options.overwrite)
+    if (S_ISREG(status.st_mode))
         return Failure {_options.target + ": is there already (--overwrite writes over it)", Failure::Code::Exists};
     return Done();
 }
 
-/// Behind the highest of the folder.
+/// Behind the highest of the folder, and of those that were there.
 Result<std::uint64_t> RecordingFiles::nextNumber() const
 {
     const auto files = numberedFiles(_options.target);
     const std::uint64_t latest = files.empty() ? 0 : files.back().first;
     if (latest == std::numeric_limits<std::uint64_t>::max())
         return Failure {files.back().second.string() + ": has the highest number that there is; no file can follow it"};
-    return latest + 1;
+    return std::max(latest, _number) + 1;
 }
 
 Outcome RecordingFiles::begin(Technology technology)
@@ -130,13 +125,20 @@ Outcome RecordingFiles::begin(Technology technology)
     return _writer ? Done() : beginNext(technology);
 }
 
+/// Without room for a further file the current one goes on.
 Outcome RecordingFiles::write(Technology technology, ByteView message)
 {
-    if (!_writer || technology != _technology || isFull(message.size())) {
-        if (auto begun = beginNext(technology); !begun)
-            return begun;
+    const bool mustBegin = !_writer || technology != _technology;
+    if (mustBegin || isFull(message.size())) {
+        if (auto begun = beginNext(technology); !begun) {
+            if (mustBegin || !_writer || begun.failure().code != Failure::Code::NoRoom)
+                return begun;
+        }
     }
-    if (const auto written = _writer->write(_clock.now(), message); !written)
+    auto written = _writer->write(_clock.now(), message);
+    while (!written && written.failure().code == Failure::Code::NoRoom && makeRoom())
+        written = _writer->write(_clock.now(), message);
+    if (!written)
         return written.failure().of(spoken(_path));
     _bytes += PacketHeaderSize + message.size();
     return Done();
@@ -153,23 +155,32 @@ bool RecordingFiles::isFull(std::size_t message) const
 
 Outcome RecordingFiles::beginNext(Technology technology)
 {
-    if (_writer && _options.target == "-")
-        return Failure {"standard output: one stream cannot tell of another technology; the recording ends"};
+    if (_writer && _stream)
+        return Failure {spoken(_path) + ": one stream cannot tell of another technology; the recording ends"};
     if (auto flushed = flush(); !flushed)
         return flushed;
+    _writer.reset(); // gives its lock up: it is one of those that may have to go
+    _gaps.reset();
+    if (_options.keep)
+        removeBeyond(*_options.keep - 1);
     if (auto created = createNext(technology); !created)
         return created;
     ++_count;
     _technology = technology;
     _bytes = CaptureHeaderSize;
     _begun = _clock.steady();
-    removeOldest();
+    _isNamed = false;
+    if (!_stream)
+        _gaps = std::make_unique<GapFile>(_path);
+    if (!_isFolder)
+        _written.push_back(_path);
     return Done();
 }
 
 /// Two recorders never share a file, for a number that is taken is passed over.
 Outcome RecordingFiles::createNext(Technology technology)
 {
+    const std::uint64_t before = _number;
     for (;;) {
         const auto number = _isFolder ? nextNumber() : Result<std::uint64_t>(_number + 1);
         if (!number)
@@ -177,19 +188,27 @@ Outcome RecordingFiles::createNext(Technology technology)
         _number = *number;
         _path = numberedPath(technology);
         const bool isTarget = _path == _options.target;
-        const bool mayOverwrite = isTarget && (_path == "-" || _options.overwrite || isOther(_path));
-        auto created = (mayOverwrite ? createRecording : createNewRecording)(_path, technology);
+        auto created = create(technology, isTarget);
+        while (!created && created.failure().code == Failure::Code::NoRoom && makeRoom())
+            created = create(technology, isTarget);
         if (created) {
-            if (_path != "-" && !isOther(_path))
+            if (!_stream && !isOther(_path))
                 removeBeside(_path); // of an earlier recording of this name
             _writer = *std::move(created);
             return Done();
         }
         if (isTarget || created.failure().code != Failure::Code::Exists) {
-            _writer.reset();
+            _number = before;
             return created.failure().of(spoken(_path));
         }
     }
+}
+
+Result<std::unique_ptr<RecordingWriter>> RecordingFiles::create(Technology technology, bool isTarget) const
+{
+    if (_stream)
+        return createRecordingOn(_stream, technology);
+    return (isTarget && _options.overwrite ? createRecording : createNewRecording)(_path, technology);
 }
 
 std::string RecordingFiles::numberedPath(Technology technology) const
@@ -203,28 +222,75 @@ std::string RecordingFiles::numberedPath(Technology technology) const
     return (target.parent_path() / name).string();
 }
 
+/// Those that `keep` counts, the oldest first.
+std::vector<std::string> RecordingFiles::keptFiles() const
+{
+    if (!_isFolder)
+        return _written;
+    std::vector<std::string> paths;
+    for (const auto& [number, path] : numberedFiles(_options.target))
+        paths.push_back(path.string());
+    return paths;
+}
+
 /// What cannot be removed stays.
-void RecordingFiles::removeOldest()
+void RecordingFiles::removeBeyond(std::uint64_t count)
+{
+    const auto files = keptFiles();
+    for (std::size_t i = 0; i + count < files.size(); ++i) {
+        removeUnlessWritten(files[i]);
+        std::erase(_written, files[i]);
+    }
+}
+
+/// False when there is no file left that could go.
+bool RecordingFiles::makeRoom()
 {
     if (!_options.keep)
-        return;
-    if (_isFolder) {
-        const auto files = numberedFiles(_options.target);
-        for (std::size_t i = 0; i + *_options.keep < files.size(); ++i)
-            removeUnlessWritten(files[i].second);
-        return;
+        return false;
+    for (const std::string& each : keptFiles()) {
+        if (each == _path && _writer)
+            continue;
+        std::erase(_written, each);
+        if (removeUnlessWritten(each))
+            return true;
     }
-    _written.push_back(_path);
-    if (_written.size() > *_options.keep) {
-        removeUnlessWritten(_written.front());
-        _written.erase(_written.begin());
-    }
+    return false;
+}
+
+std::string RecordingFiles::folder() const
+{
+    return _isFolder ? _options.target : fs::path(_options.target).parent_path().string();
 }
 
 Outcome RecordingFiles::flush()
 {
-    const Outcome flushed = _writer ? _writer->flush() : Done();
-    return flushed ? flushed : flushed.failure().of(spoken(_path));
+    if (!_writer)
+        return Done();
+    auto flushed = _writer->flush();
+    while (!flushed && flushed.failure().code == Failure::Code::NoRoom && makeRoom())
+        flushed = _writer->flush();
+    if (!flushed)
+        return flushed.failure().of(spoken(_path));
+    if (_stream)
+        return Done();
+    _disk->file(_writer->descriptor());
+    if (!std::exchange(_isNamed, true))
+        _disk->folder(folder());
+    return _gaps->flush();
+}
+
+Outcome RecordingFiles::noteLost(std::uint64_t messages)
+{
+    return _gaps ? _gaps->add(_clock.now(), messages) : Done();
+}
+
+Outcome RecordingFiles::finish()
+{
+    auto flushed = flush();
+    if (const auto synced = _disk->finish(); flushed && !synced)
+        return synced.failure().of(spoken(_path));
+    return flushed;
 }
 
 } // namespace spectrel

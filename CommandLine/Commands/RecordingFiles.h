@@ -1,11 +1,14 @@
 #pragma once
 
+#include "CommandLine/Commands/DiskSync.h"
+#include "CommandLine/Commands/GapFile.h"
 #include "Platform/Clock.h"
 #include "Records/Recording.h"
 #include "Values/Result.h"
 
 #include <chrono>
 #include <cstdint>
+#include <memory>
 #include <optional>
 #include <string>
 #include <vector>
@@ -30,16 +33,28 @@ struct RecordingFilesOptions {
 /// technology changes. Files that are being written, here or by another recorder, are never removed.
 class RecordingFiles {
 public:
-    /// The clock outlives this; messages have its time.
-    RecordingFiles(RecordingFilesOptions options, const Clock& clock);
+    /// The clock outlives this; messages have its time. `stream`: where the one target goes that is no file.
+    RecordingFiles(RecordingFilesOptions options, const Clock& clock, RecordingOutput stream = {});
 
-    // Failures name the file.
+    // Failures name the file. One with `NoRoom` (a full disk) is not final: all goes on once there is room.
     /// Makes the folder at need. Fails when there is no place to write.
     Outcome prepare();
     /// Begins the first file, so that it is there before the first message.
     Outcome begin(Technology technology);
+    /// After a failure the message is lost.
     Outcome write(Technology technology, ByteView message);
+    /// Writes out what has gathered, and has it brought to the disk within the second. On a full disk the oldest of the
+    /// files that `keep` counts make room.
     Outcome flush();
+    /// Notes beside the current file that so many messages are missing here.
+    Outcome noteLost(std::uint64_t messages);
+    /// Flushes and waits until all is on the disk.
+    Outcome finish();
+    /// Messages that wait for room.
+    std::uint64_t waiting() const
+    {
+        return _writer ? _writer->waiting() : 0;
+    }
 
     /// A file's name as messages tell it; "-" is standard output.
     static std::string spoken(const std::string& path);
@@ -60,7 +75,11 @@ private:
     std::string numberedPath(Technology technology) const;
     Result<std::uint64_t> nextNumber() const;
     Outcome checkTarget() const;
-    void removeOldest();
+    Result<std::unique_ptr<RecordingWriter>> create(Technology technology, bool isTarget) const;
+    std::vector<std::string> keptFiles() const;
+    void removeBeyond(std::uint64_t count);
+    bool makeRoom();
+    std::string folder() const;
 
     RecordingFilesOptions _options;
     const Clock& _clock;
@@ -73,6 +92,10 @@ private:
     std::uint64_t _bytes = 0; // of the current file
     std::chrono::nanoseconds _begun {0}; // steady: the current file
     std::vector<std::string> _written; // outside of folders: the files begun, oldest first
+    RecordingOutput _stream;
+    std::unique_ptr<GapFile> _gaps; // of the current file
+    bool _isNamed = false; // the current file's name is on the disk
+    std::unique_ptr<DiskSync> _disk = std::make_unique<DiskSync>();
 };
 
 } // namespace spectrel

@@ -8,10 +8,11 @@
 #include "CommandLine/Program/ProviderNames.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/SpectrelModel.h"
+#include "Platform/Qt/PatientOutput.h"
 #include "Platform/Qt/TerminationSignals.h"
 
-#include <cstdio>
 #include <optional>
+#include <string>
 
 namespace spectrel {
 
@@ -19,10 +20,11 @@ namespace {
 
 class Watching final : public SpectrelModelObserver {
 public:
-    Watching(const WatchOptions& options, const Context& context)
+    Watching(const WatchOptions& options, PatientOutput& reader, LiveServices& live)
         : _options(options)
-        , _live(context)
-        , _output(stdout, options.output)
+        , _live(live)
+        , _reader(reader)
+        , _output(reader.stream(), options.output)
         , _model(_live.services(), &LogGenerator::generatorFromTechnology, *this, LiveServices::portPrefixFor("Watch"))
         , _journal(printsChanges(options.output.format) ? &_model.displayState().followChanges() : nullptr)
     {
@@ -41,13 +43,22 @@ public:
     int run()
     {
         Ending::install(_model.displayState(), _live.context(), {});
-        const TerminationSignals terminationSignals([this](int) { _live.runLoop().quit(); });
+        bool isAskedToEnd = false;
+        const TerminationSignals terminationSignals([&](int) {
+            isAskedToEnd = true;
+            _live.runLoop().quit();
+        });
+        _reader.setChangeHandler([this] { readerDidChange(); });
         _live.runLoop().async([this] { _model.restartMonitor(); });
         if (_options.duration)
             _live.runLoop().after(*_options.duration, [this] { _live.runLoop().quit(); });
         _output.flush();
         _live.runLoop().run();
         finish();
+        _reader.setChangeHandler({});
+        const auto taken = _reader.finish(_live.runLoop(), [&isAskedToEnd] { return isAskedToEnd; });
+        if (!taken && _status == 0)
+            fail(taken.failure().text);
         return _status;
     }
 
@@ -67,6 +78,7 @@ public:
         if (_events)
             _events->refresh(_live.clock().now());
         flush();
+        _model.setHeld(_reader.waiting() > PatientOutput::Plenty);
         if (++_refreshes == _options.count || (_events && _events->isUntilMet()))
             _live.runLoop().quit();
     }
@@ -82,13 +94,24 @@ public:
     }
 
 private:
-    void flush()
+    void fail(const std::string& why)
     {
-        if (_output.flush())
-            return;
-        report("standard output: cannot be written");
+        report("standard output: " + why);
         _status = 1;
         _live.runLoop().quit();
+    }
+    void readerDidChange()
+    {
+        if (_reader.failure() && _status == 0)
+            fail("cannot be written");
+        else
+            _model.setHeld(false);
+    }
+
+    void flush()
+    {
+        if (!_output.flush() && _status == 0)
+            fail("cannot be written");
     }
 
     void finish()
@@ -105,7 +128,8 @@ private:
     }
 
     const WatchOptions& _options;
-    LiveServices _live;
+    LiveServices& _live;
+    PatientOutput& _reader;
     OutputWriter _output;
     SpectrelModel _model;
     Journal* const _journal; // where changes are printed
@@ -121,7 +145,13 @@ private:
 
 int watch(const WatchOptions& options, const Context& context)
 {
-    return Watching(options, context).run();
+    LiveServices live(context);
+    const auto output = PatientOutput::open("-");
+    if (!output) {
+        report(output.failure().of("standard output").text);
+        return 1;
+    }
+    return Watching(options, **output, live).run();
 }
 
 } // namespace spectrel

@@ -44,7 +44,11 @@ std::optional<int> readArguments(int argc, char** argv, GraphicalArguments& argu
     try {
         program.parse(argc, argv);
     } catch (const CLI::Success& answered) {
-        return program.exit(answered); // --help and --version, on standard output
+        program.exit(answered); // --help and --version, on standard output
+        if (std::cout.flush())
+            return ExitStatus::Done;
+        std::cerr << "spectrel-gui: standard output: cannot be written\n";
+        return ExitStatus::Failed;
     } catch (const CLI::ParseError& error) {
         std::cerr << "spectrel-gui: " << error.what() << " (see spectrel-gui --help)\n";
         return ExitStatus::WrongUsage;

@@ -1,12 +1,12 @@
 #include "CommandLine/Program/ErrorLine.h"
 
-#include <cstdio>
+#include "Platform/ErrorOutput.h"
 
 namespace spectrel {
 
 void report(std::string_view line)
 {
-    std::fprintf(stderr, "spectrel: %.*s\n", static_cast<int>(line.size()), line.data());
+    writeErrorLine("spectrel", line);
 }
 
 } // namespace spectrel

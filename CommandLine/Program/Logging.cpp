@@ -50,10 +50,13 @@ SystemLog& Logging::log() const
 
 bool Logging::finish()
 {
-    if (!_file || _file->flush())
-        return true;
-    report(_path + ": the log could not be written whole");
-    return false;
+    const bool isLogWhole = !_file || _file->flush();
+    if (!isLogWhole)
+        report(_path + ": the log could not be written whole");
+    const bool areDiagnosticsWhole = !_diagnostics || _diagnostics->flush();
+    if (!areDiagnosticsWhole)
+        report(Places::diagnosticLog() + ": the diagnostic log could not be written whole");
+    return isLogWhole && areDiagnosticsWhole;
 }
 
 } // namespace spectrel

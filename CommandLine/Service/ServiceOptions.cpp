@@ -11,6 +11,7 @@ namespace spectrel {
 
 namespace {
 
+constexpr int ExitFailed = 1;
 constexpr int ExitWrongUsage = 2;
 
 constexpr const char* Description =
@@ -160,7 +161,11 @@ std::optional<int> readServiceOptions(int argc, char** argv, ServiceOptions& opt
                 "'" + std::string(sceneName(scene)) + "' is there for " + technologiesOf(scene) + ", not for "
                     + std::string(technologyName(*technology)));
     } catch (const CLI::Success& answered) {
-        return program.exit(answered);
+        program.exit(answered);
+        if (std::cout.flush())
+            return 0;
+        std::cerr << "spectrel-telephonyd: standard output: cannot be written\n";
+        return ExitFailed;
     } catch (const CLI::ParseError& error) {
         std::cerr << "spectrel-telephonyd: " << error.what() << " (see spectrel-telephonyd --help)\n";
         return ExitWrongUsage;

@@ -22,6 +22,7 @@
 
 #include <csignal>
 #include <optional>
+#include <system_error>
 #include <unistd.h>
 
 namespace {
@@ -171,8 +172,10 @@ int serve(ServiceOptions& options)
         return fail(made.failure().text);
     LogSource& source = **made;
     TelephonyService service(runLoop, clock, ports, source);
-    if (!service.start())
-        return fail("cannot take the telephony service's port in " + folder + ": another service runs there");
+    if (const auto started = service.start(); !started)
+        return fail("cannot take the telephony service's port in " + folder + ": "
+            + (started.failure().code == Failure::Code::Exists ? "another service runs there"
+                                                               : started.failure().text));
     StatusReport report(clock, service, source);
     const TerminationSignals terminationSignals(
         [&](int signal) { signal == SIGUSR1 ? printStatus(report) : runLoop.quit(); }, {SIGUSR1});
@@ -197,5 +200,11 @@ int main(int argc, char** argv)
     ServiceOptions options;
     if (const auto status = readServiceOptions(argc, argv, options))
         return *status;
-    return options.simulate.file.empty() ? serve(options) : writeRecording(options.simulate);
+    std::signal(SIGXFSZ, SIG_IGN); // a file grown too large is a failed write like any other
+    std::signal(SIGPIPE, SIG_IGN); // and so is a pipe whose reader has gone
+    try {
+        return options.simulate.file.empty() ? serve(options) : writeRecording(options.simulate);
+    } catch (const std::system_error& error) {
+        return fail(error.what()); // the system gives not even what every program needs
+    }
 }

@@ -4,11 +4,14 @@
 #include <QSocketNotifier>
 #include <QTimer>
 
+#include <array>
+#include <cerrno>
 #include <clocale>
 #include <cstdint>
 #include <deque>
 #include <limits>
 #include <sys/eventfd.h>
+#include <system_error>
 #include <unistd.h>
 #include <utility>
 
@@ -25,11 +28,31 @@ int milliseconds(std::chrono::nanoseconds duration)
     return whole > std::numeric_limits<int>::max() ? std::numeric_limits<int>::max() : static_cast<int>(whole);
 }
 
+/// The event loop of Qt ends the process where it gets no descriptors, without a word that helps: the few that it takes
+/// are asked for before.
+void requireDescriptors()
+{
+    constexpr std::size_t Needed = 8;
+    std::array<int, Needed> taken {};
+    int error = 0;
+    for (int& each : taken) {
+        each = ::eventfd(0, EFD_CLOEXEC);
+        error = each < 0 ? errno : error;
+    }
+    for (const int each : taken) {
+        if (each >= 0)
+            ::close(each);
+    }
+    if (error != 0)
+        throw std::system_error(error, std::generic_category(), "the run loop gets no descriptors");
+}
+
 /// An application object, where no front end has made one.
 std::unique_ptr<QCoreApplication> makeApplication()
 {
     if (QCoreApplication::instance())
         return nullptr;
+    requireDescriptors();
     static int count = 1;
     static char name[] = "spectrel";
     static char* arguments[] = {name, nullptr};
@@ -42,13 +65,21 @@ struct RepeatingTimer final : Timer {
     QTimer timer;
 };
 
+int makeWakeUp()
+{
+    const int descriptor = ::eventfd(0, EFD_CLOEXEC | EFD_NONBLOCK);
+    if (descriptor < 0)
+        throw std::system_error(errno, std::generic_category(), "the run loop gets no descriptor");
+    return descriptor;
+}
+
 } // namespace
 
 /// The job queue, woken through a descriptor: unlike posted events it takes turns with sockets and timers.
 struct QtRunLoop::Queue {
     Queue()
         : application(makeApplication())
-        , wakeUp(::eventfd(0, EFD_CLOEXEC | EFD_NONBLOCK))
+        , wakeUp(makeWakeUp())
         , notifier(wakeUp, QSocketNotifier::Read)
     {
         QObject::connect(&notifier, &QSocketNotifier::activated, [this] { runTurn(); });

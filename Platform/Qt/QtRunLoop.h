@@ -14,7 +14,8 @@ namespace spectrel {
 /// and sockets: a turn runs the jobs that were there when it began.
 class QtRunLoop final : public RunLoop {
 public:
-    /// Makes the process's application object, unless a front end has made one of its own before.
+    /// Makes the process's application object, unless a front end has made one of its own before. Throws
+    /// `std::system_error` where the system gives no descriptors.
     QtRunLoop();
     ~QtRunLoop() override;
 

@@ -5,6 +5,7 @@
 #include <cerrno>
 #include <csignal>
 #include <fcntl.h>
+#include <system_error>
 #include <unistd.h>
 #include <utility>
 #include <vector>
@@ -15,8 +16,29 @@ namespace {
 
 int writingEnd = -1; // of the pipe that carries the signals' numbers out of the signal handler
 
+volatile std::sig_atomic_t isAskedToEnd = 0; // the next signal ends the process, whatever it is busy with
+
+/// Ends the process as if nobody had listened to the signal.
+void endBy(int signal)
+{
+    struct sigaction action = {};
+    action.sa_handler = SIG_DFL;
+    ::sigaction(signal, &action, nullptr);
+    ::raise(signal); // comes when the handler has returned
+}
+
+bool asksToEnd(int signal)
+{
+    return signal == SIGINT || signal == SIGTERM || signal == SIGHUP;
+}
+
 void noteSignal(int signal)
 {
+    if (asksToEnd(signal)) {
+        if (isAskedToEnd)
+            return endBy(signal);
+        isAskedToEnd = 1;
+    }
     const int kept = errno;
     const auto number = static_cast<unsigned char>(signal);
     [[maybe_unused]] const auto written = ::write(writingEnd, &number, 1);
@@ -31,8 +53,10 @@ struct TerminationSignals::Private {
     {
         for (const int signal : further)
             former.push_back({signal, {}});
-        [[maybe_unused]] const int made = ::pipe2(ends, O_CLOEXEC | O_NONBLOCK);
+        if (::pipe2(ends, O_CLOEXEC | O_NONBLOCK) != 0)
+            throw std::system_error(errno, std::generic_category(), "the signals get no pipe");
         writingEnd = ends[1];
+        isAskedToEnd = 0;
         notifier = std::make_unique<QSocketNotifier>(ends[0], QSocketNotifier::Read);
         QObject::connect(notifier.get(), &QSocketNotifier::activated, [this] { take(); });
         struct sigaction action = {};

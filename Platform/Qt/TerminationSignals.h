@@ -7,7 +7,8 @@
 namespace spectrel {
 
 /// Turns SIGINT, SIGTERM and SIGHUP into a call on the main queue; the signals' former actions return with the object's
-/// end. At most one at a time; needs the application object.
+/// end. The second of them ends the process at once, whatever it is busy with. At most one object at a time; needs the
+/// application object. Throws `std::system_error` where the system gives no descriptors.
 class TerminationSignals {
 public:
     using Handler = std::function<void(int signal)>;

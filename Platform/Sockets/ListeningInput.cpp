@@ -11,6 +11,7 @@
 #include <netdb.h>
 #include <netinet/in.h>
 #include <netinet/tcp.h>
+#include <poll.h>
 #include <sys/socket.h>
 #include <sys/stat.h>
 #include <sys/un.h>
@@ -22,6 +23,7 @@ namespace spectrel {
 namespace {
 
 constexpr int Backlog = 8; // writers that wait for the current one's end
+constexpr int SilenceSteps = 10; // in which the longest silence is measured
 constexpr int AcceptPause = 100; // milliseconds without new writers when the process has no descriptor to spare
 constexpr const char* ThisMachine = "127.0.0.1";
 
@@ -133,29 +135,35 @@ void watchForVanishing(const FileDescriptor& socket)
 
 } // namespace
 
-Result<std::unique_ptr<StreamInput>> ListeningInput::openUnix(const std::string& path)
+Result<std::unique_ptr<StreamInput>> ListeningInput::openUnix(
+    const std::string& path, std::chrono::milliseconds longestSilence)
 {
     auto socket = listenAtPath(path);
     if (!socket)
         return socket.failure();
-    return std::unique_ptr<StreamInput>(new ListeningInput("unix:" + path, path, *std::move(socket)));
+    return std::unique_ptr<StreamInput>(new ListeningInput("unix:" + path, path, *std::move(socket), longestSilence));
 }
 
-Result<std::unique_ptr<StreamInput>> ListeningInput::openTCP(const std::string& address)
+Result<std::unique_ptr<StreamInput>> ListeningInput::openTCP(
+    const std::string& address, std::chrono::milliseconds longestSilence)
 {
     auto socket = listenAtHost(splitAddress(address));
     if (!socket)
         return socket.failure();
     std::string name = "tcp:" + addressOf(*socket);
-    return std::unique_ptr<StreamInput>(new ListeningInput(std::move(name), "", *std::move(socket)));
+    return std::unique_ptr<StreamInput>(new ListeningInput(std::move(name), "", *std::move(socket), longestSilence));
 }
 
-ListeningInput::ListeningInput(std::string name, std::string path, FileDescriptor socket)
+ListeningInput::ListeningInput(
+    std::string name, std::string path, FileDescriptor socket, std::chrono::milliseconds longestSilence)
     : _name(std::move(name))
     , _path(std::move(path))
     , _socket(std::move(socket))
+    , _longestSilence(longestSilence)
     , _feed([this](const std::string& reason) { end(reason); })
 {
+    _silenceTimer.setInterval(_longestSilence / SilenceSteps);
+    QObject::connect(&_silenceTimer, &QTimer::timeout, [this] { checkSilence(); });
 }
 
 ListeningInput::~ListeningInput()
@@ -213,6 +221,32 @@ void ListeningInput::listenIfFree()
 {
     if (_notifier)
         _notifier->setEnabled(!_isPaused && !_feed.isOpen());
+    const bool isRead = !_isPaused && _feed.isOpen();
+    if (isRead == _silenceTimer.isActive())
+        return;
+    _piecesBefore = _feed.pieces();
+    _silentSteps = 0;
+    if (isRead)
+        _silenceTimer.start();
+    else
+        _silenceTimer.stop();
+}
+
+/// Nobody waiting, a silence may last.
+void ListeningInput::checkSilence()
+{
+    _silentSteps = _piecesBefore == _feed.pieces() ? _silentSteps + 1 : 0;
+    _piecesBefore = _feed.pieces();
+    if (_silentSteps >= SilenceSteps && anotherWaits())
+        end("it sent nothing for "
+            + std::to_string(std::chrono::duration_cast<std::chrono::seconds>(_longestSilence).count())
+            + " s while another one waited");
+}
+
+bool ListeningInput::anotherWaits() const
+{
+    pollfd listening {_socket.number(), POLLIN, 0};
+    return ::poll(&listening, 1, 0) == 1;
 }
 
 } // namespace spectrel

@@ -48,17 +48,19 @@ std::optional<sockaddr_un> portAddress(const std::string& directory, std::string
     return address;
 }
 
-std::optional<NameLock> NameLock::take(const std::string& directory, std::string_view name)
+Result<NameLock> NameLock::take(const std::string& directory, std::string_view name)
 {
     const std::string path = directory + "/." + std::string(name) + ".lock";
     for (;;) {
         FileDescriptor file(::open(path.c_str(), O_CREAT | O_RDWR | O_CLOEXEC | O_NOFOLLOW, 0600));
         if (!file)
-            return std::nullopt;
+            return Failure::ofSystem().of(path);
         if (::flock(file.number(), LOCK_EX | LOCK_NB) != 0) {
             if (errno == EINTR)
                 continue;
-            return std::nullopt;
+            if (errno == EWOULDBLOCK)
+                return Failure {std::string(name) + ": another process holds the name", Failure::Code::Exists};
+            return Failure::ofSystem().of(path);
         }
         if (isStillThere(file.number(), path))
             return NameLock(std::move(file), path);

@@ -2,6 +2,7 @@
 
 #include "Platform/Sockets/FileDescriptor.h"
 #include "Platform/SystemLog.h"
+#include "Values/Result.h"
 
 #include <optional>
 #include <string>
@@ -19,8 +20,8 @@ std::optional<sockaddr_un> portAddress(const std::string& directory, std::string
 /// latest.
 class NameLock {
 public:
-    /// None when another process, or another object of this one, holds the name.
-    static std::optional<NameLock> take(const std::string& directory, std::string_view name);
+    /// Fails with `Exists` when another process, or another object of this one, holds the name.
+    static Result<NameLock> take(const std::string& directory, std::string_view name);
 
     NameLock(NameLock&&) = default;
     NameLock& operator=(NameLock&&) = delete;

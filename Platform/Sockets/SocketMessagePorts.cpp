@@ -28,15 +28,16 @@ FileDescriptor makeSocket()
 }
 
 /// A socket listening at the address. A file that is there is a dead process's: the caller holds the name's lock.
-FileDescriptor listenAt(const sockaddr_un& address, SystemLog& log)
+Result<FileDescriptor> listenAt(const sockaddr_un& address, SystemLog& log)
 {
     FileDescriptor socket = makeSocket();
     ::unlink(address.sun_path);
     if (socket && ::bind(socket.number(), reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0
         && ::listen(socket.number(), Backlog) == 0)
         return socket;
-    SPECTREL_LOG(log, Priority::Error, "Message port %s: %s", address.sun_path, std::strerror(errno));
-    return {};
+    const Failure failure = Failure::ofSystem().of(address.sun_path);
+    SPECTREL_LOG(log, Priority::Error, "Message port %s", failure.text.c_str());
+    return failure;
 }
 
 } // namespace
@@ -62,27 +63,27 @@ MessagePorts::LocalResult SocketMessagePorts::createLocal(
     std::erase_if(_locals, [](const auto& held) { return held.second.expired(); });
     if (const auto held = _locals.find(name); held != _locals.end()) {
         if (auto existing = held->second.lock(); existing && existing->isValid())
-            return {std::move(existing), true};
+            return {std::move(existing), true, std::nullopt};
     }
     const auto address = portAddress(_directory, name, _log);
     if (!address)
-        return {};
+        return {nullptr, false, Failure {std::string(name) + ": cannot be a port's name", Failure::Code::Refused}};
     if (const auto made = makePrivateDirectory(_directory); !made) {
         SPECTREL_LOG(_log, Priority::Error, "Message ports: %s", made.failure().text.c_str());
-        return {};
+        return {nullptr, false, made.failure()};
     }
     auto lock = NameLock::take(_directory, name);
     if (!lock)
-        return {};
+        return {nullptr, false, lock.failure()};
     const auto adopted = _adopted.extract(std::string(name));
-    FileDescriptor socket = adopted ? std::move(adopted.mapped()) : listenAt(*address, _log);
+    auto socket = adopted ? Result<FileDescriptor>(std::move(adopted.mapped())) : listenAt(*address, _log);
     if (!socket)
-        return {};
+        return {nullptr, false, socket.failure()};
     // The file of a socket that was made elsewhere is not ours to remove.
     auto port = std::make_shared<SocketLocalPort>(std::string(name), adopted ? std::string() : address->sun_path,
-        std::move(*lock), std::move(socket), std::move(handler), _log);
+        *std::move(lock), *std::move(socket), std::move(handler), _log);
     _locals.insert_or_assign(std::string(name), port);
-    return {std::move(port), false};
+    return {std::move(port), false, std::nullopt};
 }
 
 Outcome SocketMessagePorts::adopt(std::string_view name, FileDescriptor socket)

@@ -59,6 +59,7 @@ void WriterFeed::readPiece()
         return;
     if (count <= 0)
         return _onEnd(count < 0 ? std::strerror(errno) : "");
+    ++_pieces;
     if (!std::exchange(_hasWriter, true))
         _listener->writerCame();
     _listener->bytesCame(ByteView(_piece).first(static_cast<std::size_t>(count)));

@@ -5,6 +5,7 @@
 
 #include <QObject>
 
+#include <cstdint>
 #include <functional>
 #include <memory>
 
@@ -27,6 +28,11 @@ public:
     {
         return static_cast<bool>(_descriptor);
     }
+    /// Pieces read since the feed was made: whether a writer is silent.
+    std::uint64_t pieces() const
+    {
+        return _pieces;
+    }
     bool hasWriter() const
     {
         return _hasWriter;
@@ -44,6 +50,7 @@ private:
     bool _hasWriter = false;
     bool _isPaused = false;
     Bytes _piece;
+    std::uint64_t _pieces = 0;
     QObject _retired; // owns the former notifiers until they are deleted: at the latest with the feed
 };
 

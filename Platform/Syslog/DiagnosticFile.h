@@ -17,6 +17,11 @@ public:
     static Result<std::unique_ptr<DiagnosticFile>> create(const std::string& path);
 
     void write(std::string_view line) override;
+    /// False when a line could not be written since the log began.
+    bool flush()
+    {
+        return _file->flush();
+    }
 
 private:
     explicit DiagnosticFile(std::unique_ptr<FileLog> file);

@@ -92,8 +92,10 @@ CaptureOutput::~CaptureOutput()
 {
     if (!_hidden.empty())
         ::unlink(_hidden.c_str());
-    if (_file >= 0)
-        ::close(_file);
+    if (_file < 0)
+        return;
+    ::flock(_file, LOCK_UN); // somebody may still hold a copy of the descriptor
+    ::close(_file);
 }
 
 Result<CaptureOutput> CaptureOutput::open(const std::string& path, IfThere ifThere)

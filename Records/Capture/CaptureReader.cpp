@@ -81,6 +81,8 @@ bool CaptureReader::next(RecordedMessage& message)
     if (header->caplen < header->len)
         return damaged(
             "only " + std::to_string(header->caplen) + " of " + std::to_string(header->len) + " bytes were captured");
+    if (header->caplen == 0) // what was not on the disk yet when the power went is zero
+        return damaged("a packet without bytes");
     message.time = timeOf(*header);
     message.body = {bytes, header->caplen};
     ++_count;

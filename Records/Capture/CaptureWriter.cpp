@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <cstdio>
+#include <cstring>
 #include <limits>
 #include <optional>
 #include <pcap/pcap.h>
@@ -34,6 +35,15 @@ using Dumper = std::unique_ptr<pcap_dumper_t, CaptureCloser>;
 /// between two pages.
 constexpr std::size_t WriteSize = 512 * 1024;
 static_assert(RecordingWriter::MostWaiting > WriteSize + LargestMessage + PacketHeaderSize);
+
+/// What stands before a packet in the file, in the machine's byte order.
+struct PacketHeader {
+    std::uint32_t seconds;
+    std::uint32_t microseconds;
+    std::uint32_t length; // in the file
+    std::uint32_t originalLength;
+};
+static_assert(sizeof(PacketHeader) == PacketHeaderSize);
 
 ssize_t gather(void* gathered, const char* bytes, std::size_t length)
 {
@@ -75,6 +85,9 @@ public:
     }
 
 private:
+    Outcome flushOneByOne();
+    Outcome append(ByteView bytes);
+
     RecordingOutput _append; // where there is no file
     std::optional<CaptureOutput> _file;
     Bytes _gathered; // whole packets
@@ -128,15 +141,41 @@ Outcome CaptureWriter::flush()
         return *_broken;
     if (_gathered.empty())
         return Done();
-    const auto written = _file ? _file->append(_gathered) : _append(_gathered);
-    if (!written) {
-        if (written.failure().code != Failure::Code::NoRoom)
-            _broken = written.failure();
+    auto written = append(_gathered);
+    if (written) {
+        _gathered.clear();
+        _waiting = 0;
         return written;
     }
-    _gathered.clear();
-    _waiting = 0;
-    return Done();
+    if (written.failure().code == Failure::Code::NoRoom && _waiting > 0)
+        written = flushOneByOne();
+    if (!written && written.failure().code != Failure::Code::NoRoom)
+        _broken = written.failure();
+    return written;
+}
+
+/// As many as there is room for.
+Outcome CaptureWriter::flushOneByOne()
+{
+    std::size_t done = 0;
+    Outcome written = Done();
+    while (_waiting > 0) {
+        PacketHeader header {};
+        std::memcpy(&header, _gathered.data() + done, sizeof header);
+        const std::size_t length = sizeof header + header.length;
+        written = append(ByteView(_gathered).subspan(done, length));
+        if (!written)
+            break;
+        done += length;
+        --_waiting;
+    }
+    _gathered.erase(_gathered.begin(), _gathered.begin() + static_cast<std::ptrdiff_t>(done));
+    return written;
+}
+
+Outcome CaptureWriter::append(ByteView bytes)
+{
+    return _file ? _file->append(bytes) : _append(bytes);
 }
 
 Result<std::unique_ptr<RecordingWriter>> create(const std::string& path, Technology technology, IfThere ifThere)

@@ -78,7 +78,8 @@ void RelaySource::writerCame()
 {
     if (_input->takesFurtherWriters())
         printServiceLine(_input->name() + ": a writer has come");
-    _stream = makeRecordingStream(_givenTechnology);
+    _stream = makeRecordingStream(
+        _givenTechnology, _input->isOpenToOthers() ? StreamHeader::Required : StreamHeader::Optional);
 }
 
 void RelaySource::bytesCame(ByteView bytes)

@@ -195,6 +195,52 @@ TEST_F(RecordingFilesTest, HighestNumberIsNotCountedBeyond)
     EXPECT_EQ(scratch.read("spectrel-18446744073709551615-lte.pcap"), "old");
 }
 
+TEST_F(RecordingFilesTest, LossesStandBesideTheFileThatMissesThem)
+{
+    scratch.write("a.gaps", "of a former recording");
+    auto files = open({scratch.file("a.pcap"), {}, 3s, {}});
+    write(files, 1);
+    EXPECT_FALSE(std::filesystem::exists(scratch.file("a.gaps")));
+    EXPECT_TRUE(files.noteLost(7));
+    write(files, 1);
+    EXPECT_TRUE(files.noteLost(5));
+    EXPECT_EQ(scratch.read("a.gaps"),
+        "{\"time\": 1709647652.000000, \"lost\": 7}\n{\"time\": 1709647653.000000, \"lost\": 5}\n");
+    write(files, 2);
+    EXPECT_TRUE(files.noteLost(1));
+    EXPECT_EQ(scratch.read("a-2.gaps"), "{\"time\": 1709647655.000000, \"lost\": 1}\n");
+}
+
+TEST_F(RecordingFilesTest, WhatStandsBesideAFileGoesWithIt)
+{
+    auto files = open({scratch.path().string(), {}, 1s, 1});
+    write(files, 1);
+    EXPECT_TRUE(files.noteLost(7));
+    scratch.write("spectrel-000001-lte.marks", "{}\n");
+    write(files, 1);
+    EXPECT_THAT(contents(scratch.path().string()), ElementsAre("spectrel-000002-lte.pcap: 1"));
+}
+
+TEST_F(RecordingFilesTest, FinishedRecordingIsOnTheDisk)
+{
+    auto files = open({scratch.file("a.pcap"), {}, 1s, {}});
+    write(files, 3);
+    EXPECT_TRUE(files.finish());
+}
+
+TEST_F(RecordingFilesTest, StreamTakesTheOneTarget)
+{
+    std::size_t length = 0;
+    RecordingFiles files({"-", {}, {}, {}}, loop, [&length](ByteView bytes) {
+        length += bytes.size();
+        return Outcome(Done());
+    });
+    EXPECT_TRUE(files.prepare());
+    write(files, 2);
+    EXPECT_EQ(length, 24u + 2 * 29);
+    EXPECT_FALSE(files.write(Technology::GSM, RecordBuilder(0xB0C2, 13))) << "it has one link type";
+}
+
 TEST_F(RecordingFilesTest, OnlyTheLastFilesAreKept)
 {
     scratch.write("spectrel-000007-gsm.pcap", "of an earlier run");

@@ -18,6 +18,10 @@ public:
     {
         return furtherWriters;
     }
+    bool isOpenToOthers() const override
+    {
+        return openToOthers;
+    }
     void start(Listener& listener) override
     {
         _listener = &listener;
@@ -45,6 +49,7 @@ public:
     }
 
     bool furtherWriters = true;
+    bool openToOthers = false;
     bool isPaused = false;
     int dropped = 0;
 

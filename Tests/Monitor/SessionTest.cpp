@@ -37,12 +37,17 @@ public:
     {
         ++ticks;
     }
+    void messagesWereLost(std::uint64_t count) override
+    {
+        lost += count;
+    }
     void sessionDidChange() override
     {
         ++changes;
     }
     std::unique_ptr<LogGenerator> current;
     std::size_t received = 0;
+    std::uint64_t lost = 0;
     int ticks = 0;
     int changes = 0;
 };
@@ -91,6 +96,18 @@ TEST_F(SessionTest, MessagesReachTheSinkAsDelivered)
     EXPECT_TRUE(ports.deliver(PortName, 1, message));
     EXPECT_EQ(sink.received, 3u);
     EXPECT_EQ(session.technology(), kRKLogChannelTechnology_IFX);
+}
+
+TEST_F(SessionTest, LossesReachTheSinkAndWhatIsNoneIsIgnored)
+{
+    session.start();
+    for (const char* list : {"<plist><dict><key>Lost</key><integer>7</integer></dict></plist>",
+             "<plist><dict><key>Lost</key><integer>-7</integer></dict></plist>", "<plist><dict/></plist>", "garbage"}) {
+        const std::string body = list;
+        EXPECT_TRUE(ports.deliver(PortName, 2, {reinterpret_cast<const std::uint8_t*>(body.data()), body.size()}));
+    }
+    EXPECT_EQ(sink.lost, 7u);
+    EXPECT_EQ(sink.received, 0u);
 }
 
 TEST_F(SessionTest, TicksReachTheSinkWhileTheSessionRuns)

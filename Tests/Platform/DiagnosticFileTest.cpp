@@ -30,5 +30,13 @@ TEST_F(DiagnosticFileTest, FileThatCannotBeMadeIsTold)
     EXPECT_EQ(created.failure().text, "No such file or directory");
 }
 
+TEST_F(DiagnosticFileTest, LinesThatFindNoRoomAreReported)
+{
+    const auto log = *DiagnosticFile::create("/dev/full");
+    EXPECT_TRUE(log->flush());
+    log->write("a line");
+    EXPECT_FALSE(log->flush());
+}
+
 } // namespace
 } // namespace spectrel

@@ -377,6 +377,28 @@ TEST_F(LocalPortTest, FolderOfSomebodyElseIsRefused)
     EXPECT_THAT(log.takeLog(), HasSubstr("<3>Message ports: " + foreign + ": not a folder of this user"));
 }
 
+TEST_F(LocalPortTest, FolderThatOthersCanWriteIsRefusedAndLeftAsItIs)
+{
+    for (const auto& [mode, text] : {std::pair(01777U, "1777"), {0770U, "770"}}) {
+        ASSERT_EQ(::chmod(folder.path().c_str(), mode), 0);
+        const auto prepared = SocketMessagePorts::prepareDirectory(folder.path().string(), Name);
+        ASSERT_FALSE(prepared);
+        EXPECT_EQ(prepared.failure().text, folder.path().string() + ": others can write there (mode " + text + ")");
+        struct stat status = {};
+        ASSERT_EQ(::stat(folder.path().c_str(), &status), 0);
+        EXPECT_EQ(status.st_mode & 07777, mode);
+    }
+}
+
+TEST_F(LocalPortTest, FolderThatOthersCanReadWorks)
+{
+    ASSERT_EQ(::chmod(folder.path().c_str(), 0755), 0);
+    EXPECT_NE(ports.createLocal(Name, keeping()).port, nullptr);
+    struct stat status = {};
+    ASSERT_EQ(::stat(folder.path().c_str(), &status), 0);
+    EXPECT_EQ(status.st_mode & 07777, 0755U);
+}
+
 TEST_F(LocalPortTest, FolderIsMadeForThisUserAlone)
 {
     const std::string nested = folder.path().string() + "/a/b";

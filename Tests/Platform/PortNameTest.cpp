@@ -42,7 +42,9 @@ TEST(PortNameTest, LockIsExclusiveUntilItEnds)
     {
         const auto first = NameLock::take(folder.path().string(), "name");
         EXPECT_TRUE(first);
-        EXPECT_FALSE(NameLock::take(folder.path().string(), "name"));
+        const auto second = NameLock::take(folder.path().string(), "name");
+        ASSERT_FALSE(second);
+        EXPECT_EQ(second.failure().code, Failure::Code::Exists);
         EXPECT_TRUE(NameLock::take(folder.path().string(), "other"));
     }
     EXPECT_TRUE(std::filesystem::is_empty(folder.path().string()));
@@ -51,7 +53,9 @@ TEST(PortNameTest, LockIsExclusiveUntilItEnds)
 
 TEST(PortNameTest, FolderThatIsNotThereYieldsNoLock)
 {
-    EXPECT_FALSE(NameLock::take("/nonexistent", "name"));
+    const auto nowhere = NameLock::take("/nonexistent", "name");
+    ASSERT_FALSE(nowhere);
+    EXPECT_EQ(nowhere.failure().code, Failure::Code::Missing) << "another process holds nothing there";
 }
 
 } // namespace

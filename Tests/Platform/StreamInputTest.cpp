@@ -376,5 +376,24 @@ TEST_F(ListeningInputTest, AddressThatIsNoneIsRefused)
     EXPECT_EQ(refusal(input->name()), input->name() + ": Address already in use");
 }
 
+TEST_F(StreamInputTest, SilentWriterGivesWayToOneThatWaits)
+{
+    input = *ListeningInput::openTCP("0", std::chrono::milliseconds(20));
+    input->start(*this);
+    EXPECT_TRUE(input->isOpenToOthers());
+    const FileDescriptor silent = tcpWriter();
+    ASSERT_TRUE(turnUntilTold("came "));
+    const FileDescriptor honest = tcpWriter();
+    write(honest, "abc");
+    ASSERT_TRUE(turnUntilReceived("abc"));
+    EXPECT_EQ(story, "came ended:it sent nothing for 0 s while another one waited came ");
+}
+
+TEST_F(StreamInputTest, UnixSocketIsThisUsersAlone)
+{
+    open("unix:" + path);
+    EXPECT_FALSE(input->isOpenToOthers());
+}
+
 } // namespace
 } // namespace spectrel

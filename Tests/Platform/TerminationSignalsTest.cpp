@@ -2,9 +2,13 @@
 #include "Platform/Qt/QtRunLoop.h"
 
 #include <csignal>
+#include <cstdio>
+#include <cstdlib>
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 #include <memory>
+#include <sys/resource.h>
+#include <system_error>
 #include <vector>
 
 namespace spectrel {
@@ -14,12 +18,45 @@ TEST(TerminationSignalsTest, SignalsBecomeCallsOnTheMainQueue)
 {
     QtRunLoop loop;
     std::vector<int> signals;
-    const TerminationSignals watched([&](int signal) { signals.push_back(signal); });
+    const TerminationSignals watched([&](int signal) { signals.push_back(signal); }, {SIGUSR1});
+    ::raise(SIGUSR1);
     ::raise(SIGTERM);
-    ::raise(SIGINT);
     EXPECT_TRUE(signals.empty());
     ASSERT_TRUE(loop.runUntil([&] { return signals.size() == 2; }, std::chrono::seconds(60)));
-    EXPECT_THAT(signals, testing::ElementsAre(SIGTERM, SIGINT));
+    EXPECT_THAT(signals, testing::ElementsAre(SIGUSR1, SIGTERM));
+}
+
+/// The loop does not turn, as in a program that is stuck.
+void beAskedToEndTwice()
+{
+    QtRunLoop loop;
+    const TerminationSignals watched([](int) {});
+    ::raise(SIGTERM);
+    ::raise(SIGINT);
+}
+
+TEST(TerminationSignalsDeathTest, SecondSignalEndsAtOnce)
+{
+    EXPECT_EXIT(beAskedToEndTwice(), testing::KilledBySignal(SIGINT), "");
+}
+
+void startWithoutDescriptors()
+{
+    const rlimit few {3, 3};
+    ::setrlimit(RLIMIT_NOFILE, &few);
+    try {
+        const QtRunLoop loop;
+    } catch (const std::system_error& error) {
+        std::fputs(error.what(), stderr);
+        std::_Exit(1);
+    }
+    std::_Exit(0);
+}
+
+TEST(TerminationSignalsDeathTest, RunLoopWithoutDescriptorsSaysSo)
+{
+    EXPECT_EXIT(
+        startWithoutDescriptors(), testing::ExitedWithCode(1), "the run loop gets no descriptors: Too many open files");
 }
 
 TEST(TerminationSignalsTest, HandlerMayEndTheWatchAndTheFormerActionReturns)

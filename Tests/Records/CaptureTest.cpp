@@ -3,10 +3,12 @@
 #include "Tests/Records/RecordingText.h"
 
 #include <algorithm>
+#include <csignal>
 #include <filesystem>
 #include <gtest/gtest.h>
 #include <malloc.h>
 #include <sys/inotify.h>
+#include <sys/resource.h>
 #include <unistd.h>
 
 namespace spectrel {
@@ -200,6 +202,97 @@ TEST(CaptureTest, FullDiskIsReported)
     const auto created = createRecording("/dev/full", Technology::LTE);
     ASSERT_FALSE(created);
     EXPECT_EQ(created.failure().text, "No space left on device");
+}
+
+/// Files that grow beyond the limit fail, as on a full disk.
+class FileSizeLimit {
+public:
+    explicit FileSizeLimit(rlim_t bytes)
+        : _handler(std::signal(SIGXFSZ, SIG_IGN))
+    {
+        ::getrlimit(RLIMIT_FSIZE, &_before);
+        const rlimit little {bytes, _before.rlim_max};
+        ::setrlimit(RLIMIT_FSIZE, &little);
+    }
+    FileSizeLimit(const FileSizeLimit&) = delete;
+    FileSizeLimit& operator=(const FileSizeLimit&) = delete;
+    ~FileSizeLimit()
+    {
+        ::setrlimit(RLIMIT_FSIZE, &_before);
+        std::signal(SIGXFSZ, _handler);
+    }
+
+private:
+    rlimit _before {};
+    void (*_handler)(int);
+};
+
+TEST(CaptureTest, WithoutRoomTheFileEndsWithAWholeMessageAndGoesOnWhenThereIsSome)
+{
+    const ScratchFolder folder;
+    const auto writer = *createRecording(folder.file("x"), Technology::LTE);
+    EXPECT_TRUE(writer->write(at(1'000'001), viewOf("one")));
+    EXPECT_TRUE(writer->flush());
+    const auto whole = CaptureBytes(0xA1B2C3D4, 150).packet(1, 1, "one").bytes;
+    {
+        const FileSizeLimit limit(whole.size() + 19 + 10);
+        EXPECT_TRUE(writer->write(at(2'000'002), viewOf("two")));
+        EXPECT_TRUE(writer->write(at(3'000'003), viewOf("three")));
+        const auto flushed = writer->flush();
+        ASSERT_FALSE(flushed);
+        EXPECT_EQ(flushed.failure().code, Failure::Code::NoRoom);
+        EXPECT_EQ(writer->waiting(), 1u);
+        EXPECT_EQ(folder.read("x"), CaptureBytes(0xA1B2C3D4, 150).packet(1, 1, "one").packet(2, 2, "two").bytes);
+    }
+    EXPECT_TRUE(writer->flush());
+    EXPECT_EQ(writer->waiting(), 0u);
+    EXPECT_EQ(folder.read("x"),
+        CaptureBytes(0xA1B2C3D4, 150).packet(1, 1, "one").packet(2, 2, "two").packet(3, 3, "three").bytes);
+}
+
+TEST(CaptureTest, WhatWaitsForRoomIsBounded)
+{
+    const ScratchFolder folder;
+    const auto writer = *createRecording(folder.file("x"), Technology::LTE);
+    const FileSizeLimit limit(1000);
+    const std::string message(100'000, 'x');
+    std::uint64_t taken = 0;
+    for (int number = 0; number < 100; ++number) {
+        const auto written = writer->write(at(1'000'001), viewOf(message));
+        taken += written ? 1 : 0;
+        EXPECT_TRUE(written || written.failure().code == Failure::Code::NoRoom);
+    }
+    EXPECT_EQ(taken, RecordingWriter::MostWaiting / (message.size() + 16));
+    EXPECT_EQ(writer->waiting(), taken);
+}
+
+TEST(CaptureTest, FileThatIsCutAnywhereIsReadUpToTheCut)
+{
+    const ScratchFolder folder;
+    CaptureBytes file(0xA1B2C3D4, 150);
+    std::vector<std::size_t> ends;
+    for (std::uint32_t number = 1; number <= 5; ++number) {
+        file.packet(number, number, std::string(number, 'x'));
+        ends.push_back(file.bytes.size());
+    }
+    for (std::size_t length = 24; length <= file.bytes.size(); ++length) {
+        // Cut, and as a loss of power may leave it: the file's new length is on the disk, but not what stands there.
+        for (const std::size_t zeros : {std::size_t {0}, file.bytes.size() - length}) {
+            folder.write("x", file.bytes.substr(0, length) + std::string(zeros, '\0'));
+            const auto reader = *openRecording(folder.file("x"));
+            const auto whole = std::ranges::count_if(ends, [length](std::size_t end) { return end <= length; });
+            std::ptrdiff_t messages = 0;
+            for (RecordedMessage message; reader->next(message); ++messages) {
+                if (messages >= whole)
+                    continue;
+                EXPECT_EQ(std::string(message.body.begin(), message.body.end()),
+                    std::string(static_cast<std::size_t>(messages) + 1, 'x'));
+            }
+            // Of the message that was cut zeros may have made up the rest.
+            EXPECT_GE(messages, whole) << length << " bytes and " << zeros << " zeros";
+            EXPECT_LE(messages, zeros > 0 ? whole + 1 : whole) << length << " bytes and " << zeros << " zeros";
+        }
+    }
 }
 
 TEST(CaptureTest, PlaceThatCannotBeWrittenIsReported)

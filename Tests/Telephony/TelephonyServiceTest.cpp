@@ -290,10 +290,28 @@ TEST_F(TelephonyServiceTest, ChangeOfBasebandEndsAllChannelsAndTheServiceStays)
     EXPECT_EQ(openChannel(), "org.spectrel.Telephony.LogChannel.3");
 }
 
+TEST_F(TelephonyServiceTest, LossIsAMessageWithAnIdOfItsOwn)
+{
+    auto channel = LogChannel::open(loop, loop, ports, source, 9, "client", [] {});
+    ASSERT_NE(channel, nullptr);
+    ports.sent.clear();
+    EXPECT_TRUE(channel->reportLoss(29'593));
+    ASSERT_EQ(ports.sent.size(), 1u);
+    EXPECT_EQ(ports.sent[0].id, 2);
+    const std::string& body = ports.sent[0].body;
+    const auto report = parsePropertyList({reinterpret_cast<const std::uint8_t*>(body.data()), body.size()});
+    ASSERT_TRUE(report);
+    EXPECT_EQ(displayText(*report), "{\"Lost\": int 29593}");
+    ports.answer = [](const FakeMessagePorts::Sent&) { return FakeMessagePorts::Answer {SendStatus::SendTimeout, {}}; };
+    EXPECT_FALSE(channel->reportLoss(1)) << "the client has no room";
+}
+
 TEST_F(TelephonyServiceTest, SecondServiceIsRefused)
 {
     TelephonyService second(loop, loop, ports, source);
-    EXPECT_FALSE(second.start());
+    const auto started = second.start();
+    ASSERT_FALSE(started);
+    EXPECT_EQ(started.failure().code, Failure::Code::Exists);
 }
 
 } // namespace

@@ -128,6 +128,78 @@ TEST_F(RelaySourceTest, ClientThatTakesNothingHarmsNoOther)
     EXPECT_EQ(stuck.messages.back(), collector.messages.back()) << "the oldest are lost, the latest come";
 }
 
+/// A client that asks for some of the messages only and hears of its losses.
+class LossyClient final : public MessageSink {
+public:
+    bool deliver(ByteView message) override
+    {
+        if (!wants(message))
+            return true;
+        if (isFull)
+            return false;
+        heard.push_back(std::to_string(message[12]));
+        return true;
+    }
+    bool wants(ByteView message) const override
+    {
+        return message[12] % 2 == 0;
+    }
+    bool reportLoss(std::uint64_t messages) override
+    {
+        if (!isFull)
+            heard.push_back("lost " + std::to_string(messages));
+        return !isFull;
+    }
+    bool isFull = false;
+    std::vector<std::string> heard;
+};
+
+TEST_F(RelaySourceTest, ClientHearsWhereItsMessagesAreMissing)
+{
+    open();
+    const auto first = start(collector);
+    LossyClient slow;
+    const auto second = start(slow);
+    slow.isFull = true;
+    for (int round = 0; round < 100; ++round)
+        input->write(capture(0, 100));
+    EXPECT_EQ(second->waiting(), ChannelQueue::MaxMessages) << "of those it asked for";
+    EXPECT_EQ(second->lost(), 5000 - ChannelQueue::MaxMessages);
+    second->resume();
+    EXPECT_TRUE(slow.heard.empty());
+    slow.isFull = false;
+    second->resume();
+    ASSERT_EQ(slow.heard.size(), 1 + ChannelQueue::MaxMessages);
+    EXPECT_EQ(slow.heard[0], "lost 904");
+    EXPECT_EQ(slow.heard[1], "8") << "the one behind the 904th";
+    input->write(capture(2, 1));
+    EXPECT_EQ(slow.heard.back(), "2") << "and is told once";
+}
+
+TEST_F(RelaySourceTest, StreamThatOthersCanWriteHasToSayWhatItIs)
+{
+    auto made = std::make_unique<FakeStreamInput>();
+    made->openToOthers = true;
+    input = made.get();
+    source = std::make_unique<RelaySource>(loop, std::move(made), Technology::LTE, [this] { ++failures; });
+    const auto stream = start(collector);
+    const std::string post = "POST / HTTP/1.1\r\nContent-Length: 4096\r\n\r\n";
+    Bytes page(post.begin(), post.end());
+    const Bytes bare = message(1);
+    for (int copies = 0; copies < 3; ++copies)
+        page.insert(page.end(), bare.begin(), bare.end());
+    for (const Bytes& bytes : {page, bare}) {
+        input->come();
+        input->write(bytes);
+        input->end();
+    }
+    EXPECT_EQ(input->dropped, 2);
+    EXPECT_TRUE(collector.messages.empty());
+    input->come();
+    input->write(capture(3, 1));
+    EXPECT_THAT(numbers(collector), ElementsAre(3));
+}
+
 TEST_F(RelaySourceTest, ClientsThatAllTakeNothingSlowTheWriter)
 {
     open();
