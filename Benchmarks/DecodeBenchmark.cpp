@@ -77,7 +77,7 @@ std::size_t readAll(const std::string& path)
 void decodeAll(const std::string& path, Dictionary& state)
 {
     const auto reader = *openRecording(path);
-    const auto generator = LTELogGenerator::generator();
+    const auto generator = LTELogGenerator::generator({.resources = resources()});
     RecordedMessage message;
     for (int count = 0; reader->next(message); ++count) {
         generator->updateState(state, message.body);
@@ -106,7 +106,6 @@ void formatAll()
 void DecodeServingCells(benchmark::State& run)
 {
     const Capture capture;
-    Resources::install(&resources());
     Dictionary proof;
     decodeAll(capture.path, proof);
     if (!capture.isWritten || shownCell(proof) != std::to_string(LastCell))
@@ -136,7 +135,6 @@ BENCHMARK(DecodeServingCells)->Unit(benchmark::kMillisecond)->Iterations(9);
 void RebuildDisplay(benchmark::State& run)
 {
     const Capture capture;
-    Resources::install(&resources());
     Dictionary state;
     decodeAll(capture.path, state);
     if (shownCell(state) != std::to_string(LastCell))

@@ -35,7 +35,7 @@ void deliverRaw(const std::array<int, 2>& sockets)
 class Ports {
 public:
     explicit Ports(std::string folder)
-        : _ports(folder)
+        : _ports(folder, SystemLog::none())
     {
         local = _ports
                     .createLocal("benchmark",

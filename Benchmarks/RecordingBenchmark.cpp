@@ -50,7 +50,8 @@ template <typename Use> std::size_t forEachMessage(const std::string& path, Use 
 
 std::unique_ptr<LogGenerator> makeGenerator(Technology technology)
 {
-    return LogGenerator::generatorFromTechnology(Value(technologyConstant(technology)));
+    static const DirectoryResources templates(SPECTREL_SOURCE_DIR "/Resources");
+    return LogGenerator::generatorFromTechnology(Value(technologyConstant(technology)), {.resources = templates});
 }
 
 std::size_t readAll(const std::string& path)
@@ -153,8 +154,6 @@ void registerTechnology(Technology technology)
 int main(int argc, char** argv)
 {
     using namespace spectrel;
-    static const DirectoryResources templates(SPECTREL_SOURCE_DIR "/Resources");
-    Resources::install(&templates);
     for (const Technology technology :
         {Technology::LTE, Technology::GSM, Technology::UTRAN, Technology::CDMA, Technology::IFX})
         registerTechnology(technology);

@@ -1,4 +1,4 @@
-// spectrel: the application with its terminal screens, and the commands watch, decode, view and record.
+// spectrel: the application with its terminal screens, and the commands watch, decode, view, record and channel.
 
 #include "CommandLine/Commands/Application.h"
 #include "CommandLine/Commands/Arguments.h"
@@ -6,8 +6,8 @@
 #include "CommandLine/Program/Logging.h"
 #include "CommandLine/Program/ProgramFolders.h"
 #include "Monitor/SpectrelModel.h"
-#include "Platform/Console.h"
-#include "Platform/Resources.h"
+#include "Platform/Context.h"
+#include "Platform/Qt/QtClock.h"
 
 #include <csignal>
 
@@ -33,19 +33,21 @@ std::string portPrefix(Job job)
     }
 }
 
-int run(const Arguments& arguments)
+int run(const Arguments& arguments, const Context& context)
 {
     switch (arguments.job) {
     case Job::Watch:
-        return watch(arguments.watch);
+        return watch(arguments.watch, context);
     case Job::Decode:
-        return decode(arguments.decode);
+        return decode(arguments.decode, context);
     case Job::View:
-        return view(arguments);
+        return view(arguments, context);
     case Job::Record:
-        return record(arguments.record);
+        return record(arguments.record, context);
+    case Job::Channel:
+        return channel(arguments.channel);
     case Job::Application:
-        return runApplication(arguments);
+        return runApplication(arguments, context);
     }
     return ExitStatus::Failed;
 }
@@ -57,6 +59,8 @@ int main(int argc, char** argv)
     Arguments arguments;
     if (const auto status = readArguments(argc, argv, arguments))
         return *status;
+    if (arguments.job == Job::Channel)
+        return channel(arguments.channel); // needs neither templates nor a session
 
     std::signal(SIGXFSZ, SIG_IGN); // a file grown too large is a failed write like any other
     if (isLive(arguments.job))
@@ -65,12 +69,11 @@ int main(int argc, char** argv)
     if (!templates || (isLive(arguments.job) && !Surroundings::preparePorts(portPrefix(arguments.job))))
         return ExitStatus::Failed;
     const DirectoryResources resources(*templates);
-    Resources::install(&resources);
     StandardErrorConsole console;
-    Console::install(&console);
+    const QtClock clock;
     Logging logging;
     if (!logging.start(arguments.logFile, isLive(arguments.job) ? Logging::Use::Live : Logging::Use::Offline))
         return ExitStatus::Failed;
-    const int status = run(arguments);
+    const int status = run(arguments, {clock, resources, logging.log(), console, logging.diagnostics()});
     return logging.finish() ? status : ExitStatus::Failed;
 }

@@ -1,4 +1,4 @@
-// A live stream of any bytes. The first byte tells in pieces of what length it comes; cut up or whole, it yields the
+// A live stream of any bytes. The first byte says in pieces of what length it comes; cut up or whole, it yields the
 // same.
 #include "Records/RecordingStream.h"
 

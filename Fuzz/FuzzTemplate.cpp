@@ -17,11 +17,6 @@ public:
     explicit OneTemplate(spectrel::ByteView bytes)
         : _template(spectrel::parsePropertyList(bytes))
     {
-        install(this);
-    }
-    ~OneTemplate() override
-    {
-        install(nullptr);
     }
     std::optional<spectrel::Value> propertyList(std::string_view) const override
     {
@@ -42,7 +37,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t siz
 {
     using namespace spectrel;
     const OneTemplate resources({bytes, size});
-    const auto generator = LTELogGenerator::generator();
+    const auto generator = LTELogGenerator::generator({.resources = resources});
     Dictionary state;
     std::array<std::uint8_t, 40> servingCell {0x01, 39, 0, 0xC2, 0xB0};
     generator->updateState(state, servingCell);
@@ -50,7 +45,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t siz
     PathIndex paths;
     SpectrelModelNode::makeTreeFromObject(generator->generateLogUsingState(state), paths);
 
-    const auto successor = LTELogGenerator::generator();
+    const auto successor = LTELogGenerator::generator({.resources = resources});
     successor->takeOver(generator.get(), state);
     successor->updateState(state, servingCell);
     return 0;

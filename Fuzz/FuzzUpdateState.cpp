@@ -15,10 +15,9 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t siz
 {
     using namespace spectrel;
     static const DirectoryResources resources(SPECTREL_SOURCE_DIR "/Resources");
-    Resources::install(&resources);
 
     const auto technology = technologyConstant(*technologyNamed(SPECTREL_FUZZ_TECHNOLOGY));
-    const auto generator = LogGenerator::generatorFromTechnology(Value(technology));
+    const auto generator = LogGenerator::generatorFromTechnology(Value(technology), {.resources = resources});
     Dictionary state;
     try {
         generator->updateState(state, {bytes, size});

@@ -1,6 +1,5 @@
 #include "LogGenerator/LogGenerator.h"
 
-#include "Platform/Clock.h"
 #include "Platform/SystemLog.h"
 #include "Values/Moment.h"
 
@@ -11,7 +10,7 @@ namespace spectrel {
 namespace {
 
 /// The five values in their order; the first absent one ends the entry.
-DictionaryRef makeHistoryEntry(const Dictionary& state)
+DictionaryRef makeHistoryEntry(const Dictionary& state, const Clock& clock)
 {
     auto entry = Dictionary::make();
     const Value& displayState = state[StateKey::DisplayState];
@@ -25,8 +24,8 @@ DictionaryRef makeHistoryEntry(const Dictionary& state)
         entry->set(key, copyTopLevel(value));
     }
     // The date is read twice: the two texts may differ by a second, and that stays so.
-    entry->set("Date", defaultDateForm(Clock::installed().now()));
-    entry->set("Description", "Snapshot (" + defaultDateForm(Clock::installed().now()) + ")");
+    entry->set("Date", defaultDateForm(clock.now()));
+    entry->set("Description", "Snapshot (" + defaultDateForm(clock.now()) + ")");
     return entry;
 }
 
@@ -36,7 +35,7 @@ LogGenerator::~LogGenerator() = default;
 
 void LogGenerator::init()
 {
-    SPECTREL_LOG(Priority::Warning, "Creating Log object: %p", static_cast<void*>(this));
+    SPECTREL_LOG(log(), Priority::Warning, "Creating Log object: %p", static_cast<void*>(this));
 }
 
 void LogGenerator::takeOver(LogGenerator*, Dictionary&) { }
@@ -45,7 +44,7 @@ void LogGenerator::discardRawMessages() { }
 
 void LogGenerator::keepRawMessage(ByteView) { }
 
-void LogGenerator::updateHistoryInState(Dictionary& state)
+void LogGenerator::updateHistoryInState(Dictionary& state, const Clock& clock)
 {
     ListRef history = state[StateKey::History].list();
     if (!history) {
@@ -54,7 +53,7 @@ void LogGenerator::updateHistoryInState(Dictionary& state)
     } else if (history->count() >= HistoryLimit) {
         history->removeFirst(history->count() - (HistoryLimit - 1));
     }
-    history->append(makeHistoryEntry(state));
+    history->append(makeHistoryEntry(state, clock));
 }
 
 } // namespace spectrel

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Platform/Context.h"
 #include "Values/Bytes.h"
 #include "Values/Dictionary.h"
 #include "Values/List.h"
@@ -34,7 +35,7 @@ public:
     virtual void updateState(Dictionary& state, ByteView data) = 0;
     /// The display dictionary, or an absent value; appends one history entry.
     virtual Value generateLogUsingState(Dictionary& state) = 0;
-    /// The property-list dictionary that tells the baseband what to stream.
+    /// The property-list dictionary that asks the baseband for what it should stream.
     virtual DictionaryRef getStartCommand() = 0;
     /// A new list of the dictionaries that a snapshot saves.
     virtual ListRef getSaveContentsFromState(const Dictionary& state) = 0;
@@ -51,18 +52,32 @@ public:
 
     /// A new generator for the telephony service's technology value; null for any other value. The factory of the
     /// programs; what is handed a factory does not know it.
-    static std::unique_ptr<LogGenerator> generatorFromTechnology(const Value& technology);
+    static std::unique_ptr<LogGenerator> generatorFromTechnology(const Value& technology, const Context& context);
     /// Appends one history entry, built from the state's current values, keeping the newest five.
-    static void updateHistoryInState(Dictionary& state);
+    static void updateHistoryInState(Dictionary& state, const Clock& clock);
 
 protected:
-    LogGenerator() = default;
+    explicit LogGenerator(const Context& context)
+        : _context(context)
+    {
+    }
+    const Context& context() const
+    {
+        return _context;
+    }
+    SystemLog& log() const
+    {
+        return _context.log;
+    }
     /// The initialiser: logs "Creating Log object: %p". Apart from the constructor because one generator may stay
     /// uninitialised for want of a template.
     void init();
+
+private:
+    Context _context;
 };
 
 /// Makes a new generator for the telephony service's technology value; null for a value that it does not know.
-using GeneratorFactory = std::function<std::unique_ptr<LogGenerator>(const Value& technology)>;
+using GeneratorFactory = std::function<std::unique_ptr<LogGenerator>(const Value& technology, const Context& context)>;
 
 } // namespace spectrel

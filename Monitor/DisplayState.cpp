@@ -6,7 +6,7 @@ namespace spectrel {
 
 void DisplayState::useTechnology(const Value& technology, SameClass same)
 {
-    auto successor = _makeGenerator(technology);
+    auto successor = _makeGenerator(technology, _context);
     if (same == SameClass::GoesOn && _generator && successor && successor->className() == _generator->className())
         return;
     _generator.replace(std::move(successor), *_state, _hasNews);

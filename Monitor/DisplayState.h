@@ -39,8 +39,9 @@ public:
     /// Between two refresh ticks, at which the display is built when messages have come.
     static constexpr std::chrono::milliseconds RefreshInterval {2000};
 
-    explicit DisplayState(GeneratorFactory makeGenerator)
+    DisplayState(GeneratorFactory makeGenerator, const Context& context)
         : _makeGenerator(std::move(makeGenerator))
+        , _context(context)
         , _state(Dictionary::make())
     {
     }
@@ -99,6 +100,7 @@ public:
 
 private:
     GeneratorFactory _makeGenerator;
+    Context _context; // of the generators
     DictionaryRef _state;
     GeneratorSlot _generator;
     bool _hasNews = false;

@@ -67,7 +67,8 @@ bool Session::fail(SessionLossCause cause, std::int64_t code)
     std::string shown(texts.shown);
     if (const std::size_t place = shown.find('#'); place != std::string::npos)
         shown.replace(place, 1, std::to_string(code));
-    SPECTREL_LOG(Priority::Error, "%s", (std::string(texts.before) + shown + std::string(texts.behind)).c_str());
+    SPECTREL_LOG(_services.context.log, Priority::Error, "%s",
+        (std::string(texts.before) + shown + std::string(texts.behind)).c_str());
     // The first failure of an attempt is the cause, those after it are what was given up for it.
     if (!std::exchange(_attemptHasCause, true))
         _loss = {cause, std::move(shown)};
@@ -97,8 +98,8 @@ bool Session::createPorts()
     _sendPort = _services.ports.createRemote(serviceName);
     if (!_sendPort)
         return fail(Cause::NoRemotePort);
-    SPECTREL_LOG(Priority::Error, " ***** Created ports (send=%p, recv=%p)", static_cast<void*>(_sendPort.get()),
-        static_cast<void*>(_recvPort.get()));
+    SPECTREL_LOG(_services.context.log, Priority::Error, " ***** Created ports (send=%p, recv=%p)",
+        static_cast<void*>(_sendPort.get()), static_cast<void*>(_recvPort.get()));
     return true;
 }
 
@@ -151,7 +152,8 @@ void Session::configureGenerator()
         return;
     _technology = technology->string() ? *technology->string() : std::string();
     _sink.useTechnology(*technology);
-    SPECTREL_LOG(Priority::Error, "Got log generated: %p", static_cast<void*>(_sink.generator()));
+    SPECTREL_LOG(
+        _services.context.log, Priority::Error, "Got log generated: %p", static_cast<void*>(_sink.generator()));
 }
 
 bool Session::open()
@@ -175,7 +177,7 @@ void Session::start()
     if (_displayUpdateTimer)
         return;
     if (open()) {
-        SPECTREL_LOG(Priority::Error, "Starting the display update timer");
+        SPECTREL_LOG(_services.context.log, Priority::Error, "Starting the display update timer");
         _displayUpdateTimer = _services.runLoop.repeat(DisplayState::RefreshInterval, [this] { refresh(); });
         _loss = {};
     } else {
@@ -239,11 +241,11 @@ void Session::handleMessage(std::int32_t id, ByteView body) noexcept
 
 void Session::handleInvalidation(const LocalMessagePort* port)
 {
-    SPECTREL_LOG(Priority::Error, " ***** INVALIDATED %p *****", static_cast<const void*>(port));
+    SPECTREL_LOG(_services.context.log, Priority::Error, " ***** INVALIDATED %p *****", static_cast<const void*>(port));
     restart();
 }
 
-/// Tells the sink when the session came or went, or the reason for its absence has changed.
+/// Informs the sink when the session came or went, or the reason for its absence has changed.
 void Session::announceChange()
 {
     const bool isRunning = _displayUpdateTimer != nullptr;

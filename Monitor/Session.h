@@ -2,6 +2,7 @@
 
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/DisplayState.h"
+#include "Platform/Context.h"
 #include "Platform/Lifetime.h"
 #include "Platform/MessagePort.h"
 #include "Platform/RunLoop.h"
@@ -68,6 +69,7 @@ public:
         RunLoop& runLoop;
         MessagePorts& ports;
         TelephonyServer& telephony;
+        Context context {};
     };
 
     static constexpr std::chrono::seconds RetryDelay {5};
@@ -120,7 +122,7 @@ private:
     std::string _portPrefix;
     SessionLoss _loss; // of the latest attempt to open a session
     bool _attemptHasCause = false;
-    bool _announcedRunning = false; // what the sink was told last
+    bool _announcedRunning = false; // what the sink heard last
     std::string _announcedText;
     std::string _technology;
     Lifetime _lifetime;

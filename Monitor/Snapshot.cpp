@@ -1,10 +1,10 @@
 #include "Monitor/Snapshot.h"
 
 #include "Values/Dictionary.h"
+#include "Values/OwnFile.h"
 #include "Values/PropertyList/PropertyList.h"
 
 #include <filesystem>
-#include <system_error>
 
 namespace spectrel {
 
@@ -28,10 +28,9 @@ std::string snapshotPath(const std::string& directory, Moment savedAt)
 
 bool writeSnapshot(const DictionaryRef& snapshot, const std::string& path, std::string& reason)
 {
-    std::error_code error;
-    std::filesystem::create_directories(std::filesystem::path(path).parent_path(), error);
-    if (error) {
-        reason = error.message();
+    const auto made = makeOwnFolders(std::filesystem::path(path).parent_path().string());
+    if (!made) {
+        reason = made.failure().text;
         return false;
     }
     const auto written = writePropertyListToFile(snapshot, path);

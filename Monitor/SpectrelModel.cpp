@@ -1,7 +1,5 @@
 #include "Monitor/SpectrelModel.h"
 
-#include "Platform/Clock.h"
-
 #include <utility>
 
 namespace spectrel {
@@ -9,8 +7,9 @@ namespace spectrel {
 SpectrelModel::SpectrelModel(
     Services services, GeneratorFactory makeGenerator, SpectrelModelObserver& observer, std::string portPrefix)
     : _runLoop(services.runLoop)
+    , _clock(services.context.clock)
     , _observer(observer)
-    , _display(std::move(makeGenerator))
+    , _display(std::move(makeGenerator), services.context)
     , _session(services, *this, std::move(portPrefix))
 {
 }
@@ -22,7 +21,7 @@ void SpectrelModel::useTechnology(const Value& technology)
 
 void SpectrelModel::updateWithData(ByteView data)
 {
-    _display.apply(data, Clock::installed().now());
+    _display.apply(data, _clock.now());
     _intake += data.size();
     if (_intake >= LargestIntake)
         _session.pause();

@@ -17,7 +17,7 @@
 
 namespace spectrel {
 
-/// Who is told of the model's news; every program that runs a session has one.
+/// Who hears of the model's news; every program that runs a session has one.
 class SpectrelModelObserver {
 public:
     virtual ~SpectrelModelObserver() = default;
@@ -121,6 +121,7 @@ private:
     }
 
     RunLoop& _runLoop;
+    const Clock& _clock;
     SpectrelModelObserver& _observer;
     Lifetime _lifetime;
     std::size_t _intake = 0; // bytes applied since the last refresh

@@ -4,7 +4,6 @@ namespace spectrel {
 
 namespace {
 
-/// What the generators read before a program installs its clock: the system's time, in UTC.
 class UTCClock final : public Clock {
 public:
     Moment now() const override
@@ -21,19 +20,13 @@ public:
     }
 };
 
-UTCClock utcClock;
-Clock* installedClock = &utcClock;
+const UTCClock utcClock;
 
 } // namespace
 
-void Clock::install(Clock* clock)
+const Clock& Clock::utc()
 {
-    installedClock = clock ? clock : &utcClock;
-}
-
-Clock& Clock::installed()
-{
-    return *installedClock;
+    return utcClock;
 }
 
 } // namespace spectrel

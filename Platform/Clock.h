@@ -23,9 +23,8 @@ public:
     /// literal, yyyy MM dd HH mm ss are the calendar fields.
     virtual std::string formatted(Moment moment, std::string_view pattern) const = 0;
 
-    /// The clock that the log generators read; the system's until another is installed. It must outlive its use.
-    static void install(Clock* clock);
-    static Clock& installed();
+    /// The system's time, in UTC: for whoever has no clock of the device.
+    static const Clock& utc();
 };
 
 } // namespace spectrel

@@ -5,23 +5,19 @@
 namespace spectrel {
 
 namespace {
-Console* installedConsole = nullptr;
-}
 
-void Console::install(Console* console)
-{
-    installedConsole = console;
-}
+class NoConsole final : public Console {
+public:
+    void line(std::string_view) override { }
+};
 
-Console* Console::installed()
-{
-    return installedConsole;
-}
+NoConsole noConsole;
 
-void consoleLine(std::string_view text)
+} // namespace
+
+Console& Console::none()
 {
-    if (installedConsole)
-        installedConsole->line(text);
+    return noConsole;
 }
 
 void StandardErrorConsole::line(std::string_view text)

@@ -14,12 +14,9 @@ public:
     /// `text` comes without its newline.
     virtual void line(std::string_view text) = 0;
 
-    /// Null drops the lines. The console must outlive its installation.
-    static void install(Console* console);
-    static Console* installed();
+    /// Drops the lines.
+    static Console& none();
 };
-
-void consoleLine(std::string_view text);
 
 /// Writes to standard error, for programs whose standard output is their result.
 class StandardErrorConsole : public Console {

@@ -1,5 +1,7 @@
 #include "Platform/Places.h"
 
+#include "Values/OwnFile.h"
+
 #include <cerrno>
 #include <cstdlib>
 #include <filesystem>
@@ -79,9 +81,8 @@ std::string Places::resourcesDirectory()
 
 Outcome makePrivateDirectory(const std::string& path)
 {
-    const fs::path folder(path);
-    std::error_code error;
-    fs::create_directories(folder.parent_path(), error);
+    if (auto made = makeOwnFolders(fs::path(path).parent_path().string()); !made)
+        return made;
     if (::mkdir(path.c_str(), 0700) != 0 && errno != EEXIST)
         return Failure::ofSystem().of(path);
     struct stat status { };

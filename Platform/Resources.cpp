@@ -23,18 +23,12 @@ public:
 };
 
 const NoResources noResources;
-const Resources* installedResources = &noResources;
 
 } // namespace
 
-void Resources::install(const Resources* resources)
+const Resources& Resources::none()
 {
-    installedResources = resources ? resources : &noResources;
-}
-
-const Resources& Resources::installed()
-{
-    return *installedResources;
+    return noResources;
 }
 
 DirectoryResources::DirectoryResources(std::string directory)

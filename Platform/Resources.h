@@ -18,9 +18,8 @@ public:
     /// Full paths of all resources of type "plist", sorted by name.
     virtual std::vector<std::string> propertyListPaths() const = 0;
 
-    /// The resources that the log generators read; none at all until installed. They must outlive their use.
-    static void install(const Resources* resources);
-    static const Resources& installed();
+    /// An empty set.
+    static const Resources& none();
 };
 
 /// Resources in one folder of the file system.

@@ -6,18 +6,29 @@
 
 namespace spectrel {
 
-SystemLog* SystemLog::_installed = nullptr;
-int SystemLog::_leastUrgent = -1;
+namespace {
 
-void SystemLog::install(SystemLog* log, int leastUrgent)
+class NoLog final : public SystemLog {
+public:
+    NoLog()
+        : SystemLog(NoPriority)
+    {
+    }
+    void write(int, std::string_view) override { }
+};
+
+NoLog noLog;
+
+} // namespace
+
+SystemLog& SystemLog::none()
 {
-    _installed = log;
-    _leastUrgent = log ? leastUrgent : -1;
+    return noLog;
 }
 
 namespace detail {
 
-void writeLogLine(int priority, const char* format, ...)
+void writeLogLine(SystemLog& log, int priority, const char* format, ...)
 {
     char line[1024]; // longer lines are measured first, then formatted in full
     va_list arguments;
@@ -27,21 +38,21 @@ void writeLogLine(int priority, const char* format, ...)
     const int length = std::vsnprintf(line, sizeof line, format, arguments);
     va_end(arguments);
     if (length >= 0 && static_cast<std::size_t>(length) < sizeof line) {
-        SystemLog::installed()->write(priority, {line, static_cast<std::size_t>(length)});
+        log.write(priority, {line, static_cast<std::size_t>(length)});
     } else if (length >= 0) {
         std::string text(static_cast<std::size_t>(length) + 1, '\0');
         std::vsnprintf(text.data(), text.size(), format, again);
         text.pop_back();
-        SystemLog::installed()->write(priority, text);
+        log.write(priority, text);
     }
     va_end(again);
 }
 
 } // namespace detail
 
-void reportAssertionFailure(std::string_view fileName, int line, std::string_view text)
+void reportAssertionFailure(SystemLog& log, std::string_view fileName, int line, std::string_view text)
 {
-    SPECTREL_LOG(Priority::Error, "%.*s (%.*s:%d)", static_cast<int>(text.size()), text.data(),
+    SPECTREL_LOG(log, Priority::Error, "%.*s (%.*s:%d)", static_cast<int>(text.size()), text.data(),
         static_cast<int>(fileName.size()), fileName.data(), line);
 }
 

@@ -19,41 +19,40 @@ public:
     /// `priority` is the raw syslog value; `text` may hold any bytes.
     virtual void write(int priority, std::string_view text) = 0;
 
-    /// Installs the log that `logLine` writes to (null: none) and the least urgent severity (0 to 7) that is wanted;
-    /// -1 wants nothing. The log must outlive its installation.
-    static void install(SystemLog* log, int leastUrgent);
-    static SystemLog* installed()
-    {
-        return _installed;
-    }
-    static int leastUrgent()
-    {
-        return _leastUrgent;
-    }
-
     /// Whether lines of this priority are wanted; the severity is its low three bits. Ask before costly formatting.
-    static bool wants(int priority)
+    bool wants(int priority) const
     {
         return (priority & 7) <= _leastUrgent;
     }
+    /// Wants nothing.
+    static SystemLog& none();
+
+protected:
+    static constexpr int EveryPriority = 7;
+    static constexpr int NoPriority = -1;
+
+    /// `leastUrgent`: the least urgent severity (0 to 7) that is wanted, or `NoPriority`.
+    explicit SystemLog(int leastUrgent)
+        : _leastUrgent(leastUrgent)
+    {
+    }
 
 private:
-    static SystemLog* _installed;
-    static int _leastUrgent;
+    int _leastUrgent;
 };
 
 namespace detail {
-void writeLogLine(int priority, const char* format, ...) __attribute__((format(printf, 2, 3)));
+void writeLogLine(SystemLog& log, int priority, const char* format, ...) __attribute__((format(printf, 3, 4)));
 }
 
-/// Writes one printf-formatted line; costs one comparison when nobody wants it.
-#define SPECTREL_LOG(priority, ...)                                                                                    \
+/// Writes one printf-formatted line to the `SystemLog` that `log` names; costs one comparison when nobody wants it.
+#define SPECTREL_LOG(log, priority, ...)                                                                               \
     do {                                                                                                               \
-        if (::spectrel::SystemLog::wants(priority))                                                                    \
-            ::spectrel::detail::writeLogLine(priority, __VA_ARGS__);                                                   \
+        if ((log).wants(priority))                                                                                     \
+            ::spectrel::detail::writeLogLine((log), (priority), __VA_ARGS__);                                          \
     } while (false)
 
 /// Reports an assertion failure (priority 3: text, file name, line); processing goes on.
-void reportAssertionFailure(std::string_view fileName, int line, std::string_view text);
+void reportAssertionFailure(SystemLog& log, std::string_view fileName, int line, std::string_view text);
 
 } // namespace spectrel

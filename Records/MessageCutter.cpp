@@ -77,7 +77,7 @@ template <typename Visitor> void MessageCutter::visitCandidates(std::size_t plac
         visit(whole);
     if (_sequence == MessageSequence::Whole)
         return;
-    if (isItem(place)) { // its type byte is missing: the code tells it
+    if (isItem(place)) { // its type byte is missing: the code gives it
         const bool isExtra = itemCode(_bytes, place) < SmallestExtraFree;
         visit({itemLength(_bytes, place), BeheadedScore, isExtra ? ExtraRecord : OrdinaryRecord});
     }

@@ -14,7 +14,7 @@ namespace spectrel {
 namespace {
 
 constexpr std::size_t FirstBytes = 4; // tell the kind
-constexpr std::uint64_t LongestRun = 1 << 20; // damage that goes on is told piece by piece
+constexpr std::uint64_t LongestRun = 1 << 20; // damage that goes on is reported piece by piece
 
 bool startsPcapng(ByteView bytes)
 {
@@ -64,8 +64,8 @@ private:
     std::optional<Technology> _technology;
     StreamBuffer _buffer;
     std::unique_ptr<StreamCutter> _cutter; // once the first bytes have told the kind
-    SkippedBytes _run; // damage taken and not told yet
-    StreamCutter::Found _behindRun = StreamCutter::Found::Nothing; // found, to be told after the run
+    SkippedBytes _run; // damage taken and not reported yet
+    StreamCutter::Found _behindRun = StreamCutter::Found::Nothing; // found, to be reported after the run
     RecordedMessage _message;
     SkippedBytes _skipped;
     std::string _reason;
@@ -127,7 +127,7 @@ StreamStep CutStream::next(RecordedMessage& message)
     return stepFor(std::exchange(_behindRun, StreamCutter::Found::Nothing));
 }
 
-/// Pieces of damage without a message between them are one; true when it has become long enough to be told.
+/// Pieces of damage without a message between them are one; true when it has become long enough to be reported.
 bool CutStream::addToRun(std::uint64_t offset, const StreamCutter::Piece& damage)
 {
     if (_run.length == 0)

@@ -15,8 +15,8 @@ enum class StreamStep : std::uint8_t {
     Waiting, // nothing before more bytes come
     Begin, // a recording starts: `technology` holds for what follows
     Message,
-    Skipped, // `skipped` tells what
-    Refused, // `reason` tells why nothing of this stream can be used; final
+    Skipped, // `skipped` says what
+    Refused, // `reason` says why nothing of this stream can be used; final
 };
 
 /// Bytes of a stream that were no message.
@@ -27,7 +27,7 @@ struct SkippedBytes {
 };
 
 /// Cuts a live stream of capture (classic pcap) or DLF bytes into log messages as they come, and finds its way on after
-/// damage. Several recordings may follow each other. The first bytes tell the kind; docs/sources.md tells the rules.
+/// damage. Several recordings may follow each other. The first bytes decide the kind; docs/sources.md has the rules.
 ///
 /// Take steps until `Waiting` after each `append`; then what is kept stays below `MostPending` bytes. Where the bytes
 /// are cut apart on their way makes no difference, unless `settle` is called.
@@ -51,7 +51,7 @@ public:
     virtual const std::string& reason() const = 0;
 };
 
-/// `technology`: where the stream does not tell it.
+/// `technology`: where the stream does not name it.
 std::unique_ptr<RecordingStream> makeRecordingStream(std::optional<Technology> technology);
 
 } // namespace spectrel

@@ -15,7 +15,7 @@ public:
         Nothing, // more bytes must come
         Begin, // of a recording; its header is taken
         Message,
-        Damage, // bytes that are none of it are taken; `damage` tells why
+        Damage, // bytes that are none of it are taken; `damage` says why
     };
     struct Piece {
         std::uint64_t length = 0; // of the damage

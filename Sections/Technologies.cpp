@@ -8,21 +8,21 @@
 
 namespace spectrel {
 
-std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(const Value& technology)
+std::unique_ptr<LogGenerator> LogGenerator::generatorFromTechnology(const Value& technology, const Context& context)
 {
     const std::string* constant = technology.string();
     if (!constant)
         return nullptr;
     if (*constant == kRKLogChannelTechnology_IFX)
-        return GSMLogGenerator::generator();
+        return GSMLogGenerator::generator(context);
     if (*constant == kRKLogChannelTechnology_Zephyr_GSM)
-        return ZPH_GSMLogGenerator::generator();
+        return ZPH_GSMLogGenerator::generator(context);
     if (*constant == kRKLogChannelTechnology_Zephyr_CDMA)
-        return C2KLogGenerator::generator();
+        return C2KLogGenerator::generator(context);
     if (*constant == kRKLogChannelTechnology_Zephyr_LTE)
-        return LTELogGenerator::generator();
+        return LTELogGenerator::generator(context);
     if (*constant == kRKLogChannelTechnology_Zephyr_UTRAN2)
-        return UTRANLogGenerator::generator();
+        return UTRANLogGenerator::generator(context);
     return nullptr;
 }
 

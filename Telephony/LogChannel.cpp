@@ -67,19 +67,21 @@ bool Subscription::wants(ByteView message) const
     return _wantsEverything || !code || _codes.contains(*code);
 }
 
-LogChannel::LogChannel(RunLoop& runLoop, LogSource& source, unsigned number, std::function<void()> onEnd)
+LogChannel::LogChannel(
+    RunLoop& runLoop, const Clock& clock, LogSource& source, unsigned number, std::function<void()> onEnd)
     : _runLoop(runLoop)
+    , _clock(clock)
     , _source(source)
     , _onEnd(std::move(onEnd))
 {
     _status.name = "channel " + std::to_string(number);
 }
 
-std::unique_ptr<LogChannel> LogChannel::open(RunLoop& runLoop, MessagePorts& ports, LogSource& source, unsigned number,
-    const std::string& clientPort, std::function<void()> onEnd)
+std::unique_ptr<LogChannel> LogChannel::open(RunLoop& runLoop, const Clock& clock, MessagePorts& ports,
+    LogSource& source, unsigned number, const std::string& clientPort, std::function<void()> onEnd)
 {
     const std::string name = std::string(Protocol::ServicePort) + ".LogChannel." + std::to_string(number);
-    std::unique_ptr<LogChannel> channel(new LogChannel(runLoop, source, number, std::move(onEnd)));
+    std::unique_ptr<LogChannel> channel(new LogChannel(runLoop, clock, source, number, std::move(onEnd)));
     LogChannel* self = channel.get();
     channel->_client = ports.createRemote(clientPort);
     if (!channel->_client)
@@ -133,7 +135,7 @@ std::optional<Bytes> LogChannel::handleRequest(std::int32_t id, ByteView body)
 void LogChannel::startStreaming(Subscription subscription)
 {
     const std::string client = _status.client;
-    _status = {_status.name, client, subscription.description(), true, false, Clock::installed().now(), 0, 0, 0, 0};
+    _status = {_status.name, client, subscription.description(), true, false, _clock.now(), 0, 0, 0, 0};
     printServiceLine(_status.name + ": streaming " + _status.wish + " to " + client);
     _stream.reset();
     _subscription = std::move(subscription);

@@ -56,8 +56,8 @@ class LogChannel final : public MessageSink {
 public:
     /// `onEnd` is called from the main queue once the client has gone; it may destroy the channel.
     /// Null when the port cannot be made or nobody serves the client's.
-    static std::unique_ptr<LogChannel> open(RunLoop& runLoop, MessagePorts& ports, LogSource& source, unsigned number,
-        const std::string& clientPort, std::function<void()> onEnd);
+    static std::unique_ptr<LogChannel> open(RunLoop& runLoop, const Clock& clock, MessagePorts& ports,
+        LogSource& source, unsigned number, const std::string& clientPort, std::function<void()> onEnd);
     ~LogChannel() override;
 
     bool deliver(ByteView message) override;
@@ -70,12 +70,13 @@ public:
     ChannelStatus status() const;
 
 private:
-    LogChannel(RunLoop& runLoop, LogSource& source, unsigned number, std::function<void()> onEnd);
+    LogChannel(RunLoop& runLoop, const Clock& clock, LogSource& source, unsigned number, std::function<void()> onEnd);
     std::optional<Bytes> handleRequest(std::int32_t id, ByteView body);
     void startStreaming(Subscription subscription);
     void end();
 
     RunLoop& _runLoop;
+    const Clock& _clock;
     LogSource& _source;
     ChannelStatus _status; // but for what the stream knows
     std::function<void()> _onEnd;

@@ -24,8 +24,9 @@ Bytes answer(ChannelError error, const std::string& portName = {})
 
 } // namespace
 
-TelephonyService::TelephonyService(RunLoop& runLoop, MessagePorts& ports, LogSource& source)
+TelephonyService::TelephonyService(RunLoop& runLoop, const Clock& clock, MessagePorts& ports, LogSource& source)
     : _runLoop(runLoop)
+    , _clock(clock)
     , _ports(ports)
     , _source(source)
 {
@@ -88,7 +89,7 @@ Bytes TelephonyService::handleRequest(std::int32_t id, ByteView body)
     if (_channels.size() >= MaxChannels)
         return answer(ChannelError::TooManyChannels);
     const unsigned number = ++_latestNumber;
-    auto channel = LogChannel::open(_runLoop, _ports, _source, number, *clientPort, [this, number] {
+    auto channel = LogChannel::open(_runLoop, _clock, _ports, _source, number, *clientPort, [this, number] {
         _channels.erase(number);
         reportChange();
     });

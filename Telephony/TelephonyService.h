@@ -20,7 +20,7 @@ class TelephonyService {
 public:
     static constexpr std::size_t MaxChannels = 64;
 
-    TelephonyService(RunLoop& runLoop, MessagePorts& ports, LogSource& source);
+    TelephonyService(RunLoop& runLoop, const Clock& clock, MessagePorts& ports, LogSource& source);
     ~TelephonyService();
     TelephonyService(const TelephonyService&) = delete;
     TelephonyService& operator=(const TelephonyService&) = delete;
@@ -44,6 +44,7 @@ private:
     void reportChange();
 
     RunLoop& _runLoop;
+    const Clock& _clock;
     MessagePorts& _ports;
     LogSource& _source;
     std::shared_ptr<LocalMessagePort> _port;

@@ -11,7 +11,7 @@ class SpectrelPaneController;
 
 /// Copies what is shown to the clipboard, in the text form of `decode --format tree`.
 ///
-/// `message` tells what became of it; the toolkit is told of its changes as `ScreenPart::Notice`.
+/// `message` says what became of it; the toolkit hears of its changes as `ScreenPart::Notice`.
 class CopyController {
 public:
     explicit CopyController(ScreenToolkit& toolkit)

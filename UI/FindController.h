@@ -24,7 +24,7 @@ struct Find {
 /// Finds rows by name or value in the pane in sight and below it, while the user types.
 ///
 /// A text is found whatever the case of its ASCII letters. The list follows every reload of the tree, the selection its
-/// row. The toolkit is told of every change as `ScreenPart::Find`.
+/// row. The toolkit hears of every change as `ScreenPart::Find`.
 class FindController {
 public:
     static constexpr std::size_t MaximumFinds = 1000;

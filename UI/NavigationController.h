@@ -11,7 +11,7 @@ namespace spectrel {
 class NavigationController;
 class SpectrelPaneController;
 
-/// Who is told before a pane comes to the top.
+/// Who hears before a pane comes to the top.
 class NavigationControllerDelegate {
 public:
     virtual ~NavigationControllerDelegate() = default;

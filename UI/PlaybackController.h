@@ -11,7 +11,7 @@ namespace spectrel {
 
 /// The playback line of a recording that is browsed: what it says and what its buttons do.
 ///
-/// The toolkit is told of every change as `ScreenPart::Playback`.
+/// The toolkit hears of every change as `ScreenPart::Playback`.
 class PlaybackController {
 public:
     static constexpr std::chrono::seconds SeekStep {10};

@@ -105,8 +105,8 @@ void SpectrelApp::showSaveView()
     if (_saveViewController || !_model)
         return;
     setSaveViewController(std::make_unique<SpectrelSaveViewController>(
-        SpectrelSaveViewController::Services {
-            *this, _services.toolkit, _services.clock, _services.writeSnapshot, _services.snapshotDirectory},
+        SpectrelSaveViewController::Services {*this, _services.toolkit, _services.clock, _services.log,
+            _services.writeSnapshot, _services.snapshotDirectory},
         _model->getSaveContents()));
     _saveViewController->viewWillAppear();
     _services.toolkit.screenDidChange(ScreenPart::Modal, Animation::Animated);

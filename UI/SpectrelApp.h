@@ -5,6 +5,7 @@
 #include "Platform/Clock.h"
 #include "Platform/Preferences.h"
 #include "Platform/RunLoop.h"
+#include "Platform/SystemLog.h"
 #include "UI/Application.h"
 #include "UI/CopyController.h"
 #include "UI/FindController.h"
@@ -60,6 +61,7 @@ public:
     struct Services {
         RunLoop& runLoop;
         const Clock& clock;
+        SystemLog& log;
         Preferences& preferences;
         ScreenToolkit& toolkit;
         ModelFactory makeModel; // called once, at launch; the model must not call back while it is being made

@@ -38,7 +38,7 @@ void SpectrelSaveViewController::savePressed()
     const std::string path = snapshotPath(_services.directory, _services.clock.now());
     std::string reason;
     if (!_services.writeSnapshot(snapshot, path, reason)) {
-        SPECTREL_LOG(Priority::Error, "Unable to write snapshot to %s", path.c_str());
+        SPECTREL_LOG(_services.log, Priority::Error, "Unable to write snapshot to %s", path.c_str());
         _services.toolkit.showAlert({"File Error", "Unable to write file to disk", "Close"});
     }
     _services.application.saveViewDidFinish();

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Platform/Clock.h"
+#include "Platform/SystemLog.h"
 #include "UI/Application.h"
 #include "UI/ScreenToolkit.h"
 #include "UI/TableView.h"
@@ -36,6 +37,7 @@ public:
         Application& application;
         ScreenToolkit& toolkit;
         const Clock& clock;
+        SystemLog& log;
         SnapshotWriter writeSnapshot;
         std::string directory; // the crash-log directory
     };

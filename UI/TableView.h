@@ -72,7 +72,7 @@ private:
 using CellRef = std::shared_ptr<TableCell>;
 class TableView;
 
-/// Where a table's rows come from, and who is told of taps. One section.
+/// Where a table's rows come from, and who hears of taps. One section.
 class TableSource {
 public:
     virtual ~TableSource() = default;

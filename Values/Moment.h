@@ -12,7 +12,7 @@ using Moment = std::chrono::sys_time<std::chrono::microseconds>;
 /// The platform's default date form, in UTC whatever the device's zone: "2019-12-09 21:26:56 +0000".
 std::string defaultDateForm(Moment moment);
 
-/// The moment that such a text tells; none when it is not in that form.
+/// The moment that such a text says; none when it is not in that form.
 bool parseDefaultDateForm(std::string_view text, Moment& moment);
 
 } // namespace spectrel

@@ -12,9 +12,9 @@ namespace spectrel {
 
 namespace {
 
-int runTerminal()
+int runTerminal(const Context& context)
 {
-    LiveServices live;
+    LiveServices live(context);
     TerminalFrontEnd frontEnd(live.runLoop());
     frontEnd.onQuit = [&live] { live.runLoop().quit(); };
     if (const Outcome started = frontEnd.start(); !started) {
@@ -28,14 +28,14 @@ int runTerminal()
 
 } // namespace
 
-int runApplication(const Arguments& arguments)
+int runApplication(const Arguments& arguments, const Context& context)
 {
     const auto screens = findScreens(arguments.screens);
     if (!screens)
         return ExitStatus::Failed;
     if (screens == Screens::Graphical)
         return runGraphical(arguments, {});
-    return screens == Screens::Terminal ? runTerminal() : watch(arguments.watch);
+    return screens == Screens::Terminal ? runTerminal(context) : watch(arguments.watch, context);
 }
 
 } // namespace spectrel

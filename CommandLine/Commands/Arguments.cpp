@@ -4,6 +4,7 @@
 
 #include <CLI/CLI.hpp>
 #include <iostream>
+#include <limits>
 
 namespace spectrel {
 
@@ -23,11 +24,35 @@ constexpr const char* Environment =
     "Exit status: 0 done, 1 something could not be done, 2 wrong usage.";
 
 constexpr OptionForm<OutputFormat> FormatForm {
-    "tree|json|changes|csv|none", outputFormatNamed, "is not one of tree, json, changes, csv, none"};
+    "tree|json|changes|csv|table|none", outputFormatNamed, "is not one of tree, json, changes, csv, table, none"};
 
-void addFormat(CLI::App& command, OutputFormat& format)
+constexpr OptionForm<std::vector<TableColumn>> ColumnsForm {
+    "PATH[=NAME],...", parseTableColumns, "is no list of columns PATH[=NAME],..."};
+
+void addOutput(CLI::App& command, OutputOptions& output)
 {
-    addFormedOption(command, "--format", format, FormatForm, "How the display is printed (default: tree)");
+    addFormedOption(command, "--format", output.format, FormatForm, "How the display is printed (default: tree)");
+    command
+        .add_option("--path", output.paths,
+            "Print only the leaves with such a path: * stands for any text within a name, ** across names (repeatable)")
+        ->type_name("GLOB")
+        ->expected(1)
+        ->take_all()
+        ->check([](const std::string& glob) { return glob.empty() ? "'' is no path" : ""; });
+    addFormedOption(command, "--columns", output.columns, ColumnsForm,
+        "With --format table: the leaves that make its columns, and what stands above them");
+}
+
+/// What no single option can say.
+void checkOutput(const OutputOptions& output)
+{
+    const bool isTable = output.format == OutputFormat::Table;
+    if (isTable && output.columns.empty())
+        throw CLI::ValidationError("--format", "table needs --columns");
+    if (!isTable && !output.columns.empty())
+        throw CLI::ValidationError("--columns", "goes with --format table only");
+    if (isTable && !output.paths.empty())
+        throw CLI::ValidationError("--path", "a table has its --columns");
 }
 
 void addLimits(CLI::App& command, std::optional<std::uint64_t>& count, const char* what,
@@ -37,14 +62,36 @@ void addLimits(CLI::App& command, std::optional<std::uint64_t>& count, const cha
     addFormedOption(command, "--duration", duration, DurationForm, "End after this time");
 }
 
-void addCommon(CLI::App& command, Arguments& arguments)
+void addVersion(CLI::App& command)
 {
     command.set_version_flag("--version", "spectrel " SPECTREL_VERSION);
+}
+
+void addCommon(CLI::App& command, Arguments& arguments)
+{
+    addVersion(command);
     addFormedOption(
         command, "--resources", arguments.resources, FolderForm, "Take the display templates from this folder");
     addFormedOption(
         command, "--log", arguments.logFile, FileForm, "Write every system-log line to this file: <PRIORITY>TEXT");
 }
+
+std::optional<std::uint32_t> parseChannel(std::string_view text)
+{
+    const auto number = parseWholeNumber(text, 0, std::numeric_limits<std::uint32_t>::max());
+    return number ? std::optional(static_cast<std::uint32_t>(*number)) : std::nullopt;
+}
+
+std::optional<double> parseFrequency(std::string_view text)
+{
+    return parseNumber(text, 0, 1e6);
+}
+
+constexpr OptionForm<ChannelTechnology> ChannelTechnologyForm {
+    "lte|utran|gsm|cdma", channelTechnologyNamed, "is not one of lte, utran, gsm, cdma"};
+constexpr OptionForm<ChannelFormat> ChannelFormatForm {"text|json", channelFormatNamed, "is not one of text, json"};
+constexpr OptionForm<std::uint32_t> ChannelForm {"NUMBER", parseChannel, "is no channel number"};
+constexpr OptionForm<double> FrequencyForm {"FREQUENCY", parseFrequency, "is no frequency in MHz"};
 
 void addScreens(CLI::App& command, Arguments& arguments)
 {
@@ -67,7 +114,7 @@ void addWatch(CLI::App& program, Arguments& arguments)
     CLI::App& command = *program.add_subcommand("watch", "Print the live session, once at each refresh");
     command.callback([&arguments] { arguments.job = Job::Watch; });
     addCommon(command, arguments);
-    addFormat(command, arguments.watch.format);
+    addOutput(command, arguments.watch.output);
     addLimits(command, arguments.watch.count, "End after this many refreshes", arguments.watch.duration);
 }
 
@@ -81,7 +128,7 @@ void addDecode(CLI::App& program, Arguments& arguments)
     command.add_option("FILE", decode.files, "The recordings, decoded one after the other; - is standard input")
         ->required()
         ->type_name("");
-    addFormat(command, decode.format);
+    addOutput(command, decode.output);
     command.add_flag("--each", decode.each, "With --format json: one line for each message");
     addTechnology(command, decode.technology);
     addFormedOption(command, "--snapshot", decode.snapshotDirectory, FolderForm,
@@ -109,10 +156,11 @@ void addRecord(CLI::App& program, Arguments& arguments)
     addCommon(command, arguments);
     RecordingFilesOptions& files = arguments.record.files;
     addFormedOption(command, "FILE", files.target, FileForm,
-        "The capture file; an existing one is overwritten. A folder (or a new one: FOLDER/) takes numbered files, on "
-        "from those that are there. - is standard output")
+        "The capture file, a new one. A folder (or a new one: FOLDER/) takes numbered files, on from those that are "
+        "there. - is standard output")
         ->required()
         ->type_name("");
+    command.add_flag("--overwrite", files.overwrite, "Write over the capture file, where it is there");
     addFormedOption(command, "--rollover", files.largestFile, SizeForm,
         "Begin a further file before one has more bytes than this, such as 100M");
     addFormedOption(command, "--rollover-time", files.longestFile, DurationForm,
@@ -122,10 +170,29 @@ void addRecord(CLI::App& program, Arguments& arguments)
     addLimits(command, arguments.record.count, "End after this many messages", arguments.record.duration);
 }
 
+void addChannel(CLI::App& program, Arguments& arguments)
+{
+    ChannelOptions& channel = arguments.channel;
+    CLI::App& command = *program.add_subcommand("channel", "Print the bands and frequencies of a channel number");
+    command.callback([&arguments] { arguments.job = Job::Channel; });
+    addVersion(command);
+    addFormedOption(command, "TECH", channel.technology, ChannelTechnologyForm, "Whose channel")->required();
+    addFormedOption(command, "NUMBER", channel.number, ChannelForm, "A downlink or uplink channel number");
+    addFormedOption(command, "--mhz", channel.mhz, FrequencyForm,
+        "Instead of a number: a downlink or uplink centre frequency in MHz");
+    command.add_option("--band", channel.band, "Only this band, such as 3 or 'DCS 1800'")->type_name("BAND");
+    addFormedOption(
+        command, "--format", channel.format, ChannelFormatForm, "How the bands are printed (default: text)");
+}
+
 /// What no single option can tell.
 void checkTogether(const Arguments& arguments)
 {
-    if (arguments.decode.each && arguments.decode.format != OutputFormat::Json)
+    if (arguments.job == Job::Channel && arguments.channel.number.has_value() == arguments.channel.mhz.has_value())
+        throw CLI::ValidationError("channel", "takes either a channel NUMBER or --mhz FREQUENCY");
+    checkOutput(arguments.decode.output);
+    checkOutput(arguments.watch.output);
+    if (arguments.decode.each && arguments.decode.output.format != OutputFormat::Json)
         throw CLI::ValidationError("--each", "goes with --format json only");
     const RecordingFilesOptions& files = arguments.record.files;
     if (files.target == "-" && (files.largestFile || files.longestFile || files.keep))
@@ -148,6 +215,7 @@ std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
     addDecode(program, arguments);
     addView(program, arguments);
     addRecord(program, arguments);
+    addChannel(program, arguments);
     try {
         program.parse(argc, argv);
         checkTogether(arguments);

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "CommandLine/Commands/Channel.h"
 #include "CommandLine/Commands/Decode.h"
 #include "CommandLine/Commands/Record.h"
 #include "CommandLine/Commands/View.h"
@@ -14,9 +15,9 @@
 
 namespace spectrel {
 
-enum class Job : std::uint8_t { Application, Watch, Decode, View, Record };
+enum class Job : std::uint8_t { Application, Watch, Decode, View, Record, Channel };
 
-/// Which screens the application was told to open; by default it finds out by itself.
+/// Which screens the application was asked to open; by default it finds out by itself.
 enum class ScreenChoice : std::uint8_t { Automatic, Graphical, Terminal };
 
 /// The command line of `spectrel`, read.
@@ -29,10 +30,11 @@ struct Arguments {
     ViewOptions view;
     WatchOptions watch;
     RecordOptions record;
+    ChannelOptions channel;
 };
 
 /// Reads the command line. An exit status when the program is done with that: after --help, --version or wrong usage,
-/// each told on the stream where it belongs.
+/// each reported on the stream where it belongs.
 std::optional<int> readArguments(int argc, char** argv, Arguments& arguments);
 
 } // namespace spectrel

@@ -15,12 +15,14 @@ namespace {
 /// Runs the files through one session and prints as it goes.
 class Decoding {
 public:
-    explicit Decoding(const DecodeOptions& options)
+    Decoding(const DecodeOptions& options, const Context& context)
         : _options(options)
-        , _session(&LogGenerator::generatorFromTechnology, options.snapshotDirectory.has_value())
-        , _journal(printsChanges(options.format) ? &_session.displayState().followChanges() : nullptr)
-        , _output(stdout, options.format)
+        , _session(&LogGenerator::generatorFromTechnology, options.snapshotDirectory.has_value(), context)
+        , _journal(printsChanges(options.output.format) ? &_session.displayState().followChanges() : nullptr)
+        , _output(stdout, options.output)
     {
+        if (options.output.format == OutputFormat::Table)
+            _session.setTickHandler([this](Moment tick) { _output.printRow(tick, _session.display()); });
     }
 
     int run()
@@ -31,6 +33,8 @@ public:
         }
         if (!_options.each)
             _output.printDisplay(_session.display());
+        if (_session.messages() > 0)
+            _output.printRow(_session.lastTime(), _session.display());
         saveSnapshot();
         if (!_output.flush())
             fail("standard output: cannot be written");
@@ -112,9 +116,9 @@ private:
 
 } // namespace
 
-int decode(const DecodeOptions& options)
+int decode(const DecodeOptions& options, const Context& context)
 {
-    return Decoding(options).run();
+    return Decoding(options, context).run();
 }
 
 } // namespace spectrel

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CommandLine/Output/OutputWriter.h"
+#include "Platform/Context.h"
 #include "Records/Recording.h"
 
 #include <optional>
@@ -12,15 +13,15 @@ namespace spectrel {
 /// What `spectrel decode` was asked for.
 struct DecodeOptions {
     std::vector<std::string> files;
-    OutputFormat format = OutputFormat::Tree;
+    OutputOptions output;
     bool each = false; // with Json: one line for each message
     bool keepGoing = false; // past a message that would end the running application
-    std::optional<Technology> technology; // where a file does not tell
+    std::optional<Technology> technology; // where a file does not say
     std::optional<std::string> snapshotDirectory;
 };
 
 /// Decodes the recordings one after the other, as one session, and prints the display to standard output. Answers the
 /// program's exit status.
-int decode(const DecodeOptions& options);
+int decode(const DecodeOptions& options, const Context& context);
 
 } // namespace spectrel

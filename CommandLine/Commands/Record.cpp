@@ -18,9 +18,10 @@ constexpr std::chrono::milliseconds FlushDelay {500};
 
 class Recorder final : public SessionSink {
 public:
-    explicit Recorder(const RecordOptions& options)
+    Recorder(const RecordOptions& options, const Context& context)
         : _options(options)
         , _files(options.files)
+        , _live(context)
         , _session(_live.services(), *this, LiveServices::portPrefixFor("Record"))
     {
     }
@@ -49,7 +50,7 @@ public:
 
     void useTechnology(const Value& technology) override
     {
-        _generator = LogGenerator::generatorFromTechnology(technology);
+        _generator = LogGenerator::generatorFromTechnology(technology, _live.context());
     }
     LogGenerator* generator() override
     {
@@ -83,14 +84,14 @@ private:
         const auto technology = technologyOfConstant(_session.technology());
         if (!technology || _status != 0)
             return;
-        if (const auto begun = _files.begin(*technology, Clock::installed().now()); !begun)
+        if (const auto begun = _files.begin(*technology, _live.clock().now()); !begun)
             fail(begun.failure().text);
     }
 
     void write(Technology technology, ByteView body)
     {
         const std::size_t before = _files.count();
-        if (const auto written = _files.write(technology, Clock::installed().now(), body); !written)
+        if (const auto written = _files.write(technology, _live.clock().now(), body); !written)
             return fail(written.failure().text);
         if (before > 0 && _files.count() > before)
             report("recording into " + _files.path());
@@ -121,9 +122,9 @@ private:
 
 } // namespace
 
-int record(const RecordOptions& options)
+int record(const RecordOptions& options, const Context& context)
 {
-    return Recorder(options).run();
+    return Recorder(options, context).run();
 }
 
 } // namespace spectrel

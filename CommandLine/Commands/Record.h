@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CommandLine/Commands/RecordingFiles.h"
+#include "Platform/Context.h"
 
 #include <chrono>
 #include <cstdint>
@@ -17,6 +18,6 @@ struct RecordOptions {
 
 /// Records a live session into capture files, as delivered, until interrupted or until what was asked for is recorded.
 /// Messages reach the file at most half a second after they came. Answers the program's exit status.
-int record(const RecordOptions& options);
+int record(const RecordOptions& options, const Context& context);
 
 } // namespace spectrel

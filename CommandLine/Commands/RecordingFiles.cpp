@@ -1,12 +1,17 @@
 #include "CommandLine/Commands/RecordingFiles.h"
 
 #include "Records/Capture/CaptureFormat.h"
+#include "Values/OwnFile.h"
 
 #include <algorithm>
 #include <cerrno>
 #include <charconv>
 #include <cstdio>
+#include <fcntl.h>
 #include <filesystem>
+#include <limits>
+#include <sys/file.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
 namespace spectrel {
@@ -50,6 +55,24 @@ std::vector<std::pair<std::uint64_t, fs::path>> numberedFiles(const std::string&
     return files;
 }
 
+/// A file that somebody writes is locked, and stays.
+void removeUnlessWritten(const fs::path& path)
+{
+    const int file = ::open(path.c_str(), O_RDONLY | O_NOFOLLOW | O_NONBLOCK | O_CLOEXEC);
+    if (file < 0)
+        return;
+    if (::flock(file, LOCK_EX | LOCK_NB) == 0)
+        ::unlink(path.c_str());
+    ::close(file);
+}
+
+/// Whether there is something else than a file, such as a device.
+bool isOther(const std::string& path)
+{
+    struct stat status { };
+    return ::lstat(path.c_str(), &status) == 0 && !S_ISREG(status.st_mode);
+}
+
 } // namespace
 
 RecordingFiles::RecordingFiles(RecordingFilesOptions options)
@@ -68,20 +91,34 @@ Outcome RecordingFiles::prepare()
     std::error_code error;
     _isFolder = target.ends_with('/') || fs::is_directory(target, error);
     if (_isFolder) {
-        fs::create_directories(target, error);
-        if (error)
-            return Failure {error.message()}.of(target);
+        if (auto made = makeOwnFolders(target); !made)
+            return made;
     }
     const std::string folder = _isFolder ? target : fs::path(target).parent_path().string();
     if (target != "-" && ::access(folder.empty() ? "." : folder.c_str(), W_OK) != 0)
         return Failure::ofSystem().of(target);
+    return checkTarget();
+}
+
+/// Whether the first file's name is free, or may be taken.
+Outcome RecordingFiles::checkTarget() const
+{
+    struct stat status { };
+    if (_options.target == "-" || _isFolder || ::lstat(_options.target.c_str(), &status) != 0)
+        return Done();
+    if (S_ISREG(status.st_mode) && !_options.overwrite)
+        return Failure {_options.target + ": is there already (--overwrite writes over it)", Failure::Code::Exists};
     return Done();
 }
 
-std::uint64_t RecordingFiles::latestNumber() const
+/// Behind the highest of the folder.
+Result<std::uint64_t> RecordingFiles::nextNumber() const
 {
     const auto files = numberedFiles(_options.target);
-    return files.empty() ? 0 : files.back().first;
+    const std::uint64_t latest = files.empty() ? 0 : files.back().first;
+    if (latest == std::numeric_limits<std::uint64_t>::max())
+        return Failure {files.back().second.string() + ": has the highest number that there is; no file can follow it"};
+    return latest + 1;
 }
 
 Outcome RecordingFiles::begin(Technology technology, Moment time)
@@ -129,18 +166,20 @@ Outcome RecordingFiles::beginNext(Technology technology, Moment time)
 /// Two recorders never share a file, for a number that is taken is passed over.
 Outcome RecordingFiles::createNext(Technology technology)
 {
-    if (_isFolder)
-        _number = latestNumber();
     for (;;) {
-        ++_number;
+        const auto number = _isFolder ? nextNumber() : Result<std::uint64_t>(_number + 1);
+        if (!number)
+            return number.failure();
+        _number = *number;
         _path = numberedPath(technology);
         const bool isTarget = _path == _options.target;
-        auto created = (isTarget ? createRecording : createNewRecording)(_path, technology);
+        const bool mayOverwrite = isTarget && (_path == "-" || _options.overwrite || isOther(_path));
+        auto created = (mayOverwrite ? createRecording : createNewRecording)(_path, technology);
         if (created) {
             _writer = *std::move(created);
             return Done();
         }
-        if (created.failure().code != Failure::Code::Exists) {
+        if (isTarget || created.failure().code != Failure::Code::Exists) {
             _writer.reset();
             return created.failure().of(spoken(_path));
         }
@@ -163,16 +202,15 @@ void RecordingFiles::removeOldest()
 {
     if (!_options.keep)
         return;
-    std::error_code error;
     if (_isFolder) {
         const auto files = numberedFiles(_options.target);
         for (std::size_t i = 0; i + *_options.keep < files.size(); ++i)
-            fs::remove(files[i].second, error);
+            removeUnlessWritten(files[i].second);
         return;
     }
     _written.push_back(_path);
     if (_written.size() > *_options.keep) {
-        fs::remove(_written.front(), error);
+        removeUnlessWritten(_written.front());
         _written.erase(_written.begin());
     }
 }

@@ -18,13 +18,15 @@ struct RecordingFilesOptions {
     std::optional<std::uint64_t> largestFile; // bytes
     std::optional<std::chrono::milliseconds> longestFile; // of time
     std::optional<std::uint64_t> keep; // of the numbered files, the latest
+    bool overwrite = false; // a capture file that is there
 };
 
 /// The capture files of one recorded session.
 ///
-/// A file FILE.pcap is followed by FILE-2.pcap, FILE-3.pcap and so on: the first is overwritten, the others take
-/// numbers that are free. In a folder the files are numbered on from those that are there: "spectrel-000001-lte.pcap".
-/// A file begins with the first message, when it is full or its time is over, and when the technology changes.
+/// A file FILE.pcap is followed by FILE-2.pcap, FILE-3.pcap and so on: the first is new, or overwritten where that is
+/// asked for, the others take numbers that are free. In a folder the files are numbered on from those that are there:
+/// "spectrel-000001-lte.pcap". A file begins with the first message, when it is full or its time is over, and when the
+/// technology changes. Files that are being written, here or by another recorder, are never removed.
 class RecordingFiles {
 public:
     explicit RecordingFiles(RecordingFilesOptions options);
@@ -54,7 +56,8 @@ private:
     Outcome beginNext(Technology technology, Moment time);
     Outcome createNext(Technology technology);
     std::string numberedPath(Technology technology) const;
-    std::uint64_t latestNumber() const;
+    Result<std::uint64_t> nextNumber() const;
+    Outcome checkTarget() const;
     void removeOldest();
 
     RecordingFilesOptions _options;

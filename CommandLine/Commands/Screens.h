@@ -11,7 +11,7 @@ namespace spectrel {
 enum class Screens : std::uint8_t { Graphical, Terminal, None };
 
 /// The screens that the choice and the surroundings give: a display before a terminal, None where there is neither.
-/// Absent, told on standard error, when the terminal was asked for and is not there.
+/// Absent, reported on standard error, when the terminal was asked for and is not there.
 std::optional<Screens> findScreens(ScreenChoice choice);
 
 /// Becomes the program with the graphical screens, which stands beside this one where it is installed; comes back, with

@@ -5,7 +5,6 @@
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/ViewingApplication.h"
 #include "Monitor/Viewing/ViewedFile.h"
-#include "Platform/Qt/QtClock.h"
 #include "Platform/Qt/QtRunLoop.h"
 #include "UI/Terminal/TerminalFrontEnd.h"
 
@@ -22,7 +21,7 @@ int viewGraphically(const Arguments& arguments)
 }
 
 /// The screens in the terminal over a file. Lines on standard error come out when the screens are closed.
-int viewInTerminal(const std::string& path, ViewedFile& file)
+int viewInTerminal(const std::string& path, ViewedFile& file, const Context& context)
 {
     QtRunLoop runLoop;
     TerminalFrontEnd frontEnd(runLoop);
@@ -31,29 +30,28 @@ int viewInTerminal(const std::string& path, ViewedFile& file)
         report("cannot open the terminal screens: " + started.failure().text);
         return ExitStatus::Failed;
     }
-    const int status = runViewingApplication(file, path, runLoop, frontEnd.toolkit());
+    const int status = runViewingApplication(file, path, runLoop, frontEnd.toolkit(), context);
     frontEnd.stop();
     return status;
 }
 
 } // namespace
 
-int view(const Arguments& arguments)
+int view(const Arguments& arguments, const Context& context)
 {
     const auto screens = findScreens(arguments.screens);
     if (!screens)
         return ExitStatus::Failed;
     if (screens == Screens::Graphical)
         return viewGraphically(arguments);
-    const QtClock deviceClock;
     std::string reason;
-    const auto file = ViewedFile::open(arguments.view.file, arguments.view.technology, deviceClock, reason);
+    const auto file = ViewedFile::open(arguments.view.file, arguments.view.technology, context.clock, reason);
     if (!file) {
         report(arguments.view.file + ": " + reason);
         return ExitStatus::Failed;
     }
     if (screens == Screens::Terminal)
-        return viewInTerminal(arguments.view.file, *file);
+        return viewInTerminal(arguments.view.file, *file, context);
     report(arguments.view.file + ": there is neither a terminal nor a display to show it; spectrel decode prints it");
     return ExitStatus::Failed;
 }

@@ -15,11 +15,12 @@ namespace {
 
 class Watching final : public SpectrelModelObserver {
 public:
-    explicit Watching(const WatchOptions& options)
+    Watching(const WatchOptions& options, const Context& context)
         : _options(options)
-        , _output(stdout, options.format)
+        , _live(context)
+        , _output(stdout, options.output)
         , _model(_live.services(), &LogGenerator::generatorFromTechnology, *this, LiveServices::portPrefixFor("Watch"))
-        , _journal(printsChanges(options.format) ? &_model.displayState().followChanges() : nullptr)
+        , _journal(printsChanges(options.output.format) ? &_model.displayState().followChanges() : nullptr)
     {
     }
     ~Watching() override
@@ -29,7 +30,7 @@ public:
 
     int run()
     {
-        Ending::install(_model.displayState(), {});
+        Ending::install(_model.displayState(), _live.context(), {});
         const TerminationSignals terminationSignals([this](int) { _live.runLoop().quit(); });
         _live.runLoop().async([this] { _model.restartMonitor(); });
         if (_options.duration)
@@ -44,10 +45,11 @@ public:
         _model.topLevelNodes(); // builds the display, and the history entry of this refresh
         const Value& display = _model.displayState().display();
         _output.printDisplay(display);
-        if (_options.format == OutputFormat::Tree)
+        if (_options.output.format == OutputFormat::Tree)
             _output.printLine("");
         if (_journal)
-            _output.printChanges(_refreshes, Clock::installed().now(), display, *_journal);
+            _output.printChanges(_refreshes, _live.clock().now(), display, *_journal);
+        _output.printRow(_live.clock().now(), display);
         if (!_output.flush()) {
             report("standard output: cannot be written");
             _status = 1;
@@ -75,9 +77,9 @@ private:
 
 } // namespace
 
-int watch(const WatchOptions& options)
+int watch(const WatchOptions& options, const Context& context)
 {
-    return Watching(options).run();
+    return Watching(options, context).run();
 }
 
 } // namespace spectrel

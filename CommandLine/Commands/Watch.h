@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CommandLine/Output/OutputWriter.h"
+#include "Platform/Context.h"
 
 #include <chrono>
 #include <cstdint>
@@ -10,13 +11,13 @@ namespace spectrel {
 
 /// What `spectrel watch` was asked for.
 struct WatchOptions {
-    OutputFormat format = OutputFormat::Tree;
+    OutputOptions output;
     std::optional<std::uint64_t> count; // refreshes
     std::optional<std::chrono::milliseconds> duration;
 };
 
 /// Prints a live session, once at each refresh, until interrupted or until what was asked for has been printed. Answers
 /// the program's exit status.
-int watch(const WatchOptions& options);
+int watch(const WatchOptions& options, const Context& context);
 
 } // namespace spectrel

@@ -6,7 +6,6 @@
 #include "CommandLine/Program/SingleInstance.h"
 #include "CommandLine/Program/ViewingApplication.h"
 #include "Monitor/Viewing/ViewedFile.h"
-#include "Platform/Qt/QtClock.h"
 #include "Platform/Qt/QtRunLoop.h"
 #include "Platform/Qt/TerminationSignals.h"
 #include "UI/Quick/QuickFrontEnd.h"
@@ -27,9 +26,9 @@ std::string takeActivationToken()
     return taken;
 }
 
-int runApplication(const GraphicalArguments& arguments)
+int runApplication(const GraphicalArguments& arguments, const Context& context)
 {
-    LiveServices live;
+    LiveServices live(context);
     SingleInstance instance(live.services().ports);
     QuickFrontEnd frontEnd(arguments.appearance);
     if (instance.activateOther(takeActivationToken()))
@@ -47,15 +46,14 @@ int runApplication(const GraphicalArguments& arguments)
 }
 
 /// The screens in a window over a file.
-int viewFile(const GraphicalArguments& arguments)
+int viewFile(const GraphicalArguments& arguments, const Context& context)
 {
     const std::string& path = *arguments.viewedFile;
     QtRunLoop runLoop;
-    const QtClock deviceClock;
     QuickFrontEnd frontEnd(arguments.appearance);
     frontEnd.onQuit = [&runLoop] { runLoop.quit(); };
     std::string reason;
-    const auto file = ViewedFile::open(path, arguments.technology, deviceClock, reason);
+    const auto file = ViewedFile::open(path, arguments.technology, context.clock, reason);
     if (!file) {
         report(path + ": " + reason);
         return ExitStatus::Failed;
@@ -65,18 +63,18 @@ int viewFile(const GraphicalArguments& arguments)
         return ExitStatus::Failed;
     }
     const TerminationSignals endings([&runLoop](int) { runLoop.quit(); });
-    const int status = runViewingApplication(*file, path, runLoop, frontEnd.toolkit());
+    const int status = runViewingApplication(*file, path, runLoop, frontEnd.toolkit(), context);
     frontEnd.stop();
     return status;
 }
 
 } // namespace
 
-int runGraphicalApplication(const GraphicalArguments& arguments)
+int runGraphicalApplication(const GraphicalArguments& arguments, const Context& context)
 {
     if (arguments.viewedFile)
-        return viewFile(arguments);
-    return runApplication(arguments);
+        return viewFile(arguments, context);
+    return runApplication(arguments, context);
 }
 
 } // namespace spectrel

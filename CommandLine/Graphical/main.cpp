@@ -5,8 +5,8 @@
 #include "CommandLine/Program/Logging.h"
 #include "CommandLine/Program/ProgramFolders.h"
 #include "Monitor/SpectrelModel.h"
-#include "Platform/Console.h"
-#include "Platform/Resources.h"
+#include "Platform/Context.h"
+#include "Platform/Qt/QtClock.h"
 
 #include <QGuiApplication>
 #include <QIcon>
@@ -33,9 +33,8 @@ int main(int argc, char** argv)
     if (!templates || (!arguments.viewedFile && !Surroundings::preparePorts(SpectrelModel::ApplicationPrefix)))
         return ExitStatus::Failed;
     const DirectoryResources resources(*templates);
-    Resources::install(&resources);
     StandardOutputConsole console;
-    Console::install(&console);
+    const QtClock clock;
     Logging logging;
     if (!logging.start(arguments.logFile, arguments.viewedFile ? Logging::Use::Offline : Logging::Use::Live))
         return ExitStatus::Failed;
@@ -49,6 +48,7 @@ int main(int argc, char** argv)
     QGuiApplication::setDesktopFileName(ApplicationId);
     QGuiApplication::setWindowIcon(QIcon::fromTheme(ApplicationId));
 
-    const int status = runGraphicalApplication(arguments);
+    const int status =
+        runGraphicalApplication(arguments, {clock, resources, logging.log(), console, logging.diagnostics()});
     return logging.finish() ? status : ExitStatus::Failed;
 }

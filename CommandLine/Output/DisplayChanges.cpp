@@ -106,12 +106,23 @@ void DisplayChanges::update(const Value& display, Journal& journal, const Report
     } else if (std::exchange(_isShown, false)) {
         reportGone(_root, report);
         _root = {};
+        _root.position = _paths.root();
     }
     _period = journal.beginPeriod();
 }
 
+DisplayChanges::Shadow DisplayChanges::shadowBelow(const Shadow& parent, std::string_view name) const
+{
+    Shadow shadow;
+    shadow.name = name;
+    shadow.position = _paths.below(parent.position, name);
+    return shadow;
+}
+
 void DisplayChanges::updateNode(Shadow& shadow, bool isNew, const Value& value, const Report& report)
 {
+    if (!_paths.reaches(shadow.position))
+        return;
     if (value.dictionary() || value.list())
         return updateContainer(shadow, isNew, value, report);
     if (!isNew && !shadow.isLeaf) {
@@ -119,6 +130,8 @@ void DisplayChanges::updateNode(Shadow& shadow, bool isNew, const Value& value, 
         shadow.children.clear();
         shadow.container = 0;
     }
+    if (!_paths.takesLeaf(shadow.position))
+        return;
     const std::string_view text = value.string() ? std::string_view(*value.string()) : UnknownText;
     shadow.isReported = isNew || !shadow.isLeaf || shadow.value != text;
     shadow.isLeaf = true;
@@ -168,7 +181,7 @@ void DisplayChanges::updateChildren(Shadow& shadow, const Value& value, const Re
         ShadowRef childShadow = former.take(name);
         const bool isNew = !childShadow;
         if (isNew)
-            childShadow = std::make_unique<Shadow>(Shadow {std::string(name), {}, false, false, 0, {}});
+            childShadow = std::make_unique<Shadow>(shadowBelow(shadow, name));
         _path = pathByAppending(parentPath, name);
         updateNode(*childShadow, isNew, child, report);
         shadow.children.push_back(std::move(childShadow));

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Monitor/Journal.h"
+#include "Monitor/PathChoice.h"
 #include "Values/Value.h"
 
 #include <cstdint>
@@ -8,6 +9,7 @@
 #include <memory>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 namespace spectrel {
@@ -21,9 +23,16 @@ public:
     /// A leaf's path as in the display tree, and its value; null for a leaf that went away.
     using Report = std::function<void(const std::string& path, const std::string* value)>;
 
+    explicit DisplayChanges(PathChoice paths = {})
+        : _paths(std::move(paths))
+    {
+        _root.position = _paths.root();
+    }
+
     /// Reports new and changed leaves in display order, and within each container then those that went away.
-    /// Where leaves share a path (two fingers on one pilot), each change is reported, and what the last one holds is
-    /// reported last. An absent display has no leaves. The journal follows the display.
+    /// Only the chosen leaves are looked at. Where leaves share a path (two fingers on one pilot), each change is
+    /// reported, and what the last one holds is reported last. An absent display has no leaves. The journal follows the
+    /// display.
     void update(const Value& display, Journal& journal, const Report& report);
 
     /// How many names were compared to find the shadows of containers' children so far: what the updates cost.
@@ -44,9 +53,11 @@ private:
         bool isReported = false; // in this update
         std::uint64_t container = 0; // the journal's number of the container it was made from
         ShadowList children;
+        PathChoice::Position position; // of its path in those that were asked for
     };
     class FormerChildren;
 
+    Shadow shadowBelow(const Shadow& parent, std::string_view name) const;
     void updateNode(Shadow& shadow, bool isNew, const Value& value, const Report& report);
     void updateContainer(Shadow& shadow, bool isNew, const Value& value, const Report& report);
     void updateBelow(Shadow& shadow, const Value& value, const Report& report);
@@ -54,6 +65,7 @@ private:
     void settleNamesakes(Shadow& parent, std::size_t count, const Report& report);
     void reportGone(const Shadow& shadow, const Report& report);
 
+    PathChoice _paths;
     Shadow _root;
     bool _isShown = false;
     std::string _path; // of the node being looked at

@@ -46,31 +46,43 @@ std::optional<OutputFormat> outputFormatNamed(std::string_view name)
         std::string_view name;
         OutputFormat format;
     };
-    static constexpr std::array<NamedFormat, 5> Formats {{
+    static constexpr std::array<NamedFormat, 6> Formats {{
         {"tree", OutputFormat::Tree},
         {"json", OutputFormat::Json},
         {"changes", OutputFormat::Changes},
         {"csv", OutputFormat::Csv},
+        {"table", OutputFormat::Table},
         {"none", OutputFormat::None},
     }};
     const auto* known = findRow(Formats, name, &NamedFormat::name);
     return known ? std::optional(known->format) : std::nullopt;
 }
 
-OutputWriter::OutputWriter(std::FILE* stream, OutputFormat format)
+OutputWriter::OutputWriter(std::FILE* stream, const OutputOptions& options)
     : _stream(stream)
-    , _format(format)
+    , _options(options)
+    , _format(options.format)
+    , _paths(options.paths)
+    , _changes(_paths)
 {
-    if (format == OutputFormat::Csv)
+    if (_format == OutputFormat::Csv) {
         _gathered += "n,time,path,value\r\n";
+    } else if (_format == OutputFormat::Table) {
+        _gathered += "time";
+        for (const TableColumn& column : options.columns) {
+            _gathered += ',';
+            appendCsvField(column.name, _gathered);
+        }
+        _gathered += "\r\n";
+    }
 }
 
 void OutputWriter::printDisplay(const Value& display)
 {
     if (_format == OutputFormat::Tree) {
-        appendTree(display, _gathered);
+        appendTree(display, _gathered, _paths);
     } else if (_format == OutputFormat::Json) {
-        appendJson(display, _gathered);
+        appendJson(display, _gathered, _paths);
         _gathered += '\n';
     }
     flushWhenLarge();
@@ -79,7 +91,7 @@ void OutputWriter::printDisplay(const Value& display)
 void OutputWriter::printNumberedJson(std::uint64_t n, const Value& display)
 {
     _gathered += "{\"n\": " + std::to_string(n) + ", \"display\": ";
-    appendJson(display, _gathered);
+    appendJson(display, _gathered, _paths);
     _gathered += "}\n";
     flushWhenLarge();
 }
@@ -104,6 +116,19 @@ void OutputWriter::printChanges(std::uint64_t n, Moment time, const Value& displ
             _gathered += "null";
         _gathered += "}\n";
     });
+    flushWhenLarge();
+}
+
+void OutputWriter::printRow(Moment time, const Value& display)
+{
+    if (_format != OutputFormat::Table)
+        return;
+    _gathered += timeText(time);
+    for (const TableColumn& column : _options.columns) {
+        _gathered += ',';
+        appendCsvField(leafAtPath(display, column.path).value_or(""), _gathered);
+    }
+    _gathered += "\r\n";
     flushWhenLarge();
 }
 

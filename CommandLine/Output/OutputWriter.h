@@ -1,7 +1,9 @@
 #pragma once
 
 #include "CommandLine/Output/DisplayChanges.h"
+#include "CommandLine/Output/TableColumns.h"
 #include "Monitor/Journal.h"
+#include "Monitor/PathChoice.h"
 #include "Platform/Clock.h"
 #include "Values/Value.h"
 
@@ -10,12 +12,13 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace spectrel {
 
-enum class OutputFormat : std::uint8_t { Tree, Json, Changes, Csv, None };
+enum class OutputFormat : std::uint8_t { Tree, Json, Changes, Csv, Table, None };
 
-/// "tree", "json", "changes", "csv", "none".
+/// "tree", "json", "changes", "csv", "table", "none".
 std::optional<OutputFormat> outputFormatNamed(std::string_view name);
 
 /// Whether displays are printed as their changes.
@@ -24,11 +27,18 @@ constexpr bool printsChanges(OutputFormat format)
     return format == OutputFormat::Changes || format == OutputFormat::Csv;
 }
 
+/// What is printed, and how.
+struct OutputOptions {
+    OutputFormat format = OutputFormat::Tree;
+    std::vector<std::string> paths; // globs of the leaves that Tree, Json, Changes and Csv are to show; empty: all
+    std::vector<TableColumn> columns; // of Table
+};
+
 /// Prints displays in one format to a stream, in large writes.
 class OutputWriter {
 public:
-    /// Csv begins with its header at once.
-    OutputWriter(std::FILE* stream, OutputFormat format);
+    /// Csv and Table begin with their header at once. The options outlive this.
+    OutputWriter(std::FILE* stream, const OutputOptions& options);
 
     /// The whole display: a tree, or JSON on one line. Nothing for the other formats.
     void printDisplay(const Value& display);
@@ -36,6 +46,8 @@ public:
     void printNumberedJson(std::uint64_t n, const Value& display);
     /// What has changed since the last call, in Changes or Csv form; the journal follows the display.
     void printChanges(std::uint64_t n, Moment time, const Value& display, Journal& journal);
+    /// One row of a Table; nothing for the other formats.
+    void printRow(Moment time, const Value& display);
     void printLine(std::string_view line);
     /// Writes out what has gathered. False once the stream has failed (a full disk, a closed pipe).
     bool flush();
@@ -44,7 +56,9 @@ private:
     void flushWhenLarge();
 
     std::FILE* _stream;
-    OutputFormat _format;
+    const OutputOptions& _options;
+    const OutputFormat _format;
+    PathChoice _paths;
     std::string _gathered;
     DisplayChanges _changes;
     bool _hasFailed = false;

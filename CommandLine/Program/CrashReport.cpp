@@ -4,9 +4,8 @@
 #include "Monitor/DisplayState.h"
 #include "Monitor/MessageText.h"
 #include "Monitor/Snapshot.h"
-#include "Platform/Clock.h"
+#include "Platform/Context.h"
 #include "Platform/Places.h"
-#include "Platform/SystemLog.h"
 
 #include <chrono>
 #include <cstdlib>
@@ -20,6 +19,8 @@ namespace spectrel {
 namespace {
 
 DisplayState* endingDisplay = nullptr;
+const Clock* endingClock = nullptr; // both are there once something was installed
+SystemLog* endingLog = nullptr;
 std::function<void()> giveScreenBack;
 std::string reasonOfEnding = "unknown reason";
 
@@ -51,14 +52,16 @@ std::string freeSnapshotPath(Moment now)
 void tellEverywhere(const std::string& line)
 {
     report(line);
-    SPECTREL_LOG(Priority::Error, "%s", line.c_str());
+    SPECTREL_LOG(*endingLog, Priority::Error, "%s", line.c_str());
 }
 
 } // namespace
 
-void Ending::install(DisplayState& display, std::function<void()> restoreScreen)
+void Ending::install(DisplayState& display, const Context& context, std::function<void()> restoreScreen)
 {
     endingDisplay = &display;
+    endingClock = &context.clock;
+    endingLog = &context.log;
     giveScreenBack = std::move(restoreScreen);
     std::set_terminate(&Ending::terminate);
 }
@@ -98,7 +101,7 @@ void Ending::saveWhatIsLeft()
     const ListRef contents = std::exchange(endingDisplay, nullptr)->lastContents();
     if (!contents)
         return;
-    const Moment now = Clock::installed().now();
+    const Moment now = endingClock->now();
     const std::string path = freeSnapshotPath(now);
     std::string reason;
     if (writeSnapshot(makeSnapshot(now, contents, "Spectrel " + reasonOfEnding), path, reason))

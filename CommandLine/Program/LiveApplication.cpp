@@ -34,11 +34,11 @@ void runLiveApplication(LiveServices& live, ScreenToolkit& toolkit, const std::f
     const auto makeModel = [&](SpectrelModelObserver& observer) -> std::unique_ptr<MonitorModel> {
         auto model = std::make_unique<SpectrelModel>(live.services(), &LogGenerator::generatorFromTechnology, observer,
             std::string(SpectrelModel::ApplicationPrefix));
-        Ending::install(model->displayState(), restoreScreen);
+        Ending::install(model->displayState(), live.context(), restoreScreen);
         return model;
     };
-    SpectrelApp application(
-        {live.runLoop(), live.clock(), preferences, toolkit, makeModel, writeSnapshot, Places::crashLogDirectory()});
+    SpectrelApp application({live.runLoop(), live.clock(), live.context().log, preferences, toolkit, makeModel,
+        writeSnapshot, Places::crashLogDirectory()});
     {
         const EndingGuard guard;
         application.applicationDidFinishLaunching();

@@ -6,16 +6,11 @@
 
 namespace spectrel {
 
-LiveServices::LiveServices()
-    : _ports(Places::portDirectory())
+LiveServices::LiveServices(const Context& context)
+    : _context(context)
+    , _ports(Places::portDirectory(), context.log)
     , _telephony(_ports)
 {
-    Clock::install(&_clock);
-}
-
-LiveServices::~LiveServices()
-{
-    Clock::install(nullptr);
 }
 
 std::string LiveServices::portPrefixFor(const std::string& job)

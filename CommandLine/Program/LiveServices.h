@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Monitor/Session.h"
-#include "Platform/Qt/QtClock.h"
+#include "Platform/Context.h"
 #include "Platform/Qt/QtRunLoop.h"
 #include "Platform/Sockets/SocketMessagePorts.h"
 #include "Platform/Sockets/SocketTelephonyServer.h"
@@ -10,12 +10,12 @@
 
 namespace spectrel {
 
-/// What every program with a live session stands on: the run loop, the device's clock (installed), the message ports
-/// and the telephony service.
+/// What every program with a live session stands on: the program's context, the run loop, the message ports and
+/// the telephony service.
 class LiveServices {
 public:
-    LiveServices();
-    ~LiveServices();
+    /// What the context refers to outlives this.
+    explicit LiveServices(const Context& context);
     LiveServices(const LiveServices&) = delete;
     LiveServices& operator=(const LiveServices&) = delete;
 
@@ -25,18 +25,22 @@ public:
     }
     const Clock& clock() const
     {
-        return _clock;
+        return _context.clock;
+    }
+    const Context& context() const
+    {
+        return _context;
     }
     Session::Services services()
     {
-        return {_runLoop, _ports, _telephony};
+        return {_runLoop, _ports, _telephony, _context};
     }
     /// A port prefix for a program that runs beside the application: the job's name and the process's number in it.
     static std::string portPrefixFor(const std::string& job);
 
 private:
+    Context _context;
     QtRunLoop _runLoop;
-    QtClock _clock;
     SocketMessagePorts _ports;
     SocketTelephonyServer _telephony;
 };

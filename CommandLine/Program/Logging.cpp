@@ -2,17 +2,8 @@
 
 #include "CommandLine/Program/ErrorLine.h"
 #include "Platform/Places.h"
-#include "Platform/SystemLog.h"
 
 namespace spectrel {
-
-namespace {
-
-/// The least urgent lines that go to the system log; traces, a line for each section and record, stay out of it.
-constexpr int SystemLogPriority = Priority::Error;
-constexpr int EveryPriority = 7;
-
-} // namespace
 
 bool Logging::start(const std::optional<std::string>& file, Use use)
 {
@@ -44,17 +35,21 @@ bool Logging::startLog(const std::optional<std::string>& file, Use use)
             return false;
         }
         _file = *std::move(created);
-        SystemLog::install(_file.get(), EveryPriority);
     } else if (use == Use::Live) {
         _system = std::make_unique<SyslogLog>();
-        SystemLog::install(_system.get(), SystemLogPriority);
     }
     return true;
 }
 
+SystemLog& Logging::log() const
+{
+    if (_file)
+        return *_file;
+    return _system ? static_cast<SystemLog&>(*_system) : SystemLog::none();
+}
+
 bool Logging::finish()
 {
-    SystemLog::install(nullptr, -1);
     if (!_file || _file->flush())
         return true;
     report(_path + ": the log could not be written whole");

@@ -18,6 +18,12 @@ public:
     enum class Use { Live, Offline };
 
     bool start(const std::optional<std::string>& file, Use use);
+    /// What was chosen; nobody's before `start`. They live as long as this.
+    SystemLog& log() const;
+    DiagnosticLog* diagnostics() const
+    {
+        return _diagnostics.get();
+    }
     /// False when a line could not be written.
     bool finish();
 

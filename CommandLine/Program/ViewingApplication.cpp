@@ -9,15 +9,16 @@
 
 namespace spectrel {
 
-int runViewingApplication(ViewedFile& file, const std::string& path, QtRunLoop& runLoop, ScreenToolkit& toolkit)
+int runViewingApplication(
+    ViewedFile& file, const std::string& path, QtRunLoop& runLoop, ScreenToolkit& toolkit, const Context& context)
 {
     const auto tell = [&path](const std::string& line) { report(path + ": " + line); };
     if (!file.damage().empty())
         tell(file.damage());
     NoPreferences preferences;
-    SpectrelApp application({runLoop, file.clock(), preferences, toolkit,
+    SpectrelApp application({runLoop, file.clock(), context.log, preferences, toolkit,
         [&](SpectrelModelObserver& observer) {
-            return file.makeModel(runLoop, &LogGenerator::generatorFromTechnology, observer, tell);
+            return file.makeModel(runLoop, &LogGenerator::generatorFromTechnology, observer, tell, context);
         },
         writeSnapshot, {}, false});
     application.applicationDidFinishLaunching();

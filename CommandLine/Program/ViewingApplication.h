@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Monitor/Viewing/ViewedFile.h"
+#include "Platform/Context.h"
 #include "Platform/Qt/QtRunLoop.h"
 #include "UI/ScreenToolkit.h"
 
@@ -10,7 +11,8 @@ namespace spectrel {
 
 /// The application object over a file, in a front end that has started: launch, run until the run loop ends,
 /// termination. No session is opened, nothing is saved. Lines on standard error name the file by `path`. Returns the
-/// exit status, which tells whether the file is whole.
-int runViewingApplication(ViewedFile& file, const std::string& path, QtRunLoop& runLoop, ScreenToolkit& toolkit);
+/// exit status, which says whether the file is whole.
+int runViewingApplication(
+    ViewedFile& file, const std::string& path, QtRunLoop& runLoop, ScreenToolkit& toolkit, const Context& context);
 
 } // namespace spectrel

@@ -87,6 +87,9 @@ void describeSimulation(CLI::App& program, CLI::Option& simulate, SimulateOption
     addFormedOption(program, "--duration", options.duration, DurationForm,
         "With --write: the length of the recording, such as 2h (default: 1m)")
         ->needs(write);
+    addFormedOption(program, "--truth", options.truth, FileForm,
+        "With --write: write into this file, in JSON Lines, which moves the simulated world decided and why")
+        ->needs(write);
 }
 
 void describeReplay(CLI::App& program, CLI::Option& replay, ReplayOptions& options)

@@ -18,6 +18,7 @@ struct SimulateOptions {
     std::uint32_t seed = 1;
     double rate = 1;
     std::string file; // write a recording and end
+    std::string truth; // with that: a file for what the simulated world decided; empty: none
     std::chrono::milliseconds duration = std::chrono::minutes(1);
 };
 

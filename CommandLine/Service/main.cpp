@@ -1,6 +1,7 @@
 // spectrel-telephonyd: this platform's telephony service.
 
 #include "CommandLine/Service/ServiceOptions.h"
+#include "CommandLine/Service/TruthFile.h"
 #include "Platform/Places.h"
 #include "Platform/Qt/QtClock.h"
 #include "Platform/Qt/QtRunLoop.h"
@@ -88,8 +89,23 @@ int writeRecording(const SimulateOptions& options)
     const auto baseband = makeBaseband(options);
     if (!baseband)
         return fail(baseband.failure().text);
-    const auto written = writeSimulatedRecording(**baseband, options.file, options.duration);
-    return written ? 0 : fail(written.failure().of(options.file).text);
+    std::unique_ptr<TruthFile> truth;
+    if (!options.truth.empty()) {
+        auto created = TruthFile::create(options.truth);
+        if (!created)
+            return fail(created.failure().of(options.truth).text);
+        truth = *std::move(created);
+    }
+    const auto written =
+        writeSimulatedRecording(**baseband, options.file, options.duration, [&truth](Moment time, const Move& move) {
+            if (truth)
+                truth->write(time, move);
+        });
+    if (!written)
+        return fail(written.failure().of(options.file).text);
+    if (const auto finished = truth ? truth->finish() : Done(); !finished)
+        return fail(finished.failure().of(options.truth).text);
+    return 0;
 }
 
 /// Serves the socket that the service manager has passed on, if it has.
@@ -144,18 +160,17 @@ int serve(ServiceOptions& options)
     ServiceManager manager;
     QtRunLoop runLoop;
     QtClock clock;
-    Clock::install(&clock);
     const std::string folder = Places::portDirectory();
     if (const auto prepared = SocketMessagePorts::prepareDirectory(folder, TelephonyProtocol::ServicePort); !prepared)
         return fail(prepared.failure().of("the message ports' folder cannot be had").text);
-    SocketMessagePorts ports(folder);
+    SocketMessagePorts ports(folder, SystemLog::none());
     if (const auto adopted = adoptSocket(manager, ports); !adopted)
         return fail(adopted.failure().text);
     const auto made = makeSource(options, runLoop, clock);
     if (!made)
         return fail(made.failure().text);
     LogSource& source = **made;
-    TelephonyService service(runLoop, ports, source);
+    TelephonyService service(runLoop, clock, ports, source);
     if (!service.start())
         return fail("cannot take the telephony service's port in " + folder + ": another service runs there");
     StatusReport report(clock, service, source);

@@ -49,10 +49,10 @@ constexpr std::array<Field, 4> SessionFields {{
 
 } // namespace
 
-void decodeAirLinkSummary(RecordView record, Dictionary&, const Value& lookup)
+void decodeAirLinkSummary(SystemLog& log, RecordView record, Dictionary&, const Value& lookup)
 {
     if (record.size() != Length) {
-        SPECTREL_LOG(Priority::Error, "Log code 0x1183 is %u bytes long but should be %lu bytes.",
+        SPECTREL_LOG(log, Priority::Error, "Log code 0x1183 is %u bytes long but should be %lu bytes.",
             static_cast<unsigned>(record.size()), Length);
         return;
     }

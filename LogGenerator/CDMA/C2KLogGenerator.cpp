@@ -2,7 +2,6 @@
 
 #include "LogGenerator/CDMA/Decoders.h"
 #include "LogGenerator/CDMA/Lookup.h"
-#include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyProtocol.h"
 #include "Records/Frame.h"
@@ -22,7 +21,7 @@ constexpr std::string_view SortedMark = "_sorted";
 
 struct Decoder {
     std::uint32_t code;
-    void (*decode)(RecordView record, Dictionary& state, const Value& lookup);
+    void (*decode)(SystemLog& log, RecordView record, Dictionary& state, const Value& lookup);
 };
 
 /// In the order in which the start command asks for the codes.
@@ -39,14 +38,15 @@ constexpr std::array<Decoder, 8> Decoders {{
 
 } // namespace
 
-C2KLogGenerator::C2KLogGenerator()
+C2KLogGenerator::C2KLogGenerator(const Context& context)
+    : ZPHLogGenerator(context)
 {
     init();
 }
 
-std::unique_ptr<C2KLogGenerator> C2KLogGenerator::generator()
+std::unique_ptr<C2KLogGenerator> C2KLogGenerator::generator(const Context& context)
 {
-    return std::make_unique<C2KLogGenerator>();
+    return std::make_unique<C2KLogGenerator>(context);
 }
 
 std::string_view C2KLogGenerator::className() const
@@ -77,11 +77,11 @@ void C2KLogGenerator::updateFromLog(ByteView data, const Value& usingLookup, Dic
     const ByteView bytes = recordInMessage(data);
     const RecordView record(bytes);
     if (record.u8(0) != OrdinaryRecord)
-        SPECTREL_LOG(Priority::Error, InvalidTypeLine, record.u8(0)); // not dropped all the same, on purpose
+        SPECTREL_LOG(log(), Priority::Error, InvalidTypeLine, record.u8(0)); // not dropped all the same, on purpose
     const auto decoder = std::ranges::find(Decoders, routingCode(record), &Decoder::code);
     if (decoder == Decoders.end())
         return;
-    decoder->decode(record, usingState, usingLookup);
+    decoder->decode(log(), record, usingState, usingLookup);
     keepRawMessage(bytes);
 }
 
@@ -89,7 +89,7 @@ Value C2KLogGenerator::generateLogUsingState(Dictionary& state)
 {
     Value display = getDisplayFromState(state);
     handOverRawMessages(state);
-    updateHistoryInState(state);
+    updateHistoryInState(state, context().clock);
     return display;
 }
 
@@ -98,9 +98,9 @@ Value C2KLogGenerator::getDisplayFromState(Dictionary& state)
     if (const Value& display = state[StateKey::Display]; !display.isAbsent())
         return display;
     if (state[StateKey::Template].isAbsent()) {
-        auto loaded = Resources::installed().propertyList("C2KTemplate");
+        auto loaded = context().resources.propertyList("C2KTemplate");
         if (!loaded || !loaded->dictionary()) {
-            SPECTREL_LOG(Priority::Error, "Cannot load C2K template for display");
+            SPECTREL_LOG(log(), Priority::Error, "Cannot load C2K template for display");
             return {};
         }
         state.set(StateKey::Template, std::move(*loaded));
@@ -114,8 +114,8 @@ Value C2KLogGenerator::getDisplayFromState(Dictionary& state)
     return display;
 }
 
-void C2KLogGenerator::processTemplate(
-    const Dictionary& templateDictionary, const DictionaryRef& storeDisplayIntoDict, Dictionary& storeLookupIntoDict)
+void C2KLogGenerator::processTemplate(const Dictionary& templateDictionary, const DictionaryRef& storeDisplayIntoDict,
+    Dictionary& storeLookupIntoDict) const
 {
     for (const auto& [key, value] : templateDictionary.entries()) {
         if (const auto& dictionary = value.dictionary()) {
@@ -129,7 +129,7 @@ void C2KLogGenerator::processTemplate(
                 addLookupPosition(storeLookupIntoDict, *variable, key, storeDisplayIntoDict);
         }
     }
-    SPECTREL_LOG(Priority::Warning, "Processing the template");
+    SPECTREL_LOG(log(), Priority::Warning, "Processing the template");
 }
 
 } // namespace spectrel

@@ -12,9 +12,9 @@ namespace spectrel {
 /// each variable's positions, into which the decoders put their texts.
 class C2KLogGenerator final : public ZPHLogGenerator {
 public:
-    C2KLogGenerator();
+    explicit C2KLogGenerator(const Context& context);
 
-    static std::unique_ptr<C2KLogGenerator> generator();
+    static std::unique_ptr<C2KLogGenerator> generator(const Context& context);
     std::string_view className() const override;
 
     DictionaryRef getStartCommand() override;
@@ -26,11 +26,11 @@ public:
     void updateFromLog(ByteView data, const Value& usingLookup, Dictionary& usingState);
 
     /// The state's display, built at need; absent when there is no template.
-    static Value getDisplayFromState(Dictionary& state);
+    Value getDisplayFromState(Dictionary& state);
     /// Fills the display in the template's shape with an empty text for each variable, and the lookup with its
     /// positions. "_sorted" is copied, what is neither text nor dictionary is left out.
-    static void processTemplate(const Dictionary& templateDictionary, const DictionaryRef& storeDisplayIntoDict,
-        Dictionary& storeLookupIntoDict);
+    void processTemplate(const Dictionary& templateDictionary, const DictionaryRef& storeDisplayIntoDict,
+        Dictionary& storeLookupIntoDict) const;
 };
 
 } // namespace spectrel

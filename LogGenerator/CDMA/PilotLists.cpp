@@ -55,18 +55,18 @@ Value PilotList::pilotsOrNone() const
     return _pilots->count() > 1 ? Value(_pilots) : Value("(none)");
 }
 
-void decodeActiveSetPilots(RecordView record, Dictionary&, const Value& lookup)
+void decodeActiveSetPilots(SystemLog& log, RecordView record, Dictionary&, const Value& lookup)
 {
     using namespace ActiveSet;
     const auto length = static_cast<unsigned>(record.size());
     if (length < HeadLength) {
-        SPECTREL_LOG(
-            Priority::Error, "Log code 0x12b6 is %u bytes long but must be at least %lu bytes.", length, HeadLength);
+        SPECTREL_LOG(log, Priority::Error, "Log code 0x12b6 is %u bytes long but must be at least %lu bytes.", length,
+            HeadLength);
         return;
     }
     const std::size_t count = record.u8(Count);
     if (length < HeadLength + BlockLength * count) {
-        SPECTREL_LOG(Priority::Error, "Log code 0x12b6 is %u bytes long, but has %d substructs.", length,
+        SPECTREL_LOG(log, Priority::Error, "Log code 0x12b6 is %u bytes long, but has %d substructs.", length,
             static_cast<int>(count));
         return;
     }
@@ -78,19 +78,20 @@ void decodeActiveSetPilots(RecordView record, Dictionary&, const Value& lookup)
     setLookupValue("kActiveSetPilots", list.pilotsOrNone(), lookup);
 }
 
-void decodeFingers(RecordView record, Dictionary&, const Value& lookup)
+void decodeFingers(SystemLog& log, RecordView record, Dictionary&, const Value& lookup)
 {
     using namespace Fingers;
     const auto length = static_cast<unsigned>(record.size());
     if (length < HeadLength) {
-        SPECTREL_LOG(
-            Priority::Error, "Log code 0x108a is %u bytes long but must be at least %lu bytes.", length, HeadLength);
+        SPECTREL_LOG(log, Priority::Error, "Log code 0x108a is %u bytes long but must be at least %lu bytes.", length,
+            HeadLength);
         return;
     }
     const std::size_t count = record.u8(Count);
     if (length != HeadLength + BlockLength * count) {
-        SPECTREL_LOG(Priority::Error, "Log code 0x108a has bad length of %u bytes, but has %d substructs (size=%lu).",
-            length, static_cast<int>(count), HeadLength);
+        SPECTREL_LOG(log, Priority::Error,
+            "Log code 0x108a has bad length of %u bytes, but has %d substructs (size=%lu).", length,
+            static_cast<int>(count), HeadLength);
         return;
     }
     PilotList list;

@@ -104,19 +104,19 @@ Value activeSetPilots(RecordView record, std::size_t start)
 
 } // namespace
 
-void decodeSearcher(RecordView record, Dictionary& state, const Value& lookup)
+void decodeSearcher(SystemLog& log, RecordView record, Dictionary& state, const Value& lookup)
 {
     if (record.size() < SubpacketsStart) {
-        SPECTREL_LOG(Priority::Error, "Log code 0x119c is %u bytes long but must be at least %lu bytes.",
+        SPECTREL_LOG(log, Priority::Error, "Log code 0x119c is %u bytes long but must be at least %lu bytes.",
             static_cast<unsigned>(record.size()), static_cast<unsigned long>(SubpacketsStart));
         return;
     }
-    const auto searcher = findSubpacket(record, Subpacket::SearcherState);
-    const auto rf = findSubpacket(record, Subpacket::RF);
-    const auto activeSet = findSubpacket(record, Subpacket::ActiveSetInfo);
-    const auto fingers = findSubpacket(record, Subpacket::FingerInfo);
+    const auto searcher = findSubpacket(log, record, Subpacket::SearcherState);
+    const auto rf = findSubpacket(log, record, Subpacket::RF);
+    const auto activeSet = findSubpacket(log, record, Subpacket::ActiveSetInfo);
+    const auto fingers = findSubpacket(log, record, Subpacket::FingerInfo);
     if (!searcher || !rf || !activeSet || !fingers) {
-        SPECTREL_LOG(Priority::Warning, "Log code 0x119c: missing subpacket (ss=%d,rf=%d,ai=%d,fi=%d).",
+        SPECTREL_LOG(log, Priority::Warning, "Log code 0x119c: missing subpacket (ss=%d,rf=%d,ai=%d,fi=%d).",
             searcher.has_value(), rf.has_value(), activeSet.has_value(), fingers.has_value());
         return;
     }

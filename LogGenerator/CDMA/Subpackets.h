@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Platform/SystemLog.h"
 #include "Records/RecordView.h"
 
 #include <cstddef>
@@ -14,6 +15,6 @@ constexpr std::size_t SubpacketsStart = 17;
 /// Where the first subpacket with the id starts; its first bytes are the id, one byte not interpreted, and the 16-bit
 /// size, these four included. None when there is none or a size before it (its own included) leads too far, which is
 /// logged.
-std::optional<std::size_t> findSubpacket(RecordView record, std::uint8_t id);
+std::optional<std::size_t> findSubpacket(SystemLog& log, RecordView record, std::uint8_t id);
 
 } // namespace spectrel

@@ -32,16 +32,16 @@ constexpr std::array<Field, 3> StationFields {{
 
 } // namespace
 
-void decodeSystemInformation(RecordView record, Dictionary&, const Value& lookup)
+void decodeSystemInformation(SystemLog& log, RecordView record, Dictionary&, const Value& lookup)
 {
     if (record.size() < MinimumLength) {
-        SPECTREL_LOG(Priority::Error, "Log code 0x134f is %d bytes long but must be at least %lu bytes.",
+        SPECTREL_LOG(log, Priority::Error, "Log code 0x134f is %d bytes long but must be at least %lu bytes.",
             static_cast<int>(record.size()), MinimumLength);
         return;
     }
     if (record.u8(Version) < OldestVersion) {
-        SPECTREL_LOG(Priority::Error, "Log code 0x134f has version=%d; only version 2 or higher expected; dropping.",
-            record.u8(Version));
+        SPECTREL_LOG(log, Priority::Error,
+            "Log code 0x134f has version=%d; only version 2 or higher expected; dropping.", record.u8(Version));
         return;
     }
     publishFields(record, RoamingFields, lookup);

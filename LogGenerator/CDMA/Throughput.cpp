@@ -118,20 +118,20 @@ void takeCount(DataCount now, const Direction& direction, Dictionary& state, con
 
 } // namespace
 
-void decodeForwardLinkData(RecordView record, Dictionary& state, const Value& lookup)
+void decodeForwardLinkData(SystemLog& log, RecordView record, Dictionary& state, const Value& lookup)
 {
     if (record.size() < ForwardLength) {
-        SPECTREL_LOG(Priority::Error, "Log code 0x1192 is %d bytes long but must be at least %ld bytes.",
+        SPECTREL_LOG(log, Priority::Error, "Log code 0x1192 is %d bytes long but must be at least %ld bytes.",
             static_cast<int>(record.size()), static_cast<long>(ForwardLength));
         return;
     }
     takeCount({static_cast<std::int32_t>(record.u32(13)), forwardBits(record)}, ForwardLink, state, lookup);
 }
 
-void decodeReverseLinkData(RecordView record, Dictionary& state, const Value& lookup)
+void decodeReverseLinkData(SystemLog& log, RecordView record, Dictionary& state, const Value& lookup)
 {
     if (record.size() < ReverseLength) {
-        SPECTREL_LOG(Priority::Error, "Log code 0x127e is %d bytes long but must be at least %ld bytes.",
+        SPECTREL_LOG(log, Priority::Error, "Log code 0x127e is %d bytes long but must be at least %ld bytes.",
             static_cast<int>(record.size()), static_cast<long>(ReverseLength));
         return;
     }

@@ -22,23 +22,24 @@ constexpr std::array<std::string_view, 9> TypeNames {
     "nothing", "string", "dictionary", "array", "integer", "real", "boolean", "date", "data"};
 
 /// The display copy of a value inside a container.
-Value collapsed(const Value& object)
+Value collapsed(const Value& object, SystemLog& log)
 {
-    Value processed = GSMLogGenerator::processObject(object);
+    Value processed = GSMLogGenerator::processObject(object, log);
     Value only = GSMLogGenerator::canCollapse(processed);
     return only.isAbsent() ? processed : only;
 }
 
 } // namespace
 
-GSMLogGenerator::GSMLogGenerator()
+GSMLogGenerator::GSMLogGenerator(const Context& context)
+    : LogGenerator(context)
 {
     init();
 }
 
-std::unique_ptr<GSMLogGenerator> GSMLogGenerator::generator()
+std::unique_ptr<GSMLogGenerator> GSMLogGenerator::generator(const Context& context)
 {
-    return std::make_unique<GSMLogGenerator>();
+    return std::make_unique<GSMLogGenerator>(context);
 }
 
 std::string_view GSMLogGenerator::className() const
@@ -50,15 +51,15 @@ void GSMLogGenerator::updateState(Dictionary& state, ByteView data)
 {
     const auto object = parsePropertyList(data);
     if (!object)
-        reportAssertionFailure(SourceName, UndecodableLine, "Could not deserialize the object");
+        reportAssertionFailure(log(), SourceName, UndecodableLine, "Could not deserialize the object");
     state.set(StateKey::DisplayState, object.value_or(Value()));
-    state.set(StateKey::Display, object ? processObject(*object) : Value());
+    state.set(StateKey::Display, object ? processObject(*object, log()) : Value());
     state.set(StateKey::ExtraInfo, Dictionary::make());
 }
 
 Value GSMLogGenerator::generateLogUsingState(Dictionary& state)
 {
-    updateHistoryInState(state);
+    updateHistoryInState(state, context().clock);
     return state[StateKey::Display];
 }
 
@@ -79,7 +80,7 @@ Value GSMLogGenerator::canCollapse(const Value& object)
     return dictionary && dictionary->count() == 1 ? dictionary->entries().front().value : Value();
 }
 
-Value GSMLogGenerator::processObject(const Value& object)
+Value GSMLogGenerator::processObject(const Value& object, SystemLog& log)
 {
     if (object.string())
         return object;
@@ -87,17 +88,17 @@ Value GSMLogGenerator::processObject(const Value& object)
         auto copy = std::make_shared<Dictionary>();
         copy->reserve(dictionary->count());
         for (const auto& [key, value] : dictionary->entries())
-            copy->set(key, collapsed(value));
+            copy->set(key, collapsed(value, log));
         return copy;
     }
     if (const auto& list = object.list()) {
         auto copy = std::make_shared<List>();
         for (std::size_t index = 1; index < list->count(); ++index) // without the first element, on purpose
-            copy->append(collapsed((*list)[index]));
+            copy->append(collapsed((*list)[index], log));
         return copy;
     }
     const std::string typeName(TypeNames[static_cast<std::size_t>(object.kind())]);
-    reportAssertionFailure(SourceName, UnknownObjectLine, "Unknown object of type " + typeName + " encountered");
+    reportAssertionFailure(log, SourceName, UnknownObjectLine, "Unknown object of type " + typeName + " encountered");
     return {};
 }
 

@@ -10,9 +10,9 @@ namespace spectrel {
 /// display. No template, no log codes, no DLF.
 class GSMLogGenerator final : public LogGenerator {
 public:
-    GSMLogGenerator();
+    explicit GSMLogGenerator(const Context& context);
 
-    static std::unique_ptr<GSMLogGenerator> generator();
+    static std::unique_ptr<GSMLogGenerator> generator(const Context& context);
     std::string_view className() const override;
 
     /// A message that does not parse is an assertion failure and leaves no display.
@@ -26,7 +26,7 @@ public:
     /// The display copy: values that are dictionaries of one entry, once they are copied themselves, give way to that
     /// entry's value, and every list loses its first element. Absent, after an assertion failure, for what is neither
     /// text nor container; such a value is left out of its container.
-    static Value processObject(const Value& object);
+    static Value processObject(const Value& object, SystemLog& log);
 };
 
 } // namespace spectrel

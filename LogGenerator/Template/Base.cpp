@@ -68,13 +68,13 @@ void Base::updateSectionRef(Value node)
 {
     sectionRef = std::move(node);
     const std::string_view name = getSectionName();
-    SPECTREL_LOG(Priority::Warning, "%.*s", static_cast<int>(name.size()), name.data());
+    SPECTREL_LOG(log(), Priority::Warning, "%.*s", static_cast<int>(name.size()), name.data());
 }
 
 void Base::updateLogCodeDict(CodeDictionary& codeDict)
 {
     const auto codes = getLogCodeArray();
-    SPECTREL_LOG(Priority::Warning, "Array Count: %d", static_cast<int>(codes.size()));
+    SPECTREL_LOG(log(), Priority::Warning, "Array Count: %d", static_cast<int>(codes.size()));
     for (const std::uint32_t code : codes)
         codeDict.subscribe(code, *this);
 }
@@ -131,7 +131,7 @@ void Base::storeCellFields(const Dictionary& cell, std::span<const CellField> fi
 {
     Dictionary lost; // takes the values of a section that has no dictionary
     const auto& section = sectionRef.dictionary();
-    storeCell(cell, fields, section ? *section : lost);
+    storeCell(log(), cell, fields, section ? *section : lost);
 }
 
 void Base::clearList()
@@ -146,9 +146,9 @@ void Base::replaceList(const List& elements)
         replaceArray(*list, elements);
 }
 
-void Base::logUnknownMessage(std::uint32_t logCode)
+void Base::logUnknownMessage(std::uint32_t logCode) const
 {
-    SPECTREL_LOG(Priority::Error, "Received an unknown log message: %d", static_cast<int>(logCode));
+    SPECTREL_LOG(log(), Priority::Error, "Received an unknown log message: %d", static_cast<int>(logCode));
 }
 
 } // namespace spectrel

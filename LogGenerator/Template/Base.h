@@ -3,6 +3,7 @@
 #include "LogGenerator/Template/CellFields.h"
 #include "LogGenerator/Template/CodeDictionary.h"
 #include "LogGenerator/Template/Fields.h"
+#include "Platform/Context.h"
 #include "Records/Frame.h"
 #include "Records/RecordView.h"
 #include "Values/List.h"
@@ -51,7 +52,20 @@ public:
     static std::int16_t lookUpECNO(std::uint32_t ratio);
 
 protected:
-    Base() = default;
+    /// The context outlives the section.
+    explicit Base(const Context& context)
+        : _context(context)
+    {
+    }
+    SystemLog& log() const
+    {
+        return _context.log;
+    }
+    /// Null when nobody listens.
+    DiagnosticLog* diagnosticLog() const
+    {
+        return _context.diagnosticLog;
+    }
     void enterInto(ClassDictionary& dict, CodeDictionary& codeDict);
 
     /// The node that the section shows its values in; absent until the display is built.
@@ -73,9 +87,10 @@ protected:
     void replaceList(const List& elements);
 
     /// "Received an unknown log message: %d", priority 3.
-    static void logUnknownMessage(std::uint32_t logCode);
+    void logUnknownMessage(std::uint32_t logCode) const;
 
 private:
+    const Context& _context;
     Value sectionRef; // a dictionary or a list of the current display; absent until the display is built
 };
 

@@ -4,7 +4,7 @@
 
 namespace spectrel {
 
-void storeCell(const Dictionary& cell, std::span<const CellField> fields, Dictionary& into)
+void storeCell(SystemLog& log, const Dictionary& cell, std::span<const CellField> fields, Dictionary& into)
 {
     TextBuffer buffer;
     for (const CellField& field : fields) {
@@ -12,7 +12,7 @@ void storeCell(const Dictionary& cell, std::span<const CellField> fields, Dictio
         if (const auto number = cell[field.cellKey].int32())
             into.setText(field.key, field.format(static_cast<std::uint32_t>(*number), buffer));
         else if (field.missing)
-            SPECTREL_LOG(Priority::Error, "%s", field.missing);
+            SPECTREL_LOG(log, Priority::Error, "%s", field.missing);
     }
 }
 

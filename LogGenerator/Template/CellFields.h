@@ -1,6 +1,7 @@
 #pragma once
 
 #include "LogGenerator/Template/Fields.h"
+#include "Platform/SystemLog.h"
 
 #include <array>
 #include <cstdint>
@@ -23,7 +24,7 @@ struct CellField {
 };
 
 /// Writes a cell's fields in table order; a field that cannot be read is left out.
-void storeCell(const Dictionary& cell, std::span<const CellField> fields, Dictionary& into);
+void storeCell(SystemLog& log, const Dictionary& cell, std::span<const CellField> fields, Dictionary& into);
 
 /// Which cells of the cell-information record a section shows.
 enum class CellChoice : std::uint8_t {

@@ -1,13 +1,15 @@
 #include "LogGenerator/Template/ClassIndex.h"
 
-#include "Platform/Console.h"
-#include "Platform/SystemLog.h"
-
 namespace spectrel {
+
+ClassIndex::ClassIndex(const Context& given)
+    : SectionRegistry(given)
+{
+}
 
 ClassIndex::~ClassIndex()
 {
-    consoleLine("Deallocing ClassIndex");
+    context.console.line("Deallocing ClassIndex");
 }
 
 Base* ClassIndex::getClass(std::string_view name) const
@@ -23,8 +25,8 @@ std::vector<std::string> ClassIndex::getAllLogCodes() const
 
 void ClassIndex::status() const
 {
-    SPECTREL_LOG(Priority::Warning, "Dictionary = %d", 1);
-    SPECTREL_LOG(Priority::Warning, "String = %d", 0);
+    SPECTREL_LOG(context.log, Priority::Warning, "Dictionary = %d", 1);
+    SPECTREL_LOG(context.log, Priority::Warning, "String = %d", 0);
 }
 
 } // namespace spectrel

@@ -15,7 +15,7 @@ namespace spectrel {
 /// `SimInfo objSimInfo {*this};`
 class ClassIndex : protected SectionRegistry {
 public:
-    ClassIndex() = default;
+    explicit ClassIndex(const Context& given = {});
     ClassIndex(const ClassIndex&) = delete;
     ClassIndex& operator=(const ClassIndex&) = delete;
     /// Writes "Deallocing ClassIndex" to the console.
@@ -30,7 +30,7 @@ public:
     }
     /// The registered codes as decimal texts, in the order of their first registration.
     std::vector<std::string> getAllLogCodes() const;
-    /// A self-check that logs two lines and always tells 1 and 0.
+    /// A self-check that logs two lines and always answers 1 and 0.
     void status() const;
 };
 

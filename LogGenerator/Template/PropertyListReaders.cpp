@@ -65,11 +65,11 @@ const Value& PropertyListPayloads::of(RecordView record)
     return latest.parsed;
 }
 
-LogCode_0xFF0000::LogCode_0xFF0000(RecordView record, PropertyListPayloads& payloads)
+LogCode_0xFF0000::LogCode_0xFF0000(RecordView record, PropertyListPayloads& payloads, SystemLog& log)
     : _files(payloads.of(record))
 {
     if (_files.isAbsent()) {
-        SPECTREL_LOG(Priority::Error, "SIM File dictionary data could not be constructed");
+        SPECTREL_LOG(log, Priority::Error, "SIM File dictionary data could not be constructed");
         throw UnknownDataException();
     }
 }
@@ -85,11 +85,11 @@ ContextArrayReader::ContextArrayReader(RecordView record, PropertyListPayloads& 
 {
 }
 
-CellInfoArrayReader::CellInfoArrayReader(RecordView record, PropertyListPayloads& payloads)
+CellInfoArrayReader::CellInfoArrayReader(RecordView record, PropertyListPayloads& payloads, SystemLog& log)
     : _cells(payloads.of(record))
 {
     if (_cells.isAbsent())
-        SPECTREL_LOG(Priority::Error, "Cell Info Array data could not be constructed");
+        SPECTREL_LOG(log, Priority::Error, "Cell Info Array data could not be constructed");
 }
 
 std::vector<DictionaryRef> CellInfoArrayReader::servingCells(std::span<const std::string_view> technologies) const

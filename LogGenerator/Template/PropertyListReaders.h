@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Platform/SystemLog.h"
 #include "Records/RecordView.h"
 #include "Values/Bytes.h"
 #include "Values/List.h"
@@ -42,7 +43,7 @@ public:
     /// Raised when the payload does not parse. Nothing catches it: the process ends.
     class UnknownDataException : public std::exception { };
 
-    LogCode_0xFF0000(RecordView record, PropertyListPayloads& payloads);
+    LogCode_0xFF0000(RecordView record, PropertyListPayloads& payloads, SystemLog& log);
     /// The value under a key; absent when there is none.
     const Value& operator[](std::string_view key) const;
 
@@ -72,7 +73,7 @@ public:
     static constexpr std::uint32_t Code = 0xFF0001;
 
     /// Logs "Cell Info Array data could not be constructed" when the payload does not parse.
-    CellInfoArrayReader(RecordView record, PropertyListPayloads& payloads);
+    CellInfoArrayReader(RecordView record, PropertyListPayloads& payloads, SystemLog& log);
     /// False when the payload did not parse.
     bool holdsAnything() const
     {

@@ -5,7 +5,8 @@
 namespace spectrel {
 
 RecordSection::RecordSection(const SectionDescription& description, SectionRegistry& registry)
-    : _description(description)
+    : Base(registry.context)
+    , _description(description)
     , _registry(registry)
 {
     enterInto(registry.classDict, registry.codeDictionary);
@@ -22,7 +23,7 @@ std::vector<std::uint32_t> RecordSection::getLogCodeArray() const
 void RecordSection::updateWithData(RecordView record, std::uint32_t logCode)
 {
     const std::string_view trace = _description.trace.empty() ? _description.name : _description.trace;
-    SPECTREL_LOG(_description.tracePriority, "%.*s", static_cast<int>(trace.size()), trace.data());
+    SPECTREL_LOG(log(), _description.tracePriority, "%.*s", static_cast<int>(trace.size()), trace.data());
     if (const RecordLayout* const layout = layoutOf(logCode)) {
         if (record.size() >= layout->minimumLength)
             decode(record, *layout);
@@ -54,12 +55,12 @@ void RecordSection::decode(RecordView record, const RecordLayout& layout)
 
 void RecordSection::showCells(RecordView record, const CellTable& cells)
 {
-    const CellInfoArrayReader reader(record, payloads());
+    const CellInfoArrayReader reader(record, payloads(), log());
     if (cells.choice == CellChoice::Neighbors)
         clearList(); // also when there is nothing to fill it with
     if (!reader.holdsAnything()) {
         if (cells.choice != CellChoice::EveryServing)
-            SPECTREL_LOG(Priority::Error, "Failed to get Cell Array\n");
+            SPECTREL_LOG(log(), Priority::Error, "Failed to get Cell Array\n");
         return;
     }
     if (cells.choice == CellChoice::Neighbors)
@@ -77,7 +78,7 @@ void RecordSection::listNeighborCells(const CellInfoArrayReader& reader, const C
     for (const DictionaryRef& cell : reader.neighborCells(cells.technologies)) {
         auto entry = std::make_shared<Dictionary>();
         entry->reserve(cells.fields.size());
-        storeCell(*cell, cells.fields, *entry);
+        storeCell(log(), *cell, cells.fields, *entry);
         entries.append(entry);
     }
     replaceList(entries);

@@ -9,7 +9,7 @@
 
 namespace spectrel {
 
-/// A record's repeated group: `count` entries, as the record itself tells, of `entrySize` bytes each, the first at
+/// A record's repeated group: `count` entries, as the record itself says, of `entrySize` bytes each, the first at
 /// `start`. Nothing compares the count with the record's length: entries past its end read as zeros.
 struct RepeatedGroup {
     std::size_t start;

@@ -1,7 +1,6 @@
 #include "LogGenerator/Template/ZPHLogGenerator.h"
 
 #include "LogGenerator/Template/DLFVersionReport.h"
-#include "Platform/Clock.h"
 #include "Platform/ProgramInformation.h"
 #include "Platform/SystemLog.h"
 
@@ -17,9 +16,8 @@ namespace {
 constexpr const char* ExecutableName = "EXECUTABLE_NAME";
 constexpr const char* BuildDate = "Dec  9 2019 21:26:56";
 
-DLFResult writeVersionReport(Bytes& dlf)
+DLFResult writeVersionReport(Bytes& dlf, const Clock& clock)
 {
-    const Clock& clock = Clock::installed();
     const Moment now = clock.now();
     std::uint32_t bytesWritten = 0;
     return DLFAddVersionReport(dlf, bytesWritten, 1, 1, "Spectrel " + programVersion().value_or("(none)"),
@@ -57,11 +55,12 @@ void ZPHLogGenerator::handOverRawMessages(Dictionary& state)
     state.set(StateKey::DisplayState, DataRef(std::exchange(_binData, std::make_shared<Bytes>())));
 }
 
-DataRef ZPHLogGenerator::generateDlfFromState(const Dictionary& state)
+DataRef ZPHLogGenerator::generateDlfFromState(const Dictionary& state) const
 {
     auto dlf = std::make_shared<Bytes>(DLFVersionReportSize);
-    if (const auto result = writeVersionReport(*dlf); result != DLFResult::Written) {
-        SPECTREL_LOG(Priority::SnapshotWriter, "Could not write DLF header (result=%d)", static_cast<int>(result));
+    if (const auto result = writeVersionReport(*dlf, context().clock); result != DLFResult::Written) {
+        SPECTREL_LOG(
+            log(), Priority::SnapshotWriter, "Could not write DLF header (result=%d)", static_cast<int>(result));
         return nullptr;
     }
     const auto& history = state[StateKey::History].list();
@@ -72,8 +71,8 @@ DataRef ZPHLogGenerator::generateDlfFromState(const Dictionary& state)
         if (raw.isAbsent())
             continue;
         if (!raw.data()) {
-            SPECTREL_LOG(
-                Priority::SnapshotWriter, "Got wrong class writing history to DLF; aborting writing the DLF file");
+            SPECTREL_LOG(log(), Priority::SnapshotWriter,
+                "Got wrong class writing history to DLF; aborting writing the DLF file");
             return nullptr;
         }
         // Only the buffer's very first type byte goes; those of further records stay in the file.

@@ -18,9 +18,10 @@ public:
 
     /// The version-report record, then every history entry's raw messages without their very first byte. Null when the
     /// history holds raw material of another kind.
-    static DataRef generateDlfFromState(const Dictionary& state);
+    DataRef generateDlfFromState(const Dictionary& state) const;
 
 protected:
+    using LogGenerator::LogGenerator;
     void init();
     /// Stores the raw messages under "DisplayState" and starts anew.
     void handOverRawMessages(Dictionary& state);

@@ -1,7 +1,6 @@
 #include "LogGenerator/Template/ZPHLogGenerator2.h"
 
 #include "LogGenerator/Template/Base.h"
-#include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TelephonyProtocol.h"
 #include "Records/Frame.h"
@@ -14,17 +13,18 @@ namespace spectrel {
 
 void ZPHLogGenerator2::initWithPListName(std::string newPListName, std::shared_ptr<ClassIndex> cIndexObj)
 {
-    SPECTREL_LOG(Priority::Error, "Creating ZPHLogGenerator2 object with %p", static_cast<void*>(cIndexObj.get()));
+    SPECTREL_LOG(
+        log(), Priority::Error, "Creating ZPHLogGenerator2 object with %p", static_cast<void*>(cIndexObj.get()));
     ZPHLogGenerator::init();
     pListName = std::move(newPListName);
     cIndex = std::move(cIndexObj);
-    SPECTREL_LOG(Priority::Error, "Class Index: %ld", cIndex.use_count());
+    SPECTREL_LOG(log(), Priority::Error, "Class Index: %ld", cIndex.use_count());
 }
 
 ZPHLogGenerator2::~ZPHLogGenerator2()
 {
     // The same text whatever the class, on purpose.
-    SPECTREL_LOG(Priority::Warning, "ZPH_GSMLogGenerator is destructed %p", static_cast<void*>(this));
+    SPECTREL_LOG(log(), Priority::Warning, "ZPH_GSMLogGenerator is destructed %p", static_cast<void*>(this));
 }
 
 void ZPHLogGenerator2::updateState(Dictionary& state, ByteView data)
@@ -41,7 +41,7 @@ void ZPHLogGenerator2::updateWithData(ByteView data)
     const RecordView record(recordInMessage(data));
     const std::uint8_t type = record.u8(0);
     if (!isRecordType(type)) {
-        SPECTREL_LOG(Priority::Error, InvalidTypeLine, type);
+        SPECTREL_LOG(log(), Priority::Error, InvalidTypeLine, type);
         return;
     }
     const std::uint32_t code = routingCode(record);
@@ -57,14 +57,14 @@ Value ZPHLogGenerator2::getDisplayFromState(Dictionary& state)
     if (const Value& display = state[StateKey::Display]; !display.isAbsent())
         return display;
     if (state[StateKey::Template].isAbsent()) {
-        auto loaded = Resources::installed().propertyList(pListName);
+        auto loaded = context().resources.propertyList(pListName);
         if (!loaded || !loaded->dictionary()) {
-            SPECTREL_LOG(Priority::Error, "Cannot load template for display");
+            SPECTREL_LOG(log(), Priority::Error, "Cannot load template for display");
             return {};
         }
         state.set(StateKey::Template, std::move(*loaded));
     }
-    SPECTREL_LOG(Priority::Warning, "Initialized class index: %p, Self: %p", static_cast<void*>(cIndex.get()),
+    SPECTREL_LOG(log(), Priority::Warning, "Initialized class index: %p, Self: %p", static_cast<void*>(cIndex.get()),
         static_cast<void*>(this));
     if (cIndex)
         cIndex->status();
@@ -79,7 +79,7 @@ Value ZPHLogGenerator2::generateLogUsingState(Dictionary& state)
 {
     Value display = getDisplayFromState(state);
     handOverRawMessages(state);
-    updateHistoryInState(state);
+    updateHistoryInState(state, context().clock);
     return display;
 }
 
@@ -103,12 +103,12 @@ Value ZPHLogGenerator2::processTemplate(const Value& object)
             copy->append(processTemplate(element));
         return copy;
     }
-    SPECTREL_LOG(Priority::Error, "Received an object of unknown type");
-    SPECTREL_LOG(Priority::Warning, "Processing the template");
+    SPECTREL_LOG(log(), Priority::Error, "Received an object of unknown type");
+    SPECTREL_LOG(log(), Priority::Warning, "Processing the template");
     return {};
 }
 
-void ZPHLogGenerator2::printDict(const Value& object)
+void ZPHLogGenerator2::printDict(const Value& object) const
 {
     if (object.string())
         return;
@@ -119,7 +119,7 @@ void ZPHLogGenerator2::printDict(const Value& object)
         for (const Value& element : list->elements())
             printDict(element);
     } else {
-        SPECTREL_LOG(Priority::Error, "Received an object of unknown type");
+        SPECTREL_LOG(log(), Priority::Error, "Received an object of unknown type");
     }
 }
 

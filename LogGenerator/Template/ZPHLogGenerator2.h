@@ -31,12 +31,12 @@ public:
     /// templates do not have.
     Value processTemplate(const Value& object);
     /// Walks a display object and logs every value that is no string, dictionary or list.
-    static void printDict(const Value& object);
+    void printDict(const Value& object) const;
 
 protected:
     /// A generator stays uninitialised until `initWithPListName` runs; it then knows no codes and builds no display,
     /// but answers every operation.
-    ZPHLogGenerator2() = default;
+    using ZPHLogGenerator::ZPHLogGenerator;
     void initWithPListName(std::string newPListName, std::shared_ptr<ClassIndex> cIndexObj);
 
 private:

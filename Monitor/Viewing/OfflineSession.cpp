@@ -12,9 +12,10 @@ namespace {
 constexpr std::size_t RawLot = 1024 * 1024;
 } // namespace
 
-OfflineSession::OfflineSession(GeneratorFactory makeGenerator, bool keepsHistory)
+OfflineSession::OfflineSession(GeneratorFactory makeGenerator, bool keepsHistory, const Context& context)
     : _keepsHistory(keepsHistory)
-    , _display(std::move(makeGenerator))
+    , _display(
+          std::move(makeGenerator), {_clock, context.resources, context.log, context.console, context.diagnosticLog})
 {
 }
 
@@ -26,8 +27,12 @@ void OfflineSession::useTechnology(Technology technology)
 void OfflineSession::apply(const RecordedMessage& message)
 {
     const Moment time = _messages == 0 ? message.time : std::max(message.time, _last);
-    if (_messages++ == 0)
+    if (_messages++ == 0) {
         _first = time;
+        _nextTick = time + DisplayState::RefreshInterval;
+    }
+    if (_onTick)
+        passTicksBefore(time);
     if (_keepsHistory)
         runTicksBefore(time);
     _last = time;
@@ -56,6 +61,15 @@ void OfflineSession::runTicksBefore(Moment time)
     const Moment tick = _first + ticks * interval;
     if (tick < time)
         refresh(tick);
+}
+
+void OfflineSession::passTicksBefore(Moment time)
+{
+    constexpr std::chrono::microseconds Interval = DisplayState::RefreshInterval;
+    for (; _nextTick < time && _nextTick - _last <= LongestPause; _nextTick += Interval)
+        _onTick(_nextTick);
+    if (_nextTick < time)
+        _nextTick += (time - _nextTick + Interval - std::chrono::microseconds(1)) / Interval * Interval;
 }
 
 void OfflineSession::refresh(Moment time)

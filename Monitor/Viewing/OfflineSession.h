@@ -6,8 +6,11 @@
 #include "Values/Result.h"
 #include "Values/Value.h"
 
+#include <chrono>
 #include <cstdint>
+#include <functional>
 #include <string>
+#include <utility>
 
 namespace spectrel {
 
@@ -17,13 +20,35 @@ namespace spectrel {
 class OfflineSession {
 public:
     /// `keepsHistory`: run the refresh ticks and keep the raw messages, as a snapshot needs them; otherwise the raw
-    /// messages are forgotten, so that memory does not grow with the recording.
-    OfflineSession(GeneratorFactory makeGenerator, bool keepsHistory);
+    /// messages are forgotten, so that memory does not grow with the recording. The clock of the context does not
+    /// count.
+    OfflineSession(GeneratorFactory makeGenerator, bool keepsHistory, const Context& context);
+    OfflineSession(const OfflineSession&) = delete;
+    OfflineSession& operator=(const OfflineSession&) = delete;
+
+    /// In a pause of the recording that is longer than this the ticks end until the next message.
+    static constexpr std::chrono::minutes LongestPause {10};
+
+    /// Hears of each refresh tick at which the display stands as it was then.
+    using TickHandler = std::function<void(Moment tick)>;
+    void setTickHandler(TickHandler handler)
+    {
+        _onTick = std::move(handler);
+    }
 
     /// A recording of another technology replaces the generator, as a baseband that changes its technology does.
     void useTechnology(Technology technology);
     /// Passes on what the message raises.
     void apply(const RecordedMessage& message);
+    /// When the last message came.
+    Moment lastTime() const
+    {
+        return _last;
+    }
+    std::uint64_t messages() const
+    {
+        return _messages;
+    }
     /// The display as it stands; absent when there is none.
     const Value& display() const
     {
@@ -40,6 +65,7 @@ public:
 private:
     void runTicksBefore(Moment time);
     void refresh(Moment time);
+    void passTicksBefore(Moment time);
 
     bool _keepsHistory;
     RecordingClock _clock;
@@ -48,6 +74,8 @@ private:
     std::size_t _rawBytes = 0; // kept by the generator since it last let go of them
     Moment _first {};
     Moment _last {};
+    Moment _nextTick {};
+    TickHandler _onTick;
 };
 
 } // namespace spectrel

@@ -2,16 +2,6 @@
 
 namespace spectrel {
 
-RecordingClock::RecordingClock()
-{
-    Clock::install(this);
-}
-
-RecordingClock::~RecordingClock()
-{
-    Clock::install(nullptr);
-}
-
 ZoneState RecordingClock::zoneAt(Moment) const
 {
     return {};

@@ -6,12 +6,9 @@
 
 namespace spectrel {
 
-/// The clock of a recording that is being decoded: it stands where it is set, in UTC. Installs itself.
+/// The clock of a recording that is being decoded: it stands where it is set, in UTC.
 class RecordingClock final : public Clock {
 public:
-    RecordingClock();
-    ~RecordingClock() override;
-
     void set(Moment moment)
     {
         _now = moment;

@@ -19,15 +19,16 @@ constexpr Playback::Time Tick = DisplayState::RefreshInterval;
 } // namespace
 
 RecordingModel::RecordingModel(RunLoop& runLoop, GeneratorFactory makeGenerator, SpectrelModelObserver& observer,
-    ViewedClock& clock, RecordingTrack track, Report report)
+    ViewedClock& clock, RecordingTrack track, Report report, const Context& context)
     : _runLoop(runLoop)
     , _makeGenerator(std::move(makeGenerator))
     , _observer(observer)
     , _clock(clock)
     , _track(std::move(track))
+    , _context(context)
     , _report(std::move(report))
 {
-    _session.emplace(_makeGenerator, false);
+    _session.emplace(_makeGenerator, false, _context);
     _session->useTechnology(_track.technology());
     _clock.set(_track.momentAt(Time::zero()));
 }
@@ -139,8 +140,7 @@ bool RecordingModel::rewind()
         pause();
         return false;
     }
-    _session.reset(); // before the next one, which installs its clock
-    _session.emplace(_makeGenerator, false);
+    _session.emplace(_makeGenerator, false, _context);
     _session->useTechnology(_track.technology());
     _isTreeOld = true;
     return true;
@@ -180,7 +180,7 @@ void RecordingModel::applyNext()
     _track.take();
 }
 
-/// Going the same way again tells nothing twice.
+/// Going the same way again reports nothing twice.
 void RecordingModel::tellException(const std::string& line)
 {
     if (_track.taken() >= _told) {

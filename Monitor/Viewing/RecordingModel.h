@@ -23,7 +23,7 @@ namespace spectrel {
 /// The state of a decoder cannot be taken back, so a place behind is reached from the start again: that costs the
 /// decoding of all before it and no memory. Long ways are gone in slices on the run loop; the tree changes on arrival.
 ///
-/// A message that would end the running application is told (`report`, `notice`) and left behind; while playing it
+/// A message that would end the running application is reported (`report`, `notice`) and left behind; while playing it
 /// also pauses, so that the moment can be looked at.
 class RecordingModel final : public MonitorModel, public Playback {
 public:
@@ -34,7 +34,7 @@ public:
 
     /// `runLoop`, `observer` and `clock` outlive the model; the clock is set to the moment shown.
     RecordingModel(RunLoop& runLoop, GeneratorFactory makeGenerator, SpectrelModelObserver& observer,
-        ViewedClock& clock, RecordingTrack track, Report report);
+        ViewedClock& clock, RecordingTrack track, Report report, const Context& context);
 
     bool isConnected() const override
     {
@@ -114,6 +114,7 @@ private:
     SpectrelModelObserver& _observer;
     ViewedClock& _clock;
     RecordingTrack _track;
+    Context _context;
     Report _report;
     Lifetime _lifetime; // of jobs on the queue
 

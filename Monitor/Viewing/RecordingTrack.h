@@ -15,14 +15,14 @@ namespace spectrel {
 /// often as wanted. Memory does not grow with it.
 ///
 /// Each message has its time on the track, which counts from the first message and never runs backwards. A recording
-/// whose messages all carry one time (a DLF file tells no times) runs at ten messages a second.
+/// whose messages all carry one time (a DLF file has no times) runs at ten messages a second.
 class RecordingTrack {
 public:
     using Time = Playback::Time;
     static constexpr Time StepWithoutTimes {std::chrono::milliseconds(100)};
 
     /// Takes a reader that has just opened the file at `path`, which must be there for as long as the track is used.
-    /// `technology` counts where the file tells none. Fails when the technology stays open or there is not one
+    /// `technology` counts where the file names none. Fails when the technology stays open or there is not one
     /// message.
     static Result<RecordingTrack> open(
         std::string path, std::unique_ptr<RecordingReader> reader, std::optional<Technology> technology);
@@ -31,7 +31,7 @@ public:
     {
         return _technology;
     }
-    /// When that was; a recording without times tells only when it was made.
+    /// When that was; a recording without times shows only when it was made.
     Moment momentAt(Time time) const
     {
         return _hasTimes ? _start + time : _start;

@@ -18,7 +18,7 @@ std::string textOf(const Dictionary& dictionary, std::string_view key)
     return text ? *text : std::string();
 }
 
-/// The entry's date and description; a description that tells the date stands alone.
+/// The entry's date and description; a description that holds the date stands alone.
 std::string entryName(const Dictionary& entry, std::size_t place)
 {
     const std::string date = textOf(entry, "Date");

@@ -10,7 +10,7 @@ namespace spectrel {
 /// The clock of the screens that show a file: it stands at the moment shown, in the device's time zone.
 class ViewedClock final : public Clock {
 public:
-    /// `device` tells the time zone and outlives this.
+    /// `device` gives the time zone and outlives this.
     explicit ViewedClock(const Clock& device)
         : _device(device)
     {

@@ -44,13 +44,13 @@ std::unique_ptr<ViewedFile> ViewedFile::open(
     return file;
 }
 
-std::unique_ptr<MonitorModel> ViewedFile::makeModel(
-    RunLoop& runLoop, GeneratorFactory makeGenerator, SpectrelModelObserver& observer, Report report)
+std::unique_ptr<MonitorModel> ViewedFile::makeModel(RunLoop& runLoop, GeneratorFactory makeGenerator,
+    SpectrelModelObserver& observer, Report report, const Context& context)
 {
     if (_snapshot)
         return std::make_unique<SnapshotModel>(runLoop, observer, *_snapshot);
     return std::make_unique<RecordingModel>(runLoop, std::move(makeGenerator), observer, _clock,
-        std::move(*std::exchange(_recording, std::nullopt)), std::move(report));
+        std::move(*std::exchange(_recording, std::nullopt)), std::move(report), context);
 }
 
 } // namespace spectrel

@@ -20,14 +20,14 @@ class ViewedFile {
 public:
     using Report = std::function<void(const std::string& line)>;
 
-    /// The content tells which of the two it is. Null, with `reason` (without the file's name), when it is neither, or
-    /// is no plain file: going back takes reading it again. `deviceClock` tells the time zone and outlives this.
+    /// The content says which of the two it is. Null, with `reason` (without the file's name), when it is neither, or
+    /// is no plain file: going back takes reading it again. `deviceClock` gives the time zone and outlives this.
     static std::unique_ptr<ViewedFile> open(
         const std::string& path, std::optional<Technology> technology, const Clock& deviceClock, std::string& reason);
 
     /// Once. `report` gets a line for each message that would have ended the running application.
-    std::unique_ptr<MonitorModel> makeModel(
-        RunLoop& runLoop, GeneratorFactory makeGenerator, SpectrelModelObserver& observer, Report report);
+    std::unique_ptr<MonitorModel> makeModel(RunLoop& runLoop, GeneratorFactory makeGenerator,
+        SpectrelModelObserver& observer, Report report, const Context& context);
     /// Stands at the moment shown.
     const Clock& clock() const
     {

@@ -1,7 +1,6 @@
 #include "Platform/Sockets/ListeningInput.h"
 
 #include "Platform/Sockets/Wire.h"
-#include "Platform/SystemLog.h"
 
 #include <QSocketNotifier>
 #include <QTimer>
@@ -185,8 +184,7 @@ void ListeningInput::acceptWriter()
     if (_path.empty()) {
         watchForVanishing(writer);
     } else if (!wire::isPeerOfThisUser(writer.number())) {
-        SPECTREL_LOG(Priority::Error, "%s: a writer of another user was turned away", _name.c_str());
-        return;
+        return; // a writer of another user is turned away
     }
     _feed.open(std::move(writer), *_listener, WriterFeed::Coming::Told);
     listenIfFree();

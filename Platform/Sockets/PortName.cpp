@@ -23,24 +23,24 @@ bool isStillThere(int file, const std::string& path)
         && opened.st_ino == named.st_ino;
 }
 
-void logRefusal(std::string_view name, const char* reason)
+void logRefusal(SystemLog& log, std::string_view name, const char* reason)
 {
-    SPECTREL_LOG(
-        Priority::Error, "Message port name \"%.*s\" refused: %s", static_cast<int>(name.size()), name.data(), reason);
+    SPECTREL_LOG(log, Priority::Error, "Message port name \"%.*s\" refused: %s", static_cast<int>(name.size()),
+        name.data(), reason);
 }
 
 } // namespace
 
-std::optional<sockaddr_un> portAddress(const std::string& directory, std::string_view name)
+std::optional<sockaddr_un> portAddress(const std::string& directory, std::string_view name, SystemLog& log)
 {
     if (name.empty() || name.front() == '.' || name.find('/') != name.npos || name.find('\0') != name.npos) {
-        logRefusal(name, "it must not be empty, start with a dot, or hold a slash or a zero byte");
+        logRefusal(log, name, "it must not be empty, start with a dot, or hold a slash or a zero byte");
         return std::nullopt;
     }
     const std::string path = directory + "/" + std::string(name);
     sockaddr_un address = {};
     if (path.size() >= sizeof address.sun_path) {
-        logRefusal(name, "with its folder it is longer than 107 bytes");
+        logRefusal(log, name, "with its folder it is longer than 107 bytes");
         return std::nullopt;
     }
     address.sun_family = AF_UNIX;

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Platform/Sockets/FileDescriptor.h"
+#include "Platform/SystemLog.h"
 
 #include <optional>
 #include <string>
@@ -12,7 +13,7 @@ namespace spectrel {
 
 /// The socket address of a port in the folder. None, logged with the reason, for a name that cannot be one: empty,
 /// starting with ".", holding "/" or a zero byte, or too long for a socket's path together with the folder (107 bytes).
-std::optional<sockaddr_un> portAddress(const std::string& directory, std::string_view name);
+std::optional<sockaddr_un> portAddress(const std::string& directory, std::string_view name, SystemLog& log);
 
 /// The right to a port's name: a lock on the file ".NAME.lock" in the folder, which ends with the process at the
 /// latest.

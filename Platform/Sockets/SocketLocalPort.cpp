@@ -25,8 +25,10 @@ constexpr int AcceptPause = 100; // milliseconds without new senders when the pr
 
 class SocketLocalPort::Core : public std::enable_shared_from_this<Core> {
 public:
-    Core(std::string name, std::string path, NameLock lock, FileDescriptor socket, MessageHandler handler)
-        : _name(std::move(name))
+    Core(std::string name, std::string path, NameLock lock, FileDescriptor socket, MessageHandler handler,
+        SystemLog& log)
+        : _log(log)
+        , _name(std::move(name))
         , _path(std::move(path))
         , _lock(std::move(lock))
         , _socket(std::move(socket))
@@ -66,6 +68,7 @@ private:
     bool answer(int socket, const wire::Header& request, const std::optional<Bytes>& reply);
     void drop(int socket, const char* reason);
 
+    SystemLog& _log;
     std::string _name;
     std::string _path;
     std::optional<NameLock> _lock;
@@ -132,7 +135,7 @@ bool SocketLocalPort::Core::acceptOne()
     if (errno != EAGAIN && errno != EWOULDBLOCK) {
         // Out of descriptors or memory: the waiting sender would wake the loop without end.
         SPECTREL_LOG(
-            Priority::Error, "Message port %s: cannot accept a sender: %s", _name.c_str(), std::strerror(errno));
+            _log, Priority::Error, "Message port %s: cannot accept a sender: %s", _name.c_str(), std::strerror(errno));
         _acceptNotifier->setEnabled(false);
         QTimer::singleShot(AcceptPause, _acceptNotifier.get(), [this] { _acceptNotifier->setEnabled(true); });
     }
@@ -142,12 +145,12 @@ bool SocketLocalPort::Core::acceptOne()
 void SocketLocalPort::Core::add(FileDescriptor socket)
 {
     if (!wire::isPeerOfThisUser(socket.number())) {
-        SPECTREL_LOG(Priority::Error, "Message port %s: a sender of another user was turned away", _name.c_str());
+        SPECTREL_LOG(_log, Priority::Error, "Message port %s: a sender of another user was turned away", _name.c_str());
         return;
     }
     if (_connections.size() >= MostConnections) {
         if (!std::exchange(_isFull, true)) {
-            SPECTREL_LOG(Priority::Error, "Message port %s: more than %zu senders; further ones are turned away",
+            SPECTREL_LOG(_log, Priority::Error, "Message port %s: more than %zu senders; further ones are turned away",
                 _name.c_str(), MostConnections);
         }
         return;
@@ -200,8 +203,8 @@ bool SocketLocalPort::Core::answer(int socket, const wire::Header& request, cons
     if (reply && reply->size() <= LargestMessage)
         body = *reply;
     else if (reply)
-        SPECTREL_LOG(
-            Priority::Error, "Message port %s: an answer of %zu bytes is too large", _name.c_str(), reply->size());
+        SPECTREL_LOG(_log, Priority::Error, "Message port %s: an answer of %zu bytes is too large", _name.c_str(),
+            reply->size());
     const wire::Header header {wire::Kind::Reply, request.id, request.sequence};
     if (wire::send(socket, header, body) == wire::Outcome::Done)
         return true;
@@ -212,15 +215,15 @@ bool SocketLocalPort::Core::answer(int socket, const wire::Header& request, cons
 void SocketLocalPort::Core::drop(int socket, const char* reason)
 {
     if (reason)
-        SPECTREL_LOG(Priority::Error, "Message port %s: dropped a sender that %s", _name.c_str(), reason);
+        SPECTREL_LOG(_log, Priority::Error, "Message port %s: dropped a sender that %s", _name.c_str(), reason);
     std::erase_if(_connections, [socket](const Connection& each) { return each.socket.number() == socket; });
     _isFull = false;
 }
 
 SocketLocalPort::SocketLocalPort(
-    std::string name, std::string path, NameLock lock, FileDescriptor socket, MessageHandler handler)
+    std::string name, std::string path, NameLock lock, FileDescriptor socket, MessageHandler handler, SystemLog& log)
     : _core(std::make_shared<Core>(
-        std::move(name), std::move(path), std::move(lock), std::move(socket), std::move(handler)))
+        std::move(name), std::move(path), std::move(lock), std::move(socket), std::move(handler), log))
 {
 }
 

@@ -3,6 +3,7 @@
 #include "Platform/MessagePort.h"
 #include "Platform/Sockets/FileDescriptor.h"
 #include "Platform/Sockets/PortName.h"
+#include "Platform/SystemLog.h"
 
 #include <memory>
 #include <string>
@@ -16,7 +17,8 @@ public:
     static constexpr std::size_t MostConnections = 64; // further senders are turned away
 
     /// `socket` listens at `path` (empty: a file that stays when the port ends); `lock` is the right to the name.
-    SocketLocalPort(std::string name, std::string path, NameLock lock, FileDescriptor socket, MessageHandler handler);
+    SocketLocalPort(std::string name, std::string path, NameLock lock, FileDescriptor socket, MessageHandler handler,
+        SystemLog& log);
     ~SocketLocalPort() override;
 
     const std::string& name() const override;

@@ -2,6 +2,7 @@
 
 #include "Platform/MessagePort.h"
 #include "Platform/Sockets/FileDescriptor.h"
+#include "Platform/SystemLog.h"
 #include "Values/Result.h"
 
 #include <map>
@@ -16,7 +17,7 @@ namespace spectrel {
 class SocketMessagePorts final : public MessagePorts {
 public:
     /// Nothing is made or checked yet.
-    explicit SocketMessagePorts(std::string directory);
+    SocketMessagePorts(std::string directory, SystemLog& log);
     /// Makes the folder at need. Fails when it cannot be had or a port of that name would not fit.
     static Outcome prepareDirectory(const std::string& directory, std::string_view name);
 
@@ -30,6 +31,7 @@ public:
 
 private:
     std::string _directory;
+    SystemLog& _log;
     std::map<std::string, std::weak_ptr<LocalMessagePort>, std::less<>> _locals; // of this process
     std::map<std::string, FileDescriptor, std::less<>> _adopted; // until they are served
 };

@@ -54,8 +54,9 @@ private:
 
 class SocketRemotePort::Core : public std::enable_shared_from_this<Core> {
 public:
-    Core(std::string name, FileDescriptor socket)
-        : _name(std::move(name))
+    Core(std::string name, FileDescriptor socket, SystemLog& log)
+        : _log(log)
+        , _name(std::move(name))
         , _socket(std::move(socket))
         , _readable(std::make_unique<QSocketNotifier>(_socket.number(), QSocketNotifier::Read))
         , _writable(std::make_unique<QSocketNotifier>(_socket.number(), QSocketNotifier::Write))
@@ -87,6 +88,7 @@ private:
     void dropPeer();
     void waitForRoom();
 
+    SystemLog& _log;
     std::string _name;
     FileDescriptor _socket;
     std::unique_ptr<QSocketNotifier> _readable; // also tells of the peer's death
@@ -215,7 +217,8 @@ void SocketRemotePort::Core::tellWritable()
 
 void SocketRemotePort::Core::dropPeer()
 {
-    SPECTREL_LOG(Priority::Error, "Message port %s: dropped its owner, which sent what is no reply", _name.c_str());
+    SPECTREL_LOG(
+        _log, Priority::Error, "Message port %s: dropped its owner, which sent what is no reply", _name.c_str());
     invalidate();
 }
 
@@ -226,8 +229,8 @@ void SocketRemotePort::Core::waitForRoom()
         _writable->setEnabled(true);
 }
 
-SocketRemotePort::SocketRemotePort(std::string name, FileDescriptor socket)
-    : _core(std::make_shared<Core>(std::move(name), std::move(socket)))
+SocketRemotePort::SocketRemotePort(std::string name, FileDescriptor socket, SystemLog& log)
+    : _core(std::make_shared<Core>(std::move(name), std::move(socket), log))
 {
 }
 

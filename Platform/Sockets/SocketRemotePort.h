@@ -2,6 +2,7 @@
 
 #include "Platform/MessagePort.h"
 #include "Platform/Sockets/FileDescriptor.h"
+#include "Platform/SystemLog.h"
 
 #include <memory>
 #include <string>
@@ -11,7 +12,7 @@ namespace spectrel {
 /// The sending end of a port: one connection to its owner.
 class SocketRemotePort final : public RemoteMessagePort {
 public:
-    SocketRemotePort(std::string name, FileDescriptor socket);
+    SocketRemotePort(std::string name, FileDescriptor socket, SystemLog& log);
     ~SocketRemotePort() override;
 
     const std::string& name() const override;

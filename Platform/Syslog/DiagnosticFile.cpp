@@ -19,12 +19,6 @@ Result<std::unique_ptr<DiagnosticFile>> DiagnosticFile::create(const std::string
 DiagnosticFile::DiagnosticFile(std::unique_ptr<FileLog> file)
     : _file(std::move(file))
 {
-    install(this);
-}
-
-DiagnosticFile::~DiagnosticFile()
-{
-    install(nullptr);
 }
 
 void DiagnosticFile::write(std::string_view line)

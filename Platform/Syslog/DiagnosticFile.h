@@ -10,12 +10,11 @@
 namespace spectrel {
 
 /// The diagnostic log as a file, in the form of the system log's file: each line is of the least urgent priority
-/// ("<7>TEXT") and in the file at once. Installs itself for as long as it lives.
+/// ("<7>TEXT") and in the file at once.
 class DiagnosticFile final : public DiagnosticLog {
 public:
     /// An existing file is replaced.
     static Result<std::unique_ptr<DiagnosticFile>> create(const std::string& path);
-    ~DiagnosticFile() override;
 
     void write(std::string_view line) override;
 

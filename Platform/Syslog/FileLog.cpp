@@ -1,5 +1,10 @@
 #include "Platform/Syslog/FileLog.h"
 
+#include "Values/OwnFile.h"
+
+#include <sys/stat.h>
+#include <unistd.h>
+
 namespace spectrel {
 
 namespace {
@@ -47,9 +52,17 @@ void appendEscaped(std::string& line, char character)
 
 Result<std::unique_ptr<FileLog>> FileLog::create(const std::string& path, Writing writing)
 {
-    if (std::FILE* const file = std::fopen(path.c_str(), "we"))
+    const auto opened = openOwnFile(path, IfThere::Overwrite);
+    if (!opened)
+        return opened.failure();
+    struct stat status { };
+    const bool isFile = ::fstat(*opened, &status) == 0 && S_ISREG(status.st_mode);
+    std::FILE* const file = isFile && ::ftruncate(*opened, 0) != 0 ? nullptr : ::fdopen(*opened, "w");
+    if (file)
         return std::unique_ptr<FileLog>(new FileLog(file, writing));
-    return Failure::ofSystem();
+    const Failure failure = Failure::ofSystem();
+    ::close(*opened);
+    return failure;
 }
 
 void FileLog::write(int priority, std::string_view text)

@@ -19,7 +19,7 @@ public:
     /// Whether each line is in the file at once, or whenever the buffer is full and at the end.
     enum class Writing : std::uint8_t { EachLine, Buffered };
 
-    /// An existing file is replaced.
+    /// An existing file is replaced where it is this user's own and no link (`openOwnFile`); its mode is 0600.
     static Result<std::unique_ptr<FileLog>> create(const std::string& path, Writing writing);
 
     void write(int priority, std::string_view text) override;
@@ -34,7 +34,8 @@ private:
         }
     };
     FileLog(std::FILE* file, Writing writing)
-        : _file(file)
+        : SystemLog(EveryPriority)
+        , _file(file)
         , _writing(writing)
     {
     }

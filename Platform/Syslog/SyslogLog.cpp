@@ -5,6 +5,7 @@
 namespace spectrel {
 
 SyslogLog::SyslogLog()
+    : SystemLog(Priority::Error)
 {
     ::openlog("spectrel", LOG_PID, LOG_USER);
 }

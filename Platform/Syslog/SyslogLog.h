@@ -4,7 +4,8 @@
 
 namespace spectrel {
 
-/// The platform's system log, under the identity "spectrel".
+/// The platform's system log, under the identity "spectrel". Only failures are wanted: traces, a line for each section
+/// and record, stay out of it.
 class SyslogLog final : public SystemLog {
 public:
     SyslogLog();

@@ -13,7 +13,7 @@ namespace spectrel {
 constexpr std::size_t CaptureHeaderSize = 24;
 constexpr std::size_t PacketHeaderSize = 16;
 
-/// A capture's link type tells the technology.
+/// A capture's link type names the technology.
 struct LinkType {
     int number; // one of the numbers that captures leave to private use
     Technology technology;

@@ -5,6 +5,7 @@
 #include <cerrno>
 #include <fcntl.h>
 #include <filesystem>
+#include <sys/file.h>
 #include <sys/stat.h>
 #include <unistd.h>
 #include <utility>
@@ -13,23 +14,41 @@ namespace spectrel {
 
 namespace {
 
-/// Beside the file, so that it can be renamed; the number keeps two programs apart.
-std::string hiddenName(const std::filesystem::path& path)
+constexpr int MostHiddenNames = 100; // tried, where somebody has taken one
+
+/// Beside the file, so that it can be renamed; the process's number keeps two programs apart.
+std::string hiddenName(const std::filesystem::path& path, int attempt)
 {
-    return (path.parent_path() / ("." + path.filename().string() + "-" + std::to_string(::getpid()))).string();
+    const std::string behind = attempt == 0 ? std::string() : "-" + std::to_string(attempt);
+    return (path.parent_path() / ("." + path.filename().string() + "-" + std::to_string(::getpid()) + behind)).string();
 }
 
-/// Opens a file that is there and takes its packets away, but not its head. Less than 0 on failure.
-int openEmptied(const std::string& path)
+Result<int> makeHidden(const std::string& path, std::string& hidden)
 {
-    const int file = ::open(path.c_str(), O_WRONLY | O_CLOEXEC);
-    struct stat state { };
-    if (file >= 0 && ::fstat(file, &state) == 0 && S_ISREG(state.st_mode) && state.st_size > off_t {CaptureHeaderSize}
-        && ::ftruncate(file, CaptureHeaderSize) != 0) {
-        ::close(file);
-        return -1;
+    for (int attempt = 0;; ++attempt) {
+        hidden = hiddenName(path, attempt);
+        auto file = openOwnFile(hidden, IfThere::Refuse);
+        if (file || file.failure().code != Failure::Code::Exists || attempt == MostHiddenNames)
+            return file;
     }
-    return file;
+}
+
+bool isRegular(int file, struct stat& status)
+{
+    return ::fstat(file, &status) == 0 && S_ISREG(status.st_mode);
+}
+
+/// Takes the packets of a file away that was there, but not its head.
+Outcome emptyBehindHead(int file)
+{
+    struct stat status { };
+    if (!isRegular(file, status))
+        return Done();
+    if (::flock(file, LOCK_EX | LOCK_NB) != 0)
+        return Failure {"another program is writing it", Failure::Code::Refused};
+    if (status.st_size > off_t {CaptureHeaderSize} && ::ftruncate(file, CaptureHeaderSize) != 0)
+        return Failure::ofSystem();
+    return Done();
 }
 
 /// Whether the file got the name, which no other had.
@@ -46,21 +65,26 @@ bool renamedToFree(const std::string& from, const std::string& to)
     return true;
 }
 
+bool isThere(const std::string& path)
+{
+    struct stat status { };
+    return ::lstat(path.c_str(), &status) == 0;
+}
+
 } // namespace
 
-CaptureOutput::CaptureOutput(std::FILE* stream, std::string path, std::string hidden, IfThere ifThere)
-    : _stream(stream)
+CaptureOutput::CaptureOutput(int file, std::string path, std::string hidden)
+    : _file(file)
     , _path(std::move(path))
     , _hidden(std::move(hidden))
-    , _ifThere(ifThere)
 {
 }
 
 CaptureOutput::CaptureOutput(CaptureOutput&& other) noexcept
-    : _stream(other._stream)
+    : _file(std::exchange(other._file, -1))
+    , _length(other._length)
     , _path(std::move(other._path))
     , _hidden(std::exchange(other._hidden, {}))
-    , _ifThere(other._ifThere)
 {
 }
 
@@ -68,35 +92,55 @@ CaptureOutput::~CaptureOutput()
 {
     if (!_hidden.empty())
         ::unlink(_hidden.c_str());
+    if (_file >= 0)
+        ::close(_file);
 }
 
 Result<CaptureOutput> CaptureOutput::open(const std::string& path, IfThere ifThere)
 {
-    std::string hidden;
-    int file = -1;
-    if (path == "-")
-        file = ::dup(STDOUT_FILENO);
-    else if (ifThere == IfThere::Overwrite)
-        file = openEmptied(path);
-    if (file < 0 && path != "-" && (ifThere == IfThere::Refuse || errno == ENOENT)) {
-        hidden = hiddenName(path);
-        file = ::open(hidden.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0666);
+    if (path == "-") {
+        const int file = ::fcntl(STDOUT_FILENO, F_DUPFD_CLOEXEC, 0);
+        return file >= 0 ? Result<CaptureOutput>(CaptureOutput(file, path, {})) : Failure::ofSystem();
     }
-    std::FILE* const stream = file < 0 ? nullptr : ::fdopen(file, "wb");
-    if (!stream)
-        return Failure::ofSystem();
-    return CaptureOutput(stream, path, std::move(hidden), ifThere);
+    std::string hidden;
+    const bool isNew = ifThere == IfThere::Refuse || !isThere(path);
+    const auto opened = isNew ? makeHidden(path, hidden) : openOwnFile(path, ifThere);
+    if (!opened)
+        return opened.failure();
+    CaptureOutput output(*opened, path, hidden);
+    if (isNew)
+        ::flock(output._file, LOCK_EX | LOCK_NB); // before anybody knows the name
+    else if (const auto emptied = emptyBehindHead(output._file); !emptied)
+        return emptied.failure();
+    return output;
 }
 
 Outcome CaptureOutput::publish()
 {
     if (_hidden.empty())
         return Done();
-    const bool named =
-        _ifThere == IfThere::Overwrite ? ::rename(_hidden.c_str(), _path.c_str()) == 0 : renamedToFree(_hidden, _path);
-    if (!named)
+    if (!renamedToFree(_hidden, _path))
         return Failure::ofSystem();
     _hidden.clear();
+    return Done();
+}
+
+Outcome CaptureOutput::append(ByteView bytes)
+{
+    for (ByteView rest = bytes; !rest.empty();) {
+        const ssize_t written = ::write(_file, rest.data(), rest.size());
+        if (written >= 0) {
+            rest = rest.subspan(static_cast<std::size_t>(written));
+        } else if (errno != EINTR) {
+            const Failure failure = Failure::ofSystem();
+            struct stat status { };
+            if (rest.size() < bytes.size() && isRegular(_file, status)
+                && (::ftruncate(_file, _length) != 0 || ::lseek(_file, _length, SEEK_SET) != _length))
+                return Failure {failure.text + ", and the message that was cut cannot be taken away"};
+            return failure;
+        }
+    }
+    _length += static_cast<off_t>(bytes.size());
     return Done();
 }
 

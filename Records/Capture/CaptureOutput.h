@@ -1,43 +1,45 @@
 #pragma once
 
+#include "Values/Bytes.h"
+#include "Values/OwnFile.h"
 #include "Values/Result.h"
 
-#include <cstdio>
 #include <string>
+#include <sys/types.h>
 
 namespace spectrel {
 
 /// The file that a capture is written to: whoever is killed, at whatever time, leaves one that can be read.
 ///
 /// A new file is made under a hidden name and gets its own when its head stands in it; a file that is overwritten
-/// has a head throughout.
+/// has a head throughout. Nobody else's file is touched, see `openOwnFile`. While it is open a file is locked
+/// (flock), by which others know that it is being written.
 class CaptureOutput {
 public:
-    enum class IfThere { Overwrite, Refuse };
-
-    /// Opens the output; "-" is standard output.
+    /// Opens the output; "-" is standard output. Fails with `Refused` when another program is writing the file.
     static Result<CaptureOutput> open(const std::string& path, IfThere ifThere);
     CaptureOutput(CaptureOutput&& other) noexcept;
     CaptureOutput(const CaptureOutput&) = delete;
     CaptureOutput& operator=(const CaptureOutput&) = delete;
-    /// Removes a file that was not published. The stream is not closed.
+    /// Closes the file, and removes one that was not published.
     ~CaptureOutput();
 
-    /// The caller closes it.
-    std::FILE* stream() const
-    {
-        return _stream;
-    }
     /// To be called when the head has been written. Fails with `Exists` when a file of the name is there and must stay.
     Outcome publish();
+    /// Writes all of it or, as far as the file can be cut, nothing.
+    Outcome append(ByteView bytes);
+    int descriptor() const
+    {
+        return _file;
+    }
 
 private:
-    CaptureOutput(std::FILE* stream, std::string path, std::string hidden, IfThere ifThere);
+    CaptureOutput(int file, std::string path, std::string hidden);
 
-    std::FILE* _stream;
+    int _file;
+    off_t _length = 0; // of what was appended
     std::string _path;
     std::string _hidden; // the name until it is published; empty when it has its own
-    IfThere _ifThere;
 };
 
 } // namespace spectrel

@@ -12,7 +12,7 @@ namespace spectrel {
 
 namespace {
 
-/// What tells that a body is a log message.
+/// What shows that a body is a log message.
 constexpr std::size_t LongestFrame = WrapperSize + RecordTypeSize + ItemLengthSize;
 constexpr std::size_t LeastEvidence = PacketHeaderSize + LongestFrame; // no place is confirmed by fewer bytes
 constexpr std::uint32_t Microseconds = 0xA1B2C3D4;
@@ -98,7 +98,7 @@ CaptureStream::Verdict CaptureStream::judge(const StreamBuffer& buffer, std::siz
     return judgeWhatFollows(buffer, place, body + header.captured);
 }
 
-/// A packet whose body tells nothing of it is confirmed by what stands at its end.
+/// A packet whose body says nothing of it is confirmed by what stands at its end.
 CaptureStream::Verdict CaptureStream::judgeWhatFollows(
     const StreamBuffer& buffer, std::size_t place, std::size_t end) const
 {
@@ -182,7 +182,7 @@ StreamCutter::Found CaptureStream::takeHeader(StreamBuffer& buffer)
     const std::uint32_t magic = RecordView(bytes).u32(0);
     _isSwapped = !isMagic(magic);
     _hasNanoseconds = (_isSwapped ? swapped(magic) : magic) == Nanoseconds;
-    const int linkType = static_cast<int>(u32(bytes, 20) & 0x0FFFFFFF); // the rest tells of check sums
+    const int linkType = static_cast<int>(u32(bytes, 20) & 0x0FFFFFFF); // the rest is about check sums
     const auto told = technologyOfLinkType(linkType);
     _technology = told ? told : _fallback;
     take(buffer, CaptureHeaderSize);

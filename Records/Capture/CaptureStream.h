@@ -15,10 +15,10 @@ namespace spectrel {
 /// Nothing in a capture marks where a packet starts. A place is taken for a packet's start when its header can be true
 /// and something confirms it: the body is a log message whose length fits, or another packet, another capture or the
 /// stream's end follows it. Of all places that may be one, the one that is confirmed by the earliest byte is taken: an
-/// undamaged packet at once, and after damage a packet as soon as it can be told.
+/// undamaged packet at once, and after damage a packet as soon as it is sure.
 class CaptureStream final : public StreamCutter {
 public:
-    /// `technology`: where the link type tells none.
+    /// `technology`: where the link type names none.
     explicit CaptureStream(std::optional<Technology> technology)
         : _fallback(technology)
     {

@@ -4,11 +4,11 @@
 #include "Values/Bytes.h"
 
 #include <algorithm>
-#include <cerrno>
 #include <cstdio>
 #include <limits>
 #include <optional>
 #include <pcap/pcap.h>
+#include <utility>
 
 namespace spectrel {
 
@@ -29,29 +29,71 @@ struct CaptureCloser {
 using Capture = std::unique_ptr<pcap_t, CaptureCloser>;
 using Dumper = std::unique_ptr<pcap_dumper_t, CaptureCloser>;
 
-/// Of the file's buffer. Only whole packets leave it, so that a program that is killed leaves a file that ends with
-/// one, unless it is killed in the midst of a write, which the system breaks off between two pages.
-constexpr std::size_t BufferSize = 512 * 1024;
-static_assert(BufferSize > LargestMessage + PacketHeaderSize);
+/// What gathers before it is written without being asked. Only whole packets reach the file, so that a program that is
+/// killed leaves a file that ends with one, unless it is killed in the midst of a write, which the system breaks off
+/// between two pages.
+constexpr std::size_t WriteSize = 512 * 1024;
+static_assert(RecordingWriter::MostWaiting > WriteSize + LargestMessage + PacketHeaderSize);
+
+ssize_t gather(void* gathered, const char* bytes, std::size_t length)
+{
+    auto& all = *static_cast<Bytes*>(gathered);
+    all.insert(all.end(), bytes, bytes + length);
+    return static_cast<ssize_t>(length);
+}
 
 class CaptureWriter final : public RecordingWriter {
 public:
-    CaptureWriter(std::unique_ptr<char[]> buffer, Dumper dumper)
-        : _buffer(std::move(buffer))
-        , _dumper(std::move(dumper))
+    explicit CaptureWriter(RecordingOutput append)
+        : _append(std::move(append))
     {
     }
+    ~CaptureWriter() override
+    {
+        [[maybe_unused]] const auto flushed = flush();
+    }
+    /// Gathers the head.
+    Outcome begin(Technology technology);
+    void adopt(CaptureOutput file)
+    {
+        _file.emplace(std::move(file));
+    }
+    Outcome publish()
+    {
+        return _file->publish();
+    }
+
     Outcome write(Moment time, ByteView body) override;
     Outcome flush() override;
+    std::uint64_t waiting() const override
+    {
+        return _waiting;
+    }
+    int descriptor() const override
+    {
+        return _file ? _file->descriptor() : -1;
+    }
 
 private:
-    Outcome doneUnless(bool isBroken);
-
-    std::unique_ptr<char[]> _buffer; // the file's, so that it ends after it
-    Dumper _dumper;
-    std::size_t _buffered = 0; // bytes since the last flush
-    std::optional<Failure> _broken; // the file holds a part of a packet, perhaps; nothing may follow
+    RecordingOutput _append; // where there is no file
+    std::optional<CaptureOutput> _file;
+    Bytes _gathered; // whole packets
+    std::uint64_t _waiting = 0; // messages in them
+    Dumper _dumper; // writes what is gathered
+    std::optional<Failure> _broken; // nothing may follow
 };
+
+Outcome CaptureWriter::begin(Technology technology)
+{
+    std::FILE* const stream = ::fopencookie(&_gathered, "wb", {nullptr, gather, nullptr, nullptr});
+    if (!stream)
+        return Failure::ofSystem();
+    std::setvbuf(stream, nullptr, _IONBF, 0);
+    const auto link = std::ranges::find(LinkTypes, technology, &LinkType::technology);
+    const Capture capture(pcap_open_dead(link->number, LargestMessage));
+    _dumper.reset(pcap_dump_fopen(capture.get(), stream)); // closes the stream when it fails
+    return _dumper ? Outcome(Done()) : Failure {pcap_geterr(capture.get())};
+}
 
 Outcome CaptureWriter::write(Moment time, ByteView body)
 {
@@ -64,55 +106,51 @@ Outcome CaptureWriter::write(Moment time, ByteView body)
     const std::int64_t seconds = second.time_since_epoch().count();
     if (seconds < 0 || seconds > std::numeric_limits<std::uint32_t>::max())
         return Failure {"the time " + defaultDateForm(time) + " is outside what a capture can tell"};
+    const std::size_t length = PacketHeaderSize + body.size();
+    if (_gathered.size() + length > WriteSize) {
+        const auto flushed = flush();
+        if (!flushed && (_broken || _gathered.size() + length > MostWaiting))
+            return flushed;
+    }
     pcap_pkthdr header {};
     header.ts.tv_sec = seconds;
     header.ts.tv_usec = (time - second).count();
     header.caplen = static_cast<std::uint32_t>(body.size());
     header.len = header.caplen;
-    const std::size_t length = PacketHeaderSize + body.size();
-    if (_buffered + length > BufferSize) {
-        if (auto flushed = flush(); !flushed)
-            return flushed;
-    }
-    _buffered += length;
-    errno = 0;
     pcap_dump(reinterpret_cast<std::uint8_t*>(_dumper.get()), &header, body.data());
-    return doneUnless(std::ferror(pcap_dump_file(_dumper.get())) != 0);
+    ++_waiting;
+    return Done();
 }
 
 Outcome CaptureWriter::flush()
 {
     if (_broken)
         return *_broken;
-    _buffered = 0;
-    return doneUnless(pcap_dump_flush(_dumper.get()) != 0);
-}
-
-Outcome CaptureWriter::doneUnless(bool isBroken)
-{
-    if (!isBroken)
+    if (_gathered.empty())
         return Done();
-    _broken = Failure::ofSystem();
-    return *_broken;
+    const auto written = _file ? _file->append(_gathered) : _append(_gathered);
+    if (!written) {
+        if (written.failure().code != Failure::Code::NoRoom)
+            _broken = written.failure();
+        return written;
+    }
+    _gathered.clear();
+    _waiting = 0;
+    return Done();
 }
 
-Result<std::unique_ptr<RecordingWriter>> create(
-    const std::string& path, Technology technology, CaptureOutput::IfThere ifThere)
+Result<std::unique_ptr<RecordingWriter>> create(const std::string& path, Technology technology, IfThere ifThere)
 {
     auto output = CaptureOutput::open(path, ifThere);
     if (!output)
         return output.failure();
-    auto buffer = std::make_unique_for_overwrite<char[]>(BufferSize);
-    std::setvbuf(output->stream(), buffer.get(), _IOFBF, BufferSize);
-    const auto link = std::ranges::find(LinkTypes, technology, &LinkType::technology);
-    const Capture capture(pcap_open_dead(link->number, LargestMessage));
-    Dumper dumper(pcap_dump_fopen(capture.get(), output->stream())); // closes the file when it fails
-    if (!dumper)
-        return Failure {pcap_geterr(capture.get())};
-    auto writer = std::make_unique<CaptureWriter>(std::move(buffer), std::move(dumper));
+    auto writer = std::make_unique<CaptureWriter>(RecordingOutput());
+    writer->adopt(*std::move(output));
+    if (const auto begun = writer->begin(technology); !begun)
+        return begun.failure();
     if (const auto flushed = writer->flush(); !flushed) // the head stands in the file from the start
         return flushed.failure();
-    if (const auto published = output->publish(); !published)
+    if (const auto published = writer->publish(); !published)
         return published.failure();
     return writer;
 }
@@ -121,12 +159,22 @@ Result<std::unique_ptr<RecordingWriter>> create(
 
 Result<std::unique_ptr<RecordingWriter>> createRecording(const std::string& path, Technology technology)
 {
-    return create(path, technology, CaptureOutput::IfThere::Overwrite);
+    return create(path, technology, IfThere::Overwrite);
 }
 
 Result<std::unique_ptr<RecordingWriter>> createNewRecording(const std::string& path, Technology technology)
 {
-    return create(path, technology, CaptureOutput::IfThere::Refuse);
+    return create(path, technology, IfThere::Refuse);
+}
+
+Result<std::unique_ptr<RecordingWriter>> createRecordingOn(RecordingOutput output, Technology technology)
+{
+    auto writer = std::make_unique<CaptureWriter>(std::move(output));
+    if (const auto begun = writer->begin(technology); !begun)
+        return begun.failure();
+    if (const auto flushed = writer->flush(); !flushed)
+        return flushed.failure();
+    return writer;
 }
 
 } // namespace spectrel

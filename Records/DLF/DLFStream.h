@@ -11,7 +11,7 @@
 namespace spectrel {
 
 /// Cuts DLF items, and messages as received, out of a stream: by the same rules as from a file, over the bytes that are
-/// there. Nothing but what follows tells how such bytes are to be cut, so a decision waits for a window of bytes, for
+/// there. Nothing but what follows says how such bytes are to be cut, so a decision waits for a window of bytes, for
 /// the stream to settle or for its end.
 class DLFStream final : public StreamCutter {
 public:

@@ -24,6 +24,7 @@ namespace spectrel {
 /// The sections of a GSM/UMTS baseband, in the order of creation and so of delivery.
 class ZPH_GSMClassIndex final : public ClassIndex {
 public:
+    using ClassIndex::ClassIndex;
     ~ZPH_GSMClassIndex() override;
 
 private:

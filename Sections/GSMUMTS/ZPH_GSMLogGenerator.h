@@ -7,10 +7,10 @@ namespace spectrel {
 /// GSM/UMTS: template "ZPH_GSM".
 class ZPH_GSMLogGenerator final : public ZPHLogGenerator2 {
 public:
-    ZPH_GSMLogGenerator();
+    explicit ZPH_GSMLogGenerator(const Context& context);
     ~ZPH_GSMLogGenerator() override;
 
-    static std::unique_ptr<ZPH_GSMLogGenerator> generator();
+    static std::unique_ptr<ZPH_GSMLogGenerator> generator(const Context& context);
     std::string_view className() const override;
 };
 

@@ -70,21 +70,23 @@ class NeighborCellsList final : public SectionOf<NeighborCellsList> {
     void logNeighbours(RecordView record)
     {
         const RepeatedGroup neighbours = IdleNeighbourRecord::neighbours(record);
-        SPECTREL_LOG(
-            Priority::Warning, "Number of neighboring cells being reported: %d\n", static_cast<int>(neighbours.count));
+        SPECTREL_LOG(log(), Priority::Warning, "Number of neighboring cells being reported: %d\n",
+            static_cast<int>(neighbours.count));
         for (std::size_t index = 0; index < neighbours.count; ++index)
             logNeighbour(record, neighbours.entry(index));
     }
     /// One label for all five levels: kept on purpose.
-    static void logNeighbour(RecordView record, std::size_t start)
+    void logNeighbour(RecordView record, std::size_t start) const
     {
         for (const Field& field : CellFields)
             SPECTREL_LOG(
-                Priority::Warning, "Physical Cell ID: %d\n", static_cast<int>(fieldValue(record, field, start)));
+                log(), Priority::Warning, "Physical Cell ID: %d\n", static_cast<int>(fieldValue(record, field, start)));
         for (const Field& field : PowerFields)
-            SPECTREL_LOG(Priority::Warning, "Measured RSSI: %lf\n", level<2, -140>(fieldValue(record, field, start)));
+            SPECTREL_LOG(
+                log(), Priority::Warning, "Measured RSSI: %lf\n", level<2, -140>(fieldValue(record, field, start)));
         for (const Field& field : QualityFields)
-            SPECTREL_LOG(Priority::Warning, "Measured RSSI: %lf\n", level<4, -30>(fieldValue(record, field, start)));
+            SPECTREL_LOG(
+                log(), Priority::Warning, "Measured RSSI: %lf\n", level<4, -30>(fieldValue(record, field, start)));
     }
 
     static constexpr std::array<RecordLayout, 1> Layouts {{

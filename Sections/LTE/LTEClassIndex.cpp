@@ -1,12 +1,10 @@
 #include "Sections/LTE/LTEClassIndex.h"
 
-#include "Platform/Console.h"
-
 namespace spectrel {
 
 LTEClassIndex::~LTEClassIndex()
 {
-    consoleLine("Deallocing LTEClassIndex");
+    context.console.line("Deallocing LTEClassIndex");
 }
 
 } // namespace spectrel

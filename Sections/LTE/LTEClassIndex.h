@@ -14,6 +14,7 @@ namespace spectrel {
 /// The sections of an LTE baseband, in the order of creation and so of delivery.
 class LTEClassIndex final : public ClassIndex {
 public:
+    using ClassIndex::ClassIndex;
     ~LTEClassIndex() override;
 
 private:

@@ -5,20 +5,21 @@
 
 namespace spectrel {
 
-LTELogGenerator::LTELogGenerator()
+LTELogGenerator::LTELogGenerator(const Context& context)
+    : ZPHLogGenerator2(context)
 {
-    SPECTREL_LOG(Priority::Error, "Creating LTELogGenerator object");
-    initWithPListName("LTE", std::make_shared<LTEClassIndex>());
+    SPECTREL_LOG(log(), Priority::Error, "Creating LTELogGenerator object");
+    initWithPListName("LTE", std::make_shared<LTEClassIndex>(context));
 }
 
 LTELogGenerator::~LTELogGenerator()
 {
-    SPECTREL_LOG(Priority::Warning, "LTELogGenerator is destructed %p", static_cast<void*>(this));
+    SPECTREL_LOG(log(), Priority::Warning, "LTELogGenerator is destructed %p", static_cast<void*>(this));
 }
 
-std::unique_ptr<LTELogGenerator> LTELogGenerator::generator()
+std::unique_ptr<LTELogGenerator> LTELogGenerator::generator(const Context& context)
 {
-    return std::make_unique<LTELogGenerator>();
+    return std::make_unique<LTELogGenerator>(context);
 }
 
 std::string_view LTELogGenerator::className() const

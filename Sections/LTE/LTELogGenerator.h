@@ -7,10 +7,10 @@ namespace spectrel {
 /// LTE: template "LTE".
 class LTELogGenerator final : public ZPHLogGenerator2 {
 public:
-    LTELogGenerator();
+    explicit LTELogGenerator(const Context& context);
     ~LTELogGenerator() override;
 
-    static std::unique_ptr<LTELogGenerator> generator();
+    static std::unique_ptr<LTELogGenerator> generator(const Context& context);
     std::string_view className() const override;
 };
 

@@ -33,7 +33,7 @@ class SimInfo final : public SectionOf<SimInfo> {
     /// parse raises `LogCode_0xFF0000::UnknownDataException`.
     void storeFiles(RecordView record)
     {
-        const LogCode_0xFF0000 files(record, payloads());
+        const LogCode_0xFF0000 files(record, payloads(), log());
         for (const SimFile& file : SimFiles) {
             if (const Value& content = files[file.payloadKey]; !content.isAbsent())
                 store(file.displayKey, content);

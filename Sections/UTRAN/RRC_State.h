@@ -1,7 +1,6 @@
 #pragma once
 
 #include "LogGenerator/Template/RecordSection.h"
-#include "Platform/DiagnosticLog.h"
 #include "Values/Description.h"
 
 #include <string>
@@ -23,13 +22,13 @@ class RRC_State final : public SectionOf<RRC_State> {
     void storeMode(RecordView record)
     {
         if (record.size() < ExpectedLength)
-            SPECTREL_LOG(Priority::Warning, "LogCode_0xD0E0 is length is %ld expected size %ld",
+            SPECTREL_LOG(log(), Priority::Warning, "LogCode_0xD0E0 is length is %ld expected size %ld",
                 static_cast<long>(record.size()), static_cast<long>(ExpectedLength));
         const std::uint8_t mode = record.u8(13) == Valid ? record.u8(14) : NoMode;
         const std::string_view name = textOf(Modes, mode);
         storeText("State", name);
-        if (DiagnosticLog* const log = DiagnosticLog::installed())
-            log->write("Display Dict = " + describe(displayed()) + ", rrc mode = " + std::to_string(mode) + " "
+        if (DiagnosticLog* const diagnostics = diagnosticLog())
+            diagnostics->write("Display Dict = " + describe(displayed()) + ", rrc mode = " + std::to_string(mode) + " "
                 + std::string(name));
     }
 

@@ -13,6 +13,9 @@ namespace spectrel {
 /// The sections of a UTRAN baseband, in the order of creation and so of delivery. Unlike the other indexes it prints no
 /// line of its own when it goes.
 class UTRANClassIndex final : public ClassIndex {
+public:
+    using ClassIndex::ClassIndex;
+
 private:
     RRC_State rrc_state {*this};
     UTRANServingCellInfo servingCellInfo {*this};

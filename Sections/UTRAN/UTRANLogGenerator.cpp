@@ -1,6 +1,5 @@
 #include "Sections/UTRAN/UTRANLogGenerator.h"
 
-#include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
 #include "Sections/UTRAN/UTRANClassIndex.h"
 
@@ -21,19 +20,20 @@ bool containsUTRAN(const std::string& path)
 
 } // namespace
 
-UTRANLogGenerator::UTRANLogGenerator()
+UTRANLogGenerator::UTRANLogGenerator(const Context& context)
+    : ZPHLogGenerator2(context)
 {
-    const auto paths = Resources::installed().propertyListPaths();
+    const auto paths = context.resources.propertyListPaths();
     const auto path = std::ranges::find_if(paths, containsUTRAN);
     if (path == paths.end())
         return;
-    initWithPListName(std::filesystem::path(*path).stem().string(), std::make_shared<UTRANClassIndex>());
-    SPECTREL_LOG(Priority::Error, "Created UTRANLogGenerator object");
+    initWithPListName(std::filesystem::path(*path).stem().string(), std::make_shared<UTRANClassIndex>(context));
+    SPECTREL_LOG(log(), Priority::Error, "Created UTRANLogGenerator object");
 }
 
-std::unique_ptr<UTRANLogGenerator> UTRANLogGenerator::generator()
+std::unique_ptr<UTRANLogGenerator> UTRANLogGenerator::generator(const Context& context)
 {
-    return std::make_unique<UTRANLogGenerator>();
+    return std::make_unique<UTRANLogGenerator>(context);
 }
 
 std::string_view UTRANLogGenerator::className() const

@@ -8,9 +8,9 @@ namespace spectrel {
 /// generator stays uninitialised: it asks for no codes, routes no record and builds no display.
 class UTRANLogGenerator final : public ZPHLogGenerator2 {
 public:
-    UTRANLogGenerator();
+    explicit UTRANLogGenerator(const Context& context);
 
-    static std::unique_ptr<UTRANLogGenerator> generator();
+    static std::unique_ptr<UTRANLogGenerator> generator(const Context& context);
     std::string_view className() const override;
 };
 

@@ -14,8 +14,7 @@ namespace {
 
 using Activity = CDMAActivity;
 
-constexpr std::uint8_t BandClass = 1; // 1.8 to 2.0 GHz
-constexpr std::uint16_t OneXChannel = 425;
+using CDMACarriers::BandClass;
 
 /// What stands in one subpacket, without its head.
 struct Subpacket {
@@ -61,8 +60,8 @@ std::uint8_t gainOf(double power)
 Bytes rfContent(const CDMAReport& report)
 {
     Bytes content {BandClass, BandClass};
-    append16(content, OneXChannel);
-    append16(content, OneXChannel);
+    append16(content, CDMACarriers::OneX);
+    append16(content, CDMACarriers::OneX);
     content.push_back(gainOf(report.received));
     content.push_back(gainOf(report.receivedBySecond));
     append16(content, static_cast<std::uint16_t>(std::lround(report.transmitted * 10)));
@@ -203,11 +202,10 @@ Bytes cdmaFrameRecord(const CDMAReport& report, Moment time)
 
 Bytes evdoAirLinkRecord(const CDMAReport& report, Moment time)
 {
-    constexpr std::uint16_t Channel = 325;
     constexpr std::uint8_t SessionOpen = 4;
     constexpr std::uint32_t UATI = 0x0A4C17; // low 24 bits of the terminal's address
     return RecordWriter(0x1183, time)
-        .u16(BandClass << 11 | Channel)
+        .u16(BandClass << 11 | CDMACarriers::EVDO)
         .u8(wholePower(report.received))
         .u8(wholePower(report.receivedBySecond))
         .u8(wholePower(report.transmitted))

@@ -10,6 +10,13 @@ namespace spectrel {
 /// What a phone that can do one thing at a time does: 1x while it talks, EV-DO while it has data to move.
 enum class CDMAActivity : std::uint8_t { Idle, DataSetup, Data, Voice };
 
+/// The network's carriers, in the band class of 1.8 to 2.0 GHz (3GPP2 C.S0057, 2.1.2).
+namespace CDMACarriers {
+constexpr std::uint8_t BandClass = 1;
+constexpr std::uint16_t OneX = 425;
+constexpr std::uint16_t EVDO = 325;
+} // namespace CDMACarriers
+
 /// What a sector of a CDMA2000 site broadcasts about itself, on its 1x and its EV-DO carrier.
 struct CDMASystem {
     std::uint16_t pn = 0; // offset of its pilot in units of 64 chips, 0 to 511

@@ -3,6 +3,7 @@
 #include "Platform/Clock.h"
 #include "Records/Recording.h"
 #include "Telephony/Simulator/Journey.h"
+#include "Telephony/Simulator/Move.h"
 #include "Values/Bytes.h"
 
 #include <chrono>
@@ -25,6 +26,8 @@ public:
     virtual void greet(Moment now, const Emit& emit) const = 0;
     /// Moves by one step and reports what is due then, stamped with `now`.
     virtual void advance(Moment now, const Emit& emit) = 0;
+    /// What its world decided in the last step; before the first step, where it began.
+    virtual std::span<const Move> moves() const = 0;
 };
 
 /// One kind of record and how often it comes.
@@ -36,8 +39,8 @@ template <typename World> struct Cadence {
 
 /// A baseband whose records come steadily. The same seed gives the same drive.
 ///
-/// `World` is built from a scene and a seed and has `advance(std::chrono::milliseconds)`. Records within a step come in
-/// the order of the cadences; one that `make` leaves empty is not sent.
+/// `World` is built from a scene and a seed and has `advance(std::chrono::milliseconds)` and `moves()`. Records within
+/// a step come in the order of the cadences; one that `make` leaves empty is not sent.
 template <typename World> class SteadyBaseband final : public Baseband {
 public:
     /// `cadences` outlive the baseband.
@@ -68,6 +71,11 @@ public:
             if (_everyStep || _elapsed % cadence.interval == std::chrono::milliseconds::zero())
                 report(cadence, now, emit);
         }
+    }
+
+    std::span<const Move> moves() const override
+    {
+        return _world.moves();
     }
 
 private:

@@ -2,7 +2,8 @@
 
 namespace spectrel {
 
-Outcome writeSimulatedRecording(Baseband& baseband, const std::string& path, std::chrono::milliseconds duration)
+Outcome writeSimulatedRecording(
+    Baseband& baseband, const std::string& path, std::chrono::milliseconds duration, const MoveHandler& onMove)
 {
     const auto created = createRecording(path, baseband.technology());
     if (!created)
@@ -14,10 +15,18 @@ Outcome writeSimulatedRecording(Baseband& baseband, const std::string& path, std
         if (written)
             written = writer.write(now, record);
     };
+    const auto report = [&] {
+        for (const Move& move : baseband.moves()) {
+            if (onMove)
+                onMove(now, move);
+        }
+    };
     baseband.greet(now, write);
+    report();
     while (written && now + Baseband::Step <= SimulatedRecordingStart + duration) {
         now += Baseband::Step;
         baseband.advance(now, write);
+        report();
     }
     return written ? writer.flush() : written;
 }

@@ -4,6 +4,7 @@
 #include "Values/Result.h"
 
 #include <chrono>
+#include <functional>
 #include <string>
 
 namespace spectrel {
@@ -12,7 +13,11 @@ namespace spectrel {
 /// 2026-01-01 08:00:00 UTC.
 constexpr Moment SimulatedRecordingStart {std::chrono::seconds(1767254400)};
 
+/// Hears of each move that the simulated world decides, at the time of the decision.
+using MoveHandler = std::function<void(Moment time, const Move& move)>;
+
 /// Writes as much of the baseband's life into a capture file as `duration` says, without waiting.
-Outcome writeSimulatedRecording(Baseband& baseband, const std::string& path, std::chrono::milliseconds duration);
+Outcome writeSimulatedRecording(
+    Baseband& baseband, const std::string& path, std::chrono::milliseconds duration, const MoveHandler& onMove = {});
 
 } // namespace spectrel

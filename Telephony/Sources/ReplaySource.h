@@ -31,7 +31,7 @@ struct ReplayOptions {
 /// it goes on at once.
 class ReplaySource final : public LogSource {
 public:
-    /// Fails, naming the file, when one cannot be read, does not tell its technology, or tells another one than the
+    /// Fails, naming the file, when one cannot be read, does not name its technology, or names another one than the
     /// first.
     static Result<std::unique_ptr<LogSource>> open(RunLoop& runLoop, const Clock& clock, ReplayOptions options);
 

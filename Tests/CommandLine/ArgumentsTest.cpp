@@ -78,7 +78,7 @@ TEST(ReadArgumentsTest, DecodeTakesItsOptions)
         std::nullopt);
     EXPECT_EQ(arguments.job, Job::Decode);
     EXPECT_EQ(arguments.decode.files, (std::vector<std::string> {"a.pcap", "b.dlf"}));
-    EXPECT_EQ(arguments.decode.format, OutputFormat::Json);
+    EXPECT_EQ(arguments.decode.output.format, OutputFormat::Json);
     EXPECT_TRUE(arguments.decode.each);
     EXPECT_TRUE(arguments.decode.keepGoing);
     EXPECT_EQ(arguments.decode.technology, Technology::UTRAN);
@@ -90,7 +90,7 @@ TEST(ReadArgumentsTest, WatchEndsAfterACountOrATime)
     Arguments arguments;
     EXPECT_EQ(read({"watch", "--format", "changes", "--count", "3", "--duration", "2m"}, arguments), std::nullopt);
     EXPECT_EQ(arguments.job, Job::Watch);
-    EXPECT_EQ(arguments.watch.format, OutputFormat::Changes);
+    EXPECT_EQ(arguments.watch.output.format, OutputFormat::Changes);
     EXPECT_EQ(arguments.watch.count, 3u);
     EXPECT_EQ(arguments.watch.duration, std::chrono::minutes(2));
 }
@@ -103,6 +103,21 @@ TEST(ReadArgumentsTest, ViewTakesAFileItsTechnologyAndTheScreens)
     EXPECT_EQ(arguments.screens, ScreenChoice::Terminal);
     EXPECT_EQ(arguments.view.file, "a.dlf");
     EXPECT_EQ(arguments.view.technology, Technology::LTE);
+}
+
+TEST(ReadArgumentsTest, ChannelTakesANumberOrAFrequency)
+{
+    Arguments arguments;
+    EXPECT_EQ(read({"channel", "gsm", "600", "--band", "PCS 1900", "--format", "json"}, arguments), std::nullopt);
+    EXPECT_EQ(arguments.job, Job::Channel);
+    EXPECT_EQ(arguments.channel.technology, ChannelTechnology::GSM);
+    EXPECT_EQ(arguments.channel.number, 600u);
+    EXPECT_EQ(arguments.channel.band, "PCS 1900");
+    EXPECT_EQ(arguments.channel.format, ChannelFormat::Json);
+    Arguments frequency;
+    EXPECT_EQ(read({"channel", "cdma", "--mhz", "881.52"}, frequency), std::nullopt);
+    EXPECT_EQ(frequency.channel.mhz, 881.52);
+    EXPECT_EQ(frequency.channel.number, std::nullopt);
 }
 
 /// What is told on standard error about the words, which are wrong usage.
@@ -136,6 +151,34 @@ TEST(ReadArgumentsTest, EmptyNameOfAFileOrFolderIsWrongUsage)
     EXPECT_EQ(complaintAbout({"--resources", ""}), "spectrel: --resources: '' names no folder (see spectrel --help)\n");
 }
 
+TEST(ReadArgumentsTest, PathsAndColumnsSayWhatIsPrinted)
+{
+    Arguments arguments;
+    EXPECT_EQ(read({"watch", "--path", "/A/*", "--path", "**/B", "--format", "csv"}, arguments), std::nullopt);
+    EXPECT_EQ(arguments.watch.output.paths, (std::vector<std::string> {"/A/*", "**/B"}));
+    EXPECT_EQ(read({"decode", "--path", "/A", "a.pcap"}, arguments), std::nullopt);
+    EXPECT_EQ(arguments.decode.output.paths, (std::vector<std::string> {"/A"}));
+    EXPECT_EQ(arguments.decode.files, (std::vector<std::string> {"a.pcap"}));
+    Arguments table;
+    EXPECT_EQ(read({"decode", "--format", "table", "--columns", "/A/B=b,/C", "a.pcap"}, table), std::nullopt);
+    ASSERT_EQ(table.decode.output.columns.size(), 2u);
+    EXPECT_EQ(table.decode.output.columns[0].path, "/A/B");
+    EXPECT_EQ(table.decode.output.columns[0].name, "b");
+}
+
+TEST(ReadArgumentsTest, TableAndItsColumnsComeTogether)
+{
+    EXPECT_EQ(complaintAbout({"watch", "--format", "table"}),
+        "spectrel: --format: table needs --columns (see spectrel --help)\n");
+    EXPECT_EQ(complaintAbout({"watch", "--columns", "/A"}),
+        "spectrel: --columns: goes with --format table only (see spectrel --help)\n");
+    EXPECT_EQ(complaintAbout({"watch", "--format", "table", "--columns", "/A", "--path", "/A"}),
+        "spectrel: --path: a table has its --columns (see spectrel --help)\n");
+    EXPECT_EQ(complaintAbout({"watch", "--format", "table", "--columns", "/A,"}),
+        "spectrel: --columns: '/A,' is no list of columns PATH[=NAME],... (see spectrel --help)\n");
+    EXPECT_EQ(complaintAbout({"watch", "--path", ""}), "spectrel: --path: '' is no path (see spectrel --help)\n");
+}
+
 TEST(ReadArgumentsTest, StandardOutputTakesNoOptionOfSeveralFiles)
 {
     for (const auto& [option, value] : std::vector<std::pair<const char*, const char*>> {
@@ -148,7 +191,7 @@ TEST(ReadArgumentsTest, StandardOutputTakesNoOptionOfSeveralFiles)
 
 TEST(ReadArgumentsTest, EveryCommandTellsHelpAndVersion)
 {
-    for (const char* command : {"watch", "decode", "view", "record"}) {
+    for (const char* command : {"watch", "decode", "view", "record", "channel"}) {
         for (const char* option : {"--help", "--version"}) {
             Arguments arguments;
             testing::internal::CaptureStdout();
@@ -162,7 +205,8 @@ TEST(ReadArgumentsTest, WrongUsageIsStatus2)
 {
     for (const std::vector<const char*>& words : std::vector<std::vector<const char*>> {{"--gui", "--terminal"},
              {"play"}, {"watch", "--count", "0"}, {"watch", "--duration", "soon"}, {"record"}, {"decode"}, {"view"},
-             {"view", "a", "b"}, {"view", "--gui", "--terminal", "a"}, {"view", "--technology", "5g", "a"}}) {
+             {"view", "a", "b"}, {"channel"}, {"channel", "lte"}, {"channel", "lte", "-1"},
+             {"view", "--gui", "--terminal", "a"}, {"view", "--technology", "5g", "a"}}) {
         Arguments arguments;
         EXPECT_EQ(read(words, arguments), ExitStatus::WrongUsage) << words.front();
     }

@@ -172,5 +172,24 @@ TEST_F(DisplayChangesTest, ReorderedKeysCostAFewComparisonsEach)
     }
 }
 
+TEST_F(DisplayChangesTest, OnlyChosenLeavesAreReported)
+{
+    changes = DisplayChanges(PathChoice({"/A/*", "**/z"}));
+    const auto inner = Dictionary::make({{"x", "1"}, {"y", "2"}});
+    const auto display = Dictionary::make({{"A", inner}, {"B", Dictionary::make({{"x", "3"}, {"z", "4"}})}});
+    EXPECT_EQ(update(display), "/A/x=1\n/A/y=2\n/B/z=4\n");
+    inner->setText("x", "9");
+    display->setText("C", "new");
+    EXPECT_EQ(update(display), "/A/x=9\n");
+    display->set("A", "leaf"); // which no glob chooses
+    EXPECT_EQ(update(display), "/A/x gone\n/A/y gone\n");
+    display->set("A", Dictionary::make({{"x", "7"}}));
+    EXPECT_EQ(update(display), "/A/x=7\n");
+    display->remove("B");
+    EXPECT_EQ(update(display), "/B/z gone\n");
+    EXPECT_EQ(update({}), "/A/x gone\n");
+    EXPECT_EQ(update(display), "/A/x=7\n");
+}
+
 } // namespace
 } // namespace spectrel

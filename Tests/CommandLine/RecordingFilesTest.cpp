@@ -6,6 +6,7 @@
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <unistd.h>
 
 namespace spectrel {
 namespace {
@@ -111,10 +112,73 @@ TEST_F(RecordingFilesTest, FurtherFilesOverwriteNothing)
 {
     scratch.write("a.pcap", "old");
     scratch.write("a-2.pcap", "mine");
-    auto files = open({scratch.file("a.pcap"), {}, 1s, {}});
+    auto files = open({scratch.file("a.pcap"), {}, 1s, {}, true});
     write(files, 2);
     EXPECT_EQ(files.path(), scratch.file("a-3.pcap"));
     EXPECT_EQ(std::filesystem::file_size(scratch.file("a-2.pcap")), 4u);
+}
+
+TEST_F(RecordingFilesTest, FileThatIsThereIsLeftAloneUnlessItMayBeOverwritten)
+{
+    scratch.write("a.pcap", "mine");
+    RecordingFiles refused({scratch.file("a.pcap"), {}, {}, {}});
+    const auto prepared = refused.prepare();
+    ASSERT_FALSE(prepared);
+    EXPECT_EQ(prepared.failure().text, scratch.file("a.pcap") + ": is there already (--overwrite writes over it)");
+    EXPECT_EQ(scratch.read("a.pcap"), "mine");
+    auto files = open({scratch.file("a.pcap"), {}, {}, {}, true});
+    write(files, 2);
+    EXPECT_THAT(contents(scratch.path().string()), ElementsAre("a.pcap: 2"));
+}
+
+TEST_F(RecordingFilesTest, FileThatHasComeInTheMeantimeIsLeftAlone)
+{
+    auto files = open({scratch.file("a.pcap"), {}, {}, {}});
+    scratch.write("a.pcap", "mine");
+    EXPECT_FALSE(files.begin(Technology::LTE, time));
+    EXPECT_EQ(scratch.read("a.pcap"), "mine");
+}
+
+TEST_F(RecordingFilesTest, PlantedLinksAreNotFollowed)
+{
+    scratch.write("victim", "text");
+    std::filesystem::create_symlink("victim", scratch.file("a.pcap"));
+    std::filesystem::create_symlink("victim", scratch.file(".b.pcap-" + std::to_string(::getpid())));
+    RecordingFiles linked({scratch.file("a.pcap"), {}, {}, {}, true});
+    EXPECT_TRUE(linked.prepare());
+    const auto begun = linked.begin(Technology::LTE, time);
+    ASSERT_FALSE(begun);
+    EXPECT_EQ(begun.failure().text, scratch.file("a.pcap") + ": it is a link, and links are not followed");
+    auto files = open({scratch.file("b.pcap"), {}, {}, {}});
+    write(files, 1);
+    EXPECT_EQ(scratch.read("victim"), "text");
+    EXPECT_EQ(std::filesystem::status(scratch.file("b.pcap")).permissions(), std::filesystem::perms(0600));
+}
+
+TEST_F(RecordingFilesTest, FileThatAnotherRecorderWritesIsNeitherOverwrittenNorRemoved)
+{
+    auto one = open({scratch.path().string(), {}, {}, {}});
+    write(one, 1);
+    auto other = open({scratch.path().string(), {}, 1s, 2});
+    write(other, 4);
+    write(one, 1);
+    EXPECT_THAT(contents(scratch.path().string()),
+        ElementsAre("spectrel-000001-lte.pcap: 2", "spectrel-000004-lte.pcap: 1", "spectrel-000005-lte.pcap: 1"));
+    RecordingFiles third({one.path(), {}, {}, {}, true});
+    const auto begun = third.begin(Technology::LTE, time);
+    ASSERT_FALSE(begun);
+    EXPECT_EQ(begun.failure().text, one.path() + ": another program is writing it");
+    EXPECT_THAT(contents(scratch.path().string()), testing::Contains("spectrel-000001-lte.pcap: 2"));
+}
+
+TEST_F(RecordingFilesTest, HighestNumberIsNotCountedBeyond)
+{
+    const std::string highest = scratch.write("spectrel-18446744073709551615-lte.pcap", "old");
+    auto files = open({scratch.path().string(), {}, 1s, 2});
+    const auto written = files.write(Technology::LTE, time, RecordBuilder(0xB0C2, 13));
+    ASSERT_FALSE(written);
+    EXPECT_EQ(written.failure().text, highest + ": has the highest number that there is; no file can follow it");
+    EXPECT_EQ(scratch.read("spectrel-18446744073709551615-lte.pcap"), "old");
 }
 
 TEST_F(RecordingFilesTest, OnlyTheLastFilesAreKept)

@@ -73,9 +73,51 @@ class Simulate(Place):
             self.assertEqual((done.returncode, done.stderr),
                              (1, "spectrel-telephonyd: /dev/full: No space left on device\n"))
 
+    def truth(self, name, *arguments):
+        self.written(name, *arguments, "--truth", self.path(name + ".truth"))
+        with open(self.path(name + ".truth"), encoding="utf-8") as file:
+            return [json.loads(line) for line in file]
+
+    def test_truth_names_each_move_and_its_cause(self):
+        kinds = {"reselection", "handover", "redirection", "service-lost"}
+        rules = {"higher-priority", "equal-priority", "lower-priority", "not-suitable"}
+        for technology in TECHNOLOGIES:
+            with self.subTest(technology=technology):
+                moves = self.truth("a.pcap", "--simulate", technology, "--seed", "4", "--duration", "20m")
+                times = [move["time"] for move in moves]
+                self.assertEqual(times, sorted(times))
+                first, *others = [move for move in moves if move["to"]["technology"] != "evdo"]
+                self.assertEqual(set(first), {"time", "to"})
+                self.assertTrue(others)
+                for previous, move in zip([first, *others], others):
+                    self.assertEqual(list(move), ["time", "from", "to", "cause"])
+                    self.assertEqual(list(move["to"]), ["technology", "channel", "id", "cell"])
+                    self.assertEqual(move["from"], previous["to"])
+                    self.assertIn(move["cause"]["kind"], kinds)
+                    if move["cause"]["kind"] == "reselection":
+                        self.assertIn(move["cause"]["rule"], rules)
+                    else:
+                        self.assertNotIn("rule", move["cause"])
+
+    def test_truth_leaves_the_recording_as_it_is(self):
+        options = ("--simulate", "gsm", "--duration", "2m")
+        plain = self.written("a.pcap", *options)
+        self.assertEqual(self.written("b.pcap", *options, "--truth", self.path("truth")), plain)
+
+    def test_truth_that_cannot_be_written_is_named(self):
+        options = ("--simulate", "lte", "--write", self.path("a.pcap"), "--truth")
+        done = self.service(*options, self.path("no", "such", "folder"))
+        self.assertEqual((done.returncode, done.stderr),
+                         (1, f"spectrel-telephonyd: {self.path('no', 'such', 'folder')}: No such file or directory\n"))
+        if os.path.exists("/dev/full"):
+            done = self.service(*options, "/dev/full")
+            self.assertEqual((done.returncode, done.stderr),
+                             (1, "spectrel-telephonyd: /dev/full: No space left on device\n"))
+
     def test_wrong_use_is_told(self):
         for arguments in (["--simulate", "lte", "--scene", "fly"], ["--write", "a.pcap"],
                           ["--simulate", "lte", "--duration", "5m"],
+                          ["--simulate", "lte", "--truth", "a.truth"],
                           ["--simulate", "lte", "--write", "a", "--duration", "soon"],
                           ["--simulate", "lte", "--write", "a", "--rate", "2"]):
             with self.subTest(arguments=arguments):

@@ -7,17 +7,9 @@
 
 namespace spectrel {
 
-/// Templates within one test, by name. Installs itself.
+/// Templates within one test, by name.
 class FakeResources final : public Resources {
 public:
-    FakeResources()
-    {
-        Resources::install(this);
-    }
-    ~FakeResources() override
-    {
-        Resources::install(nullptr);
-    }
     std::optional<Value> propertyList(std::string_view name) const override
     {
         const auto found = lists.find(std::string(name));

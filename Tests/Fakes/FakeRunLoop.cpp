@@ -20,16 +20,6 @@ struct FakeRunLoop::RepeatingTimer final : Timer {
     std::shared_ptr<bool> alive;
 };
 
-FakeRunLoop::FakeRunLoop()
-{
-    Clock::install(this);
-}
-
-FakeRunLoop::~FakeRunLoop()
-{
-    Clock::install(nullptr);
-}
-
 void FakeRunLoop::async(Job job)
 {
     _queue.push_back(std::move(job));

@@ -11,13 +11,10 @@
 
 namespace spectrel {
 
-/// Virtual time: a clock and a run loop that move only when told. Installs itself as the clock.
+/// Virtual time: a clock and a run loop that move only when told.
 class FakeRunLoop final : public RunLoop, public Clock {
 public:
     static constexpr Moment Start {std::chrono::microseconds(1'709'647'651'000'000)}; // 2024-03-05 14:07:31 +0000
-
-    FakeRunLoop();
-    ~FakeRunLoop() override;
 
     void async(Job job) override;
     void after(std::chrono::nanoseconds delay, Job job) override;

@@ -5,15 +5,8 @@
 namespace spectrel {
 
 LogRecorder::LogRecorder(int leastUrgent)
+    : SystemLog(leastUrgent)
 {
-    SystemLog::install(this, leastUrgent);
-    Console::install(this);
-}
-
-LogRecorder::~LogRecorder()
-{
-    SystemLog::install(nullptr, -1);
-    Console::install(nullptr);
 }
 
 void LogRecorder::write(int priority, std::string_view text)

@@ -1,17 +1,20 @@
 #pragma once
 
-#include "Platform/Console.h"
-#include "Platform/SystemLog.h"
+#include "Platform/Context.h"
 
 #include <string>
 
 namespace spectrel {
 
-/// Installs itself as the system log and as the console and keeps what comes, as text: "<3>line\n".
+/// A system log and a console that keep what comes, as text: "<3>line\n".
 class LogRecorder final : public SystemLog, public Console {
 public:
     explicit LogRecorder(int leastUrgent = 7);
-    ~LogRecorder() override;
+    /// One in which it is both.
+    Context context()
+    {
+        return {.log = *this, .console = *this};
+    }
 
     void write(int priority, std::string_view text) override;
     void line(std::string_view text) override;

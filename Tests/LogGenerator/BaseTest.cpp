@@ -17,9 +17,10 @@ namespace {
 /// A section that writes down what it is given.
 class Scribe final : public Base {
 public:
-    Scribe(ClassDictionary& dict, CodeDictionary& codeDict, std::string name, std::vector<std::uint32_t> codes,
-        std::string& diary)
-        : _name(std::move(name))
+    Scribe(const Context& context, ClassDictionary& dict, CodeDictionary& codeDict, std::string name,
+        std::vector<std::uint32_t> codes, std::string& diary)
+        : Base(context)
+        , _name(std::move(name))
         , _codes(std::move(codes))
         , _diary(diary)
     {
@@ -48,9 +49,10 @@ private:
 
 class ScribeIndex final : public ClassIndex {
 public:
-    explicit ScribeIndex(std::string& diary)
-        : first(classDict, codeDictionary, "First", {20984, 0xFF0C00}, diary)
-        , second(classDict, codeDictionary, "Second", {20984, 5, 5}, diary)
+    ScribeIndex(const Context& given, std::string& diary)
+        : ClassIndex(given)
+        , first(context, classDict, codeDictionary, "First", {20984, 0xFF0C00}, diary)
+        , second(context, classDict, codeDictionary, "Second", {20984, 5, 5}, diary)
     {
     }
     Scribe first;
@@ -68,7 +70,7 @@ protected:
     }
     LogRecorder log;
     std::string diary;
-    ScribeIndex index {diary};
+    ScribeIndex index {log.context(), diary};
 };
 
 TEST_F(SectionObjectsTest, SectionsOfOneCodeAreCalledInTheOrderOfTheirCreation)
@@ -139,7 +141,7 @@ TEST(ClassIndexTest, DestructionWritesOneLineToTheConsole)
 {
     LogRecorder log;
     {
-        const ClassIndex index;
+        const ClassIndex index(log.context());
     }
     EXPECT_EQ(log.takeConsole(), "Deallocing ClassIndex\n");
 }

@@ -46,7 +46,7 @@ protected:
 TEST_F(HistoryTest, StateWithoutHistoryGainsOneEntry)
 {
     fillState();
-    LogGenerator::updateHistoryInState(state);
+    LogGenerator::updateHistoryInState(state, time);
     ASSERT_EQ(history().count(), 1u);
     EXPECT_EQ(displayText(history()[0]),
         "{\"DisplayState\": data 0102, \"Display\": {\"Cell\": \"1\"}, \"ExtraInfo\": {}, "
@@ -57,7 +57,7 @@ TEST_F(HistoryTest, FourEntriesGainAFifthWithoutLosingAny)
 {
     fillHistory(4);
     fillState();
-    LogGenerator::updateHistoryInState(state);
+    LogGenerator::updateHistoryInState(state, time);
     EXPECT_EQ(history().count(), 5u);
     EXPECT_EQ(numberAt(0), "\"0\"");
 }
@@ -66,7 +66,7 @@ TEST_F(HistoryTest, FiveEntriesLoseTheOldestForTheNewOne)
 {
     fillHistory(5);
     fillState();
-    LogGenerator::updateHistoryInState(state);
+    LogGenerator::updateHistoryInState(state, time);
     EXPECT_EQ(history().count(), 5u);
     EXPECT_EQ(numberAt(0), "\"1\"");
 }
@@ -75,7 +75,7 @@ TEST_F(HistoryTest, NineEntriesAreCutToTheNewestFourAndTheNewOne)
 {
     fillHistory(9);
     fillState();
-    LogGenerator::updateHistoryInState(state);
+    LogGenerator::updateHistoryInState(state, time);
     EXPECT_EQ(history().count(), 5u);
     EXPECT_EQ(numberAt(0), "\"5\"");
     EXPECT_EQ(numberAt(3), "\"8\"");
@@ -86,7 +86,7 @@ TEST_F(HistoryTest, AbsentDisplayStateAppendsAnEmptyEntry)
 {
     fillState();
     state.remove(StateKey::DisplayState);
-    LogGenerator::updateHistoryInState(state);
+    LogGenerator::updateHistoryInState(state, time);
     EXPECT_EQ(displayText(history()[0]), "{}");
 }
 
@@ -94,7 +94,7 @@ TEST_F(HistoryTest, AbsentDisplayEndsTheEntryAfterDisplayState)
 {
     fillState();
     state.remove(StateKey::Display);
-    LogGenerator::updateHistoryInState(state);
+    LogGenerator::updateHistoryInState(state, time);
     EXPECT_EQ(displayText(history()[0]), "{\"DisplayState\": data 0102}");
 }
 
@@ -102,7 +102,7 @@ TEST_F(HistoryTest, AbsentExtraInfoEndsTheEntryAfterDisplay)
 {
     fillState();
     state.remove(StateKey::ExtraInfo);
-    LogGenerator::updateHistoryInState(state);
+    LogGenerator::updateHistoryInState(state, time);
     EXPECT_EQ(displayText(history()[0]), "{\"DisplayState\": data 0102, \"Display\": {\"Cell\": \"1\"}}");
 }
 
@@ -111,7 +111,7 @@ TEST_F(HistoryTest, OnlyTheTopLevelOfTheDisplayIsCopied)
     auto nested = Dictionary::make({{"RSRP", "-90"}});
     display->set("Nested", nested);
     fillState();
-    LogGenerator::updateHistoryInState(state);
+    LogGenerator::updateHistoryInState(state, time);
     display->set("Cell", "2");
     nested->set("RSRP", "-80");
     const auto& kept = (*history()[0].dictionary())["Display"];
@@ -122,11 +122,12 @@ class TechnologyTest : public testing::Test {
 protected:
     std::string generatorFor(const Value& technology)
     {
-        const auto generator = LogGenerator::generatorFromTechnology(technology);
+        const auto generator = LogGenerator::generatorFromTechnology(technology, context);
         return generator ? std::string(generator->className()) : "none";
     }
     LogRecorder log;
     FakeResources resources;
+    const Context context {.resources = resources, .log = log, .console = log};
 };
 
 TEST_F(TechnologyTest, EachKnownTechnologyHasItsGenerator)
@@ -151,7 +152,7 @@ TEST_F(TechnologyTest, NumberHasNoGenerator)
 TEST_F(TechnologyTest, CreationIsLoggedInOrder)
 {
     log.takeLog();
-    const auto generator = LogGenerator::generatorFromTechnology(kRKLogChannelTechnology_Zephyr_LTE);
+    const auto generator = LogGenerator::generatorFromTechnology(kRKLogChannelTechnology_Zephyr_LTE, context);
     const std::string text = log.takeLog();
     const auto created = text.find("<3>Creating LTELogGenerator object\n");
     const auto withIndex = text.find("<3>Creating ZPHLogGenerator2 object with 0x");
@@ -166,13 +167,13 @@ TEST_F(TechnologyTest, CreationIsLoggedInOrder)
 
 TEST_F(TechnologyTest, DestructionIsLoggedByTheClassAndItsBase)
 {
-    LogGenerator::generatorFromTechnology(kRKLogChannelTechnology_Zephyr_LTE);
+    LogGenerator::generatorFromTechnology(kRKLogChannelTechnology_Zephyr_LTE, context);
     std::string text = log.takeLogWith("destructed");
     EXPECT_EQ(text.find("<4>LTELogGenerator is destructed 0x"), 0u);
     EXPECT_NE(text.find("\n<4>ZPH_GSMLogGenerator is destructed 0x"), std::string::npos);
     EXPECT_EQ(log.takeConsole(), "Deallocing LTEClassIndex\nDeallocing ClassIndex\n");
 
-    LogGenerator::generatorFromTechnology(kRKLogChannelTechnology_Zephyr_GSM);
+    LogGenerator::generatorFromTechnology(kRKLogChannelTechnology_Zephyr_GSM, context);
     text = log.takeLogWith("ZPH_GSMLogGenerator is destructed");
     EXPECT_EQ(std::count(text.begin(), text.end(), '\n'), 2);
 }
@@ -186,7 +187,7 @@ protected:
     }
     void use(std::string_view technology, bool hasUnbuiltMessages = false)
     {
-        slot.replace(LogGenerator::generatorFromTechnology(technology), state, hasUnbuiltMessages);
+        slot.replace(LogGenerator::generatorFromTechnology(technology, context), state, hasUnbuiltMessages);
     }
     void receive()
     {
@@ -197,6 +198,7 @@ protected:
     FakeRunLoop time;
     LogRecorder log;
     FakeResources resources;
+    const Context context {.resources = resources, .log = log, .console = log};
     Dictionary state;
     GeneratorSlot slot;
 };

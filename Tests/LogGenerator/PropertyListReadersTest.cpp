@@ -70,10 +70,10 @@ TEST_F(PropertyListReadersTest, EveryReaderTellsOfAPayloadThatDoesNotParse)
     const Bytes garbage {'<', 'x', '>'};
     const RecordBuilder record = RecordBuilder::withPayload(CellInfoArrayReader::Code, garbage);
     for (int reader = 0; reader < 2; ++reader) {
-        EXPECT_FALSE(CellInfoArrayReader(RecordView(record), payloads).holdsAnything());
+        EXPECT_FALSE(CellInfoArrayReader(RecordView(record), payloads, log).holdsAnything());
         EXPECT_EQ(log.takeLog(), "<3>Cell Info Array data could not be constructed\n");
     }
-    EXPECT_THROW((LogCode_0xFF0000 {RecordView(record), payloads}), LogCode_0xFF0000::UnknownDataException);
+    EXPECT_THROW((LogCode_0xFF0000 {RecordView(record), payloads, log}), LogCode_0xFF0000::UnknownDataException);
     EXPECT_FALSE(ContextArrayReader(RecordView(record), payloads).contexts());
     EXPECT_EQ(shown(contexts("a")), "{\"APN\": \"a\"}");
 }

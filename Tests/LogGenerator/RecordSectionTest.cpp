@@ -55,7 +55,7 @@ protected:
     }
 
     LogRecorder recorder;
-    SectionRegistry registry;
+    SectionRegistry registry {recorder.context()};
     Described section {registry};
     const Value node {Dictionary::make()};
 };
@@ -104,7 +104,7 @@ using Plain = PlainSection<"Plain", "Trace of it">;
 TEST(PlainSectionTest, SectionWithoutLayoutsLogsItsLineAndNothingElse)
 {
     LogRecorder recorder;
-    SectionRegistry registry;
+    SectionRegistry registry {recorder.context()};
     Plain plain(registry);
     EXPECT_EQ(plain.getSectionName(), "Plain");
     EXPECT_TRUE(plain.getLogCodeArray().empty());

@@ -15,7 +15,8 @@ namespace {
 /// Counts its records and writes their size and code into its node.
 class Counter final : public Base {
 public:
-    Counter(ClassDictionary& dict, CodeDictionary& codeDict)
+    Counter(const Context& context, ClassDictionary& dict, CodeDictionary& codeDict)
+        : Base(context)
     {
         enterInto(dict, codeDict);
     }
@@ -35,14 +36,19 @@ public:
 };
 
 class CounterIndex final : public ClassIndex {
-    Counter objCounter {classDict, codeDictionary};
+public:
+    using ClassIndex::ClassIndex;
+
+private:
+    Counter objCounter {context, classDict, codeDictionary};
 };
 
 class CounterGenerator final : public ZPHLogGenerator2 {
 public:
-    CounterGenerator()
+    explicit CounterGenerator(const Context& context)
+        : ZPHLogGenerator2(context)
     {
-        initWithPListName("Counters", std::make_shared<CounterIndex>());
+        initWithPListName("Counters", std::make_shared<CounterIndex>(context));
     }
     std::string_view className() const override
     {
@@ -78,7 +84,8 @@ protected:
     LogRecorder log;
     FakeResources resources;
     Dictionary state;
-    CounterGenerator generator;
+    const Context context {time, resources, log, log};
+    CounterGenerator generator {context};
 };
 
 constexpr const char* Untouched = "{\"Size\": \"-\", \"Code\": \"-\"}";
@@ -202,7 +209,7 @@ TEST_F(TemplateGeneratorTest, SectionWhoseNodeIsATextLosesItsWrites)
 
 TEST_F(TemplateGeneratorTest, PrintDictLogsOnlyWhatItDoesNotKnow)
 {
-    ZPHLogGenerator2::printDict(Dictionary::make({{"a", List::make({"x", Value::integer(1)})}, {"b", "y"}}));
+    generator.printDict(Dictionary::make({{"a", List::make({"x", Value::integer(1)})}, {"b", "y"}}));
     EXPECT_EQ(log.takeLog(), "<3>Received an object of unknown type\n");
 }
 

@@ -13,6 +13,10 @@ namespace {
 
 class Generator final : public ZPHLogGenerator {
 public:
+    explicit Generator(const Context& context)
+        : ZPHLogGenerator(context)
+    {
+    }
     void updateState(Dictionary&, ByteView) override { }
     Value generateLogUsingState(Dictionary&) override
     {
@@ -47,7 +51,7 @@ protected:
     LogRecorder log;
     Dictionary state;
     ListRef history = List::make();
-    Generator generator;
+    Generator generator {{.clock = time, .log = log}};
 };
 
 TEST_F(DLFTest, EmptyHistoryYieldsTheVersionReportAlone)
@@ -62,7 +66,7 @@ TEST_F(DLFTest, EmptyHistoryYieldsTheVersionReportAlone)
 TEST_F(DLFTest, StateWithoutHistoryYieldsTheVersionReportAlone)
 {
     Dictionary empty;
-    EXPECT_EQ(ZPHLogGenerator::generateDlfFromState(empty)->size(), 161u);
+    EXPECT_EQ(generator.generateDlfFromState(empty)->size(), 161u);
     EXPECT_EQ(generator.getSaveContentsFromState(empty)->count(), 1u);
 }
 
@@ -79,7 +83,7 @@ TEST_F(DLFTest, EntryOfOneByteContributesNothing)
 {
     addEntry({0x01});
     addEntry({});
-    EXPECT_EQ(ZPHLogGenerator::generateDlfFromState(state)->size(), 161u);
+    EXPECT_EQ(generator.generateDlfFromState(state)->size(), 161u);
 }
 
 TEST_F(DLFTest, EntryContributesAllButItsFirstByte)
@@ -88,7 +92,7 @@ TEST_F(DLFTest, EntryContributesAllButItsFirstByte)
     for (std::uint8_t byte = 0; byte < 12; ++byte)
         raw.push_back(static_cast<std::uint8_t>(0xA0 + byte));
     addEntry(raw);
-    const auto dlf = ZPHLogGenerator::generateDlfFromState(state);
+    const auto dlf = generator.generateDlfFromState(state);
     ASSERT_EQ(dlf->size(), 161u + 12u);
     EXPECT_TRUE(std::equal(raw.begin() + 1, raw.end(), dlf->begin() + 161));
 }
@@ -96,7 +100,7 @@ TEST_F(DLFTest, EntryContributesAllButItsFirstByte)
 TEST_F(DLFTest, TypeBytesOfLaterRecordsInAnEntryStay)
 {
     addEntry({0x01, 0xAA, 0xFF, 0xBB});
-    const auto dlf = ZPHLogGenerator::generateDlfFromState(state);
+    const auto dlf = generator.generateDlfFromState(state);
     EXPECT_EQ(textAt(*dlf, 161, 3), "\xAA\xFF\xBB");
 }
 
@@ -104,7 +108,7 @@ TEST_F(DLFTest, EntryWithoutRawMaterialIsSkipped)
 {
     history->append(Dictionary::make());
     addEntry({1, 2});
-    EXPECT_EQ(ZPHLogGenerator::generateDlfFromState(state)->size(), 162u);
+    EXPECT_EQ(generator.generateDlfFromState(state)->size(), 162u);
 }
 
 TEST_F(DLFTest, RawMaterialOfAnotherKindAbortsTheDLFButNotTheSnapshot)
@@ -117,20 +121,20 @@ TEST_F(DLFTest, RawMaterialOfAnotherKindAbortsTheDLFButNotTheSnapshot)
 
 TEST_F(DLFTest, VersionFieldHoldsTheStartOfTheProgramsName)
 {
-    const auto dlf = ZPHLogGenerator::generateDlfFromState(state);
+    const auto dlf = generator.generateDlfFromState(state);
     EXPECT_EQ(textAt(*dlf, 16, 7), std::string("Spectr\0", 7));
 }
 
 TEST_F(DLFTest, DateFieldHoldsSeventeenCharactersAndANUL)
 {
-    const auto dlf = ZPHLogGenerator::generateDlfFromState(state);
+    const auto dlf = generator.generateDlfFromState(state);
     EXPECT_EQ(textAt(*dlf, 63, 18), std::string("Dec  9 2019 21:26\0", 18));
 }
 
 TEST_F(DLFTest, VersionReportIsLaidOutByteForByte)
 {
     time.setZone({-(3 * 3600 + 1830), true});
-    const auto dlf = ZPHLogGenerator::generateDlfFromState(state);
+    const auto dlf = generator.generateDlfFromState(state);
     Bytes expected(161, 0);
     const auto put = [&expected](std::size_t offset, std::string_view bytes) {
         std::copy(bytes.begin(), bytes.end(), expected.begin() + static_cast<std::ptrdiff_t>(offset));

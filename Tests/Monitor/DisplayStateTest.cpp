@@ -41,7 +41,8 @@ protected:
 
     LogRecorder log;
     FakeResources resources;
-    DisplayState display {&LogGenerator::generatorFromTechnology};
+    const Context context {.resources = resources, .log = log, .console = log};
+    DisplayState display {&LogGenerator::generatorFromTechnology, context};
     Listener listener;
 };
 
@@ -69,11 +70,14 @@ TEST_F(DisplayStateTest, NothingIsFollowedUntilSomebodyListens)
 TEST_F(DisplayStateTest, GeneratorsComeFromTheFactory)
 {
     std::string asked;
-    DisplayState other([&asked](const Value& technology) {
-        asked += *technology.string() + " ";
-        return *technology.string() == "ours" ? LogGenerator::generatorFromTechnology(kRKLogChannelTechnology_IFX)
-                                              : nullptr;
-    });
+    DisplayState other(
+        [&asked](const Value& technology, const Context& given) {
+            asked += *technology.string() + " ";
+            return *technology.string() == "ours"
+                ? LogGenerator::generatorFromTechnology(kRKLogChannelTechnology_IFX, given)
+                : nullptr;
+        },
+        context);
     other.useTechnology("ours");
     EXPECT_EQ(other.generator()->className(), "GSMLogGenerator");
     other.useTechnology("theirs");

@@ -23,7 +23,7 @@ class Sink final : public SessionSink {
 public:
     void useTechnology(const Value& technology) override
     {
-        current = LogGenerator::generatorFromTechnology(technology);
+        current = LogGenerator::generatorFromTechnology(technology, {});
     }
     LogGenerator* generator() override
     {
@@ -77,7 +77,7 @@ protected:
     FakeMessagePorts ports;
     FakeTelephonyServer telephony;
     Sink sink;
-    Session session {{loop, ports, telephony}, sink, "test"};
+    Session session {{loop, ports, telephony, {loop, resources, log, log}}, sink, "test"};
     SendStatus technologyStatus = SendStatus::Success;
     SendStatus startStatus = SendStatus::Success;
     std::optional<Bytes> technologyReply;
@@ -147,7 +147,7 @@ TEST_F(SessionTest, EachLossHasItsCause)
 
 TEST_F(SessionTest, NamelessSessionHasNoPorts)
 {
-    Session nameless {{loop, ports, telephony}, sink, ""};
+    Session nameless {{loop, ports, telephony, {loop, resources, log, log}}, sink, ""};
     nameless.start();
     EXPECT_EQ(nameless.loss().cause, SessionLossCause::NoPorts);
     EXPECT_EQ(nameless.loss().text, "Could not create the ports necessary");

@@ -63,9 +63,22 @@ TEST_F(SnapshotTest, TheSameSecondsFileIsOverwritten)
 
 TEST_F(SnapshotTest, AFullDeviceIsTold)
 {
-    std::filesystem::create_symlink("/dev/full", folder + "/s.spectrel");
-    EXPECT_FALSE(writeSnapshot(makeSnapshot(Opened, List::make(), ""), folder + "/s.spectrel", reason));
+    EXPECT_FALSE(writeSnapshot(makeSnapshot(Opened, List::make(), ""), "/dev/full", reason));
     EXPECT_EQ(reason, "No space left on device");
+}
+
+TEST_F(SnapshotTest, PlantedLinkIsNotFollowed)
+{
+    std::ofstream(folder + "/victim") << "untouched";
+    const std::string path = snapshotPath(folder, Opened);
+    std::filesystem::create_symlink("victim", path);
+    EXPECT_FALSE(writeSnapshot(makeSnapshot(Opened, List::make(), ""), path, reason));
+    EXPECT_EQ(reason, "it is a link, and links are not followed");
+    std::filesystem::remove(path);
+    std::filesystem::create_hard_link(folder + "/victim", path);
+    EXPECT_FALSE(writeSnapshot(makeSnapshot(Opened, List::make(), ""), path, reason));
+    EXPECT_EQ(reason, "it has a further name (a hard link)");
+    EXPECT_EQ(std::filesystem::file_size(folder + "/victim"), 9u);
 }
 
 TEST_F(SnapshotTest, WithoutRoomTheOlderSnapshotsStayAndNoHalfOneIsLeft)

@@ -86,7 +86,8 @@ protected:
     FakeMessagePorts ports;
     FakeTelephonyServer telephony;
     Observer observer;
-    SpectrelModel model {{loop, ports, telephony}, &LogGenerator::generatorFromTechnology, observer, "test"};
+    SpectrelModel model {{loop, ports, telephony, {loop, resources, log, log}}, &LogGenerator::generatorFromTechnology,
+        observer, "test"};
     SendStatus technologyStatus = SendStatus::Success;
     SendStatus startStatus = SendStatus::Success;
     std::optional<Bytes> technologyReply;
@@ -188,7 +189,8 @@ TEST_F(SpectrelModelTest, PortThatCannotBeHadFails)
 
 TEST_F(SpectrelModelTest, NameThatCannotBeBuiltFailsWithoutAMessage)
 {
-    SpectrelModel nameless({loop, ports, telephony}, &LogGenerator::generatorFromTechnology, observer, "");
+    SpectrelModel nameless(
+        {loop, ports, telephony, {loop, resources, log, log}}, &LogGenerator::generatorFromTechnology, observer, "");
     EXPECT_FALSE(nameless.createPorts());
     EXPECT_EQ(log.takeLog(), "");
 }
@@ -379,7 +381,8 @@ TEST_F(SpectrelModelTest, JobsThatOutliveTheModelDoNothing)
 {
     telephony.isRunning = false;
     {
-        SpectrelModel shortLived({loop, ports, telephony}, &LogGenerator::generatorFromTechnology, observer, "brief");
+        SpectrelModel shortLived({loop, ports, telephony, {loop, resources, log, log}},
+            &LogGenerator::generatorFromTechnology, observer, "brief");
         observer.model = &shortLived;
         shortLived.startMonitor();
     }

@@ -15,7 +15,7 @@ public:
     ForkedPeer(const ForkedPeer&) = delete;
     ForkedPeer& operator=(const ForkedPeer&) = delete;
 
-    /// Tells the other side to go on.
+    /// Lets the other side go on.
     void signal();
     /// Waits until the other side signals; false when it ended without.
     bool await();

@@ -372,7 +372,7 @@ TEST_F(LocalPortTest, FolderOfSomebodyElseIsRefused)
         ASSERT_EQ(::mkdir(foreign.c_str(), 0700), 0);
         ASSERT_EQ(::chown(foreign.c_str(), 65534, 65534), 0);
     }
-    SocketMessagePorts refused(foreign);
+    SocketMessagePorts refused(foreign, log);
     EXPECT_EQ(refused.createLocal(Name, keeping()).port, nullptr);
     EXPECT_THAT(log.takeLog(), HasSubstr("<3>Message ports: " + foreign + ": not a folder of this user"));
 }
@@ -380,7 +380,7 @@ TEST_F(LocalPortTest, FolderOfSomebodyElseIsRefused)
 TEST_F(LocalPortTest, FolderIsMadeForThisUserAlone)
 {
     const std::string nested = folder.path().string() + "/a/b";
-    SocketMessagePorts made(nested);
+    SocketMessagePorts made(nested, log);
     const auto local = made.createLocal(Name, keeping()).port;
     ASSERT_NE(local, nullptr);
     struct stat status = {};

@@ -66,8 +66,9 @@ protected:
     LogRecorder log;
     ScratchFolder folder;
     QtRunLoop loop;
-    SocketMessagePorts ports {folder.path().string()};
-    SocketMessagePorts elsewhere {folder.path().string()}; // shares no table with `ports`, as another process's would
+    SocketMessagePorts ports {folder.path().string(), log};
+    SocketMessagePorts elsewhere {
+        folder.path().string(), log}; // shares no table with `ports`, as another process's would
     std::vector<std::string> received;
 };
 

@@ -17,7 +17,7 @@ class UnusableNameTest : public testing::TestWithParam<std::string> { };
 TEST_P(UnusableNameTest, IsRefusedAndLogged)
 {
     LogRecorder log;
-    EXPECT_FALSE(portAddress("/run/ports", GetParam()));
+    EXPECT_FALSE(portAddress("/run/ports", GetParam(), log));
     EXPECT_THAT(log.takeLog(), HasSubstr("refused: it must not be empty, start with a dot, or hold"));
 }
 
@@ -28,11 +28,11 @@ TEST(PortNameTest, PathMayHave107BytesAndNoMore)
 {
     LogRecorder log;
     const std::string fits(107 - 6, 'n');
-    const auto address = portAddress("/ports"s.substr(0, 5), fits);
+    const auto address = portAddress("/ports"s.substr(0, 5), fits, log);
     ASSERT_TRUE(address);
     EXPECT_EQ(std::string(address->sun_path), "/port/" + fits);
     EXPECT_EQ(log.takeLog(), "");
-    EXPECT_FALSE(portAddress("/port", fits + "n"));
+    EXPECT_FALSE(portAddress("/port", fits + "n", log));
     EXPECT_THAT(log.takeLog(), HasSubstr("refused: with its folder it is longer than 107 bytes"));
 }
 

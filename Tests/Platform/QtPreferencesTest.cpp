@@ -31,7 +31,7 @@ protected:
         return {std::istreambuf_iterator<char>(file), {}};
     }
 
-    /// The same bus whenever the test is repeated: a process remembers the first session bus that it was told.
+    /// The same bus whenever the test is repeated: a process remembers the first session bus that it was given.
     static const std::string& sessionBus()
     {
         static const ScratchFolder place;

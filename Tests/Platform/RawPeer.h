@@ -8,7 +8,7 @@
 namespace spectrel::raw {
 
 /// The other end of a message port, written from docs/message-ports.md with bare system calls. Sockets are blocking;
-/// -1 or an empty text tells a failure.
+/// -1 or an empty text means a failure.
 
 int connectTo(const std::string& directory, std::string_view name);
 int listenAt(const std::string& directory, std::string_view name);

@@ -24,7 +24,7 @@ protected:
         peer->await();
         return peer;
     }
-    /// An owner that answers as told, once for each request.
+    /// An owner that answers as asked, once for each request.
     std::unique_ptr<ForkedPeer> answering(const std::string& answer)
     {
         return owner([answer](int socket, ForkedPeer&) {

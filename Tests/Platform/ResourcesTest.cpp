@@ -46,11 +46,10 @@ TEST(ResourcesTest, MissingFolderHasNoPaths)
     EXPECT_TRUE(DirectoryResources(folder.file("nowhere")).propertyListPaths().empty());
 }
 
-TEST(ResourcesTest, NothingIsThereUntilResourcesAreInstalled)
+TEST(ResourcesTest, NoneHoldNothing)
 {
-    Resources::install(nullptr);
-    EXPECT_FALSE(Resources::installed().propertyList("LTE"));
-    EXPECT_TRUE(Resources::installed().propertyListPaths().empty());
+    EXPECT_FALSE(Resources::none().propertyList("LTE"));
+    EXPECT_TRUE(Resources::none().propertyListPaths().empty());
 }
 
 } // namespace spectrel

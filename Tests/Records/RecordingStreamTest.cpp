@@ -33,9 +33,9 @@ std::string swappedWords(const std::string& words)
 }
 
 /// What a stream yields, one line a step: "lte", "message TEXT", "skipped N at OFFSET: REASON", "refused: REASON".
-class Told {
+class Heard {
 public:
-    explicit Told(std::optional<Technology> technology)
+    explicit Heard(std::optional<Technology> technology)
         : _stream(makeRecordingStream(technology))
     {
     }
@@ -90,16 +90,16 @@ private:
 /// The stream in one piece; the same must come from it cut at any place, and byte by byte.
 std::vector<std::string> read(const std::string& bytes, std::optional<Technology> technology = {})
 {
-    Told whole(technology);
+    Heard whole(technology);
     whole.append(bytes);
     const auto expected = whole.finish();
     for (std::size_t place = 1; place < bytes.size(); ++place) {
-        Told cut(technology);
+        Heard cut(technology);
         cut.append(std::string_view(bytes).substr(0, place));
         cut.append(std::string_view(bytes).substr(place));
         EXPECT_EQ(cut.finish(), expected) << "cut at byte " << place;
     }
-    Told bytewise(technology);
+    Heard bytewise(technology);
     for (const char byte : bytes)
         bytewise.append({&byte, 1});
     EXPECT_EQ(bytewise.finish(), expected) << "byte by byte";
@@ -118,20 +118,20 @@ TEST(CaptureStreamTest, MessagesComeOutAsTheyWentIn)
 
 TEST(CaptureStreamTest, MessageComesWithItsLastByte)
 {
-    Told told({});
-    told.append(std::string_view(Capture).substr(0, 24 + 16 + First.size() - 1));
-    EXPECT_THAT(told.lines, ElementsAre("lte"));
-    told.append(std::string_view(Capture).substr(24 + 16 + First.size() - 1, 1));
-    EXPECT_THAT(told.lines, ElementsAre("lte", "message " + First));
+    Heard heard({});
+    heard.append(std::string_view(Capture).substr(0, 24 + 16 + First.size() - 1));
+    EXPECT_THAT(heard.lines, ElementsAre("lte"));
+    heard.append(std::string_view(Capture).substr(24 + 16 + First.size() - 1, 1));
+    EXPECT_THAT(heard.lines, ElementsAre("lte", "message " + First));
 }
 
 TEST(CaptureStreamTest, TimesAreThePacketsToTheMicrosecond)
 {
-    Told micro({});
+    Heard micro({});
     micro.append(captureHead(149) + packet(First, 123456));
     EXPECT_EQ(micro.times.at(0), 1'700'000'000'123'456);
     EXPECT_EQ(micro.lines.at(0), "cdma");
-    Told nano({});
+    Heard nano({});
     nano.append(captureHead(148, 0xA1B23C4D) + packet(First, 123456789));
     EXPECT_EQ(nano.times.at(0), 1'700'000'000'123'456);
 }
@@ -156,13 +156,13 @@ TEST(CaptureStreamTest, MessagesThatAreNoRecordsPassAllTheSame)
 
 TEST(CaptureStreamTest, MessageThatIsNoRecordComesOnceTheStreamSettles)
 {
-    Told told({});
-    told.append(captureHead() + packet("short"));
-    EXPECT_THAT(told.lines, ElementsAre("lte"));
-    told.settle();
-    EXPECT_THAT(told.lines, ElementsAre("lte", "message short"));
-    told.append(packet(First));
-    EXPECT_THAT(told.lines, ElementsAre("lte", "message short", "message " + First));
+    Heard heard({});
+    heard.append(captureHead() + packet("short"));
+    EXPECT_THAT(heard.lines, ElementsAre("lte"));
+    heard.settle();
+    EXPECT_THAT(heard.lines, ElementsAre("lte", "message short"));
+    heard.append(packet(First));
+    EXPECT_THAT(heard.lines, ElementsAre("lte", "message short", "message " + First));
 }
 
 TEST(CaptureStreamTest, ReportsOfTheDictionaryBasebandPass)
@@ -231,14 +231,14 @@ TEST(CaptureStreamTest, EndWithinAPacketIsTold)
 
 TEST(CaptureStreamTest, EndlessNoiseIsToldPieceByPieceAndNotKept)
 {
-    Told told({});
-    told.append(captureHead());
+    Heard heard({});
+    heard.append(captureHead());
     for (int count = 0; count < 24; ++count)
-        told.append(std::string(RecordingStream::LargestAppend, '\x77'));
-    EXPECT_GE(told.lines.size(), 2u);
-    EXPECT_TRUE(told.lines.back().ends_with("no packet starts there")) << told.lines.back();
-    told.append(packet(First));
-    EXPECT_EQ(told.lines.back(), "message " + First);
+        heard.append(std::string(RecordingStream::LargestAppend, '\x77'));
+    EXPECT_GE(heard.lines.size(), 2u);
+    EXPECT_TRUE(heard.lines.back().ends_with("no packet starts there")) << heard.lines.back();
+    heard.append(packet(First));
+    EXPECT_EQ(heard.lines.back(), "message " + First);
 }
 
 TEST(CaptureStreamTest, ForeignLinkTypeNeedsTheTechnologyNamed)
@@ -268,28 +268,28 @@ TEST(DLFStreamTest, AnotherFileMayFollow)
 
 TEST(DLFStreamTest, MessageComesWhenTheStreamSettles)
 {
-    Told told(Technology::LTE);
-    told.append(First);
-    EXPECT_THAT(told.lines, ElementsAre("lte")) << "what follows decides how it is cut";
-    told.settle();
-    EXPECT_THAT(told.lines, ElementsAre("lte", "message " + First));
-    told.append(std::string_view(Second).substr(0, 9));
-    told.settle();
-    EXPECT_EQ(told.lines.size(), 2u) << "a message that is not whole waits";
-    told.append(std::string_view(Second).substr(9));
-    told.settle();
-    EXPECT_EQ(told.lines.back(), "message " + Second);
+    Heard heard(Technology::LTE);
+    heard.append(First);
+    EXPECT_THAT(heard.lines, ElementsAre("lte")) << "what follows decides how it is cut";
+    heard.settle();
+    EXPECT_THAT(heard.lines, ElementsAre("lte", "message " + First));
+    heard.append(std::string_view(Second).substr(0, 9));
+    heard.settle();
+    EXPECT_EQ(heard.lines.size(), 2u) << "a message that is not whole waits";
+    heard.append(std::string_view(Second).substr(9));
+    heard.settle();
+    EXPECT_EQ(heard.lines.back(), "message " + Second);
 }
 
 TEST(DLFStreamTest, SettlingAnywhereMakesNoDifferenceToWholeMessages)
 {
     const std::string bytes = versionReport() + First.substr(1) + Second + Third + First + First + Second;
     for (std::size_t place = 1; place < bytes.size(); ++place) {
-        Told told(Technology::LTE);
-        told.append(std::string_view(bytes).substr(0, place));
-        told.settle();
-        told.append(std::string_view(bytes).substr(place));
-        EXPECT_THAT(told.finish(),
+        Heard heard(Technology::LTE);
+        heard.append(std::string_view(bytes).substr(0, place));
+        heard.settle();
+        heard.append(std::string_view(bytes).substr(place));
+        EXPECT_THAT(heard.finish(),
             ElementsAre("lte", "message " + First, "message " + Second, "message " + Third, "message " + First,
                 "message " + First, "message " + Second))
             << "settled at byte " << place;
@@ -315,24 +315,24 @@ TEST(DLFStreamTest, EndWithinAnItemIsTold)
 
 TEST(DLFStreamTest, LongStreamIsDecidedOnAsItComes)
 {
-    Told told(Technology::LTE);
+    Heard heard(Technology::LTE);
     std::size_t expected = 1;
     for (std::size_t bytes = 0; bytes < 1'000'000; bytes += First.size() + Second.size(), expected += 2)
-        told.append(First + Second);
-    EXPECT_GT(told.lines.size(), expected / 2) << "the first part needs no end";
-    EXPECT_EQ(told.finish().size(), expected);
-    EXPECT_EQ(told.lines.back(), "message " + Second);
+        heard.append(First + Second);
+    EXPECT_GT(heard.lines.size(), expected / 2) << "the first part needs no end";
+    EXPECT_EQ(heard.finish().size(), expected);
+    EXPECT_EQ(heard.lines.back(), "message " + Second);
 }
 
 TEST(DLFStreamTest, EndlessNoiseIsNotKept)
 {
-    Told told(Technology::LTE);
+    Heard heard(Technology::LTE);
     for (int count = 0; count < 20; ++count)
-        told.append(std::string(RecordingStream::LargestAppend, '\0'));
-    EXPECT_GE(told.lines.size(), 2u);
+        heard.append(std::string(RecordingStream::LargestAppend, '\0'));
+    EXPECT_GE(heard.lines.size(), 2u);
     for (std::size_t count = 0; count * First.size() < 300'000; ++count)
-        told.append(First);
-    EXPECT_EQ(told.finish().back(), "message " + First);
+        heard.append(First);
+    EXPECT_EQ(heard.finish().back(), "message " + First);
 }
 
 TEST(RecordingStreamTest, EmptyStreamYieldsNothing)
@@ -354,11 +354,11 @@ TEST(RecordingStreamTest, WhatCannotBeRelayedIsRefusedWithItsReason)
 TEST(RecordingStreamTest, LargestMessagePasses)
 {
     const std::string large(LargestMessage, 'x');
-    Told told({});
+    Heard heard({});
     const std::string bytes = captureHead() + packet(large) + packet(First);
     for (std::size_t place = 0; place < bytes.size(); place += RecordingStream::LargestAppend)
-        told.append(std::string_view(bytes).substr(place, RecordingStream::LargestAppend));
-    EXPECT_THAT(told.finish(), ElementsAre("lte", "message " + large, "message " + First));
+        heard.append(std::string_view(bytes).substr(place, RecordingStream::LargestAppend));
+    EXPECT_THAT(heard.finish(), ElementsAre("lte", "message " + large, "message " + First));
 }
 
 } // namespace

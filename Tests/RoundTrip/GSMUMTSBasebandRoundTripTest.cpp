@@ -64,7 +64,7 @@ TEST_F(GSMUMTSBasebandRoundTripTest, EverySectionComesAliveWithinTwoLaps)
 
 TEST_F(GSMUMTSBasebandRoundTripTest, StressIsTakenWithoutComplaint)
 {
-    LogRecorder recorder(3);
+    recorder.takeLog(); // what its making says
     const auto baseband = makeBaseband(Technology::GSM, Scene::Stress, 1);
     receive(*baseband, 30s);
     EXPECT_EQ(recorder.takeLog(), "") << "nothing unreadable, nothing unknown";

@@ -18,12 +18,7 @@ class GSMUMTSRoundTrip : public testing::Test {
 protected:
     GSMUMTSRoundTrip()
     {
-        Resources::install(&_resources);
         _generator->getDisplayFromState(_state); // builds it
-    }
-    ~GSMUMTSRoundTrip() override
-    {
-        Resources::install(nullptr);
     }
 
     void deliver(ByteView record)
@@ -81,6 +76,8 @@ protected:
 
     static constexpr Moment Now {};
 
+    LogRecorder recorder {Priority::Error};
+
 private:
     static Value find(const Value& value, std::string_view name)
     {
@@ -95,9 +92,9 @@ private:
         return {};
     }
 
-    LogRecorder _recorder;
     DirectoryResources _resources {sourcePath("Resources")};
-    std::unique_ptr<ZPH_GSMLogGenerator> _generator = ZPH_GSMLogGenerator::generator();
+    std::unique_ptr<ZPH_GSMLogGenerator> _generator =
+        ZPH_GSMLogGenerator::generator({.resources = _resources, .log = recorder, .console = recorder});
     Dictionary _state;
 };
 

@@ -19,12 +19,8 @@ class RoundTripFixture : public testing::Test {
 protected:
     explicit RoundTripFixture(Technology technology)
     {
-        Resources::install(&_shipped);
-        _generator = LogGenerator::generatorFromTechnology(Value(technologyConstant(technology)));
-    }
-    ~RoundTripFixture() override
-    {
-        Resources::install(nullptr);
+        _generator = LogGenerator::generatorFromTechnology(
+            Value(technologyConstant(technology)), {.clock = _time, .resources = _shipped});
     }
 
     void deliver(ByteView record)

@@ -36,8 +36,10 @@ inline std::size_t countOf(std::string_view part, std::string_view text)
 template <typename Section> class SectionFixture : public testing::Test {
 protected:
     /// `node`: the container that the section writes into, a dictionary or a list.
-    explicit SectionFixture(Value node)
+    /// `diagnosticLog`: who listens to it, if anybody.
+    explicit SectionFixture(Value node, DiagnosticLog* diagnosticLog = nullptr)
         : _node(std::move(node))
+        , registry({.log = _recorder, .console = _recorder, .diagnosticLog = diagnosticLog})
     {
         section.updateSectionRef(_node);
         _recorder.takeLog();
@@ -85,12 +87,13 @@ protected:
         return _recorder.takeLog();
     }
 
-    SectionRegistry registry;
-    Section section {registry};
-
 private:
     LogRecorder _recorder;
     Value _node;
+
+protected:
+    SectionRegistry registry;
+    Section section {registry};
 };
 
 } // namespace spectrel

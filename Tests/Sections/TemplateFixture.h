@@ -18,15 +18,6 @@ namespace spectrel {
 /// A generator with the template that is shipped: what the template lays out, and what a section adds to it.
 class TemplateFixture : public testing::Test {
 protected:
-    TemplateFixture()
-    {
-        Resources::install(&_shipped);
-    }
-    ~TemplateFixture() override
-    {
-        Resources::install(nullptr);
-    }
-
     /// Builds the display; no record is delivered.
     void build(ZPHLogGenerator2& generator)
     {
@@ -73,8 +64,6 @@ protected:
         return RecordBuilder::withPropertyList(0xFF0002, List::make({Dictionary::make({{"APN", "internet.test"}})}));
     }
 
-    Dictionary state;
-
 private:
     const Dictionary& display() const
     {
@@ -84,6 +73,10 @@ private:
     FakeRunLoop _time;
     LogRecorder _log;
     const DirectoryResources _shipped {sourcePath("Resources")};
+
+protected:
+    Dictionary state;
+    const Context context {_time, _shipped, _log, _log};
 };
 
 } // namespace spectrel

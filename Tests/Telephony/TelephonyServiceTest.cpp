@@ -127,7 +127,7 @@ protected:
     FakeRunLoop loop;
     FakeMessagePorts ports;
     ListSource source;
-    TelephonyService service {loop, ports, source};
+    TelephonyService service {loop, loop, ports, source};
 };
 
 TEST_F(TelephonyServiceTest, ChannelIsOpenedWithAPortOfItsOwn)
@@ -283,7 +283,7 @@ TEST_F(TelephonyServiceTest, ChangeOfBasebandEndsAllChannelsAndTheServiceStays)
 
 TEST_F(TelephonyServiceTest, SecondServiceIsRefused)
 {
-    TelephonyService second(loop, ports, source);
+    TelephonyService second(loop, loop, ports, source);
     EXPECT_FALSE(second.start());
 }
 

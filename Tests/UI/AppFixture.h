@@ -86,7 +86,7 @@ protected:
     /// `toolkit` may be a front end of the test's own.
     std::unique_ptr<SpectrelApp> makeApp(ScreenToolkit& chosen)
     {
-        return std::make_unique<SpectrelApp>(SpectrelApp::Services {loop, loop, preferences, chosen,
+        return std::make_unique<SpectrelApp>(SpectrelApp::Services {loop, loop, recorder, preferences, chosen,
             [this](SpectrelModelObserver& given) {
                 observer = &given;
                 auto made = std::make_unique<FakeModel>();

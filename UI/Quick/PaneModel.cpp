@@ -93,7 +93,7 @@ QVariant PaneModel::cellData(const SpectrelCell& cell, int role) const
     }
 }
 
-/// What can be told of a row that is not in sight yet: it has no cell, and so no place for its labels.
+/// What can be said of a row that is not in sight yet: it has no cell, and so no place for its labels.
 QVariant PaneModel::nodeData(std::size_t row, int role) const
 {
     const NodeRef child = _pane->childAtRow(row);

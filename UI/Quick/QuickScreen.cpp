@@ -117,7 +117,7 @@ Outcome QuickScreen::copyToClipboard(const std::string& text)
     return Done {};
 }
 
-// ---- What the QML asks and tells
+// ---- What the QML asks and reports
 
 bool QuickScreen::isWindowShown() const
 {

@@ -16,7 +16,7 @@
 
 namespace spectrel {
 
-/// The toolkit of the graphical screens: measures texts with the desktop's fonts and tells the QML what has changed.
+/// The toolkit of the graphical screens: measures texts with the desktop's fonts and informs the QML of changes.
 ///
 /// The application's controllers are the only state; the models in here are what the QML knows of them.
 class QuickScreen final : public QObject, public ScreenToolkit {
@@ -81,7 +81,7 @@ public:
     static QString aboutVersion();
     static QString aboutSummary();
 
-    /// The QML is there: it is told of every pane that is open already.
+    /// The QML is there: it hears of every pane that is open already.
     Q_INVOKABLE void begin(double width, double height);
     Q_INVOKABLE void resize(double width, double height);
     Q_INVOKABLE void closeAlert();

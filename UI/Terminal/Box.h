@@ -16,7 +16,7 @@ std::size_t boxRoom(int height);
 std::vector<std::string> brokenForBox(const std::vector<std::string>& lines, int width);
 
 /// Draws a framed box in the middle, over what is there, the first line bold. `top` is the first line in sight where
-/// not all fit; the frame tells that there are more. The smallest screens show no frame.
+/// not all fit; the frame shows that there are more. The smallest screens show no frame.
 void drawBox(Grid& grid, const std::vector<std::string>& lines, std::size_t top);
 
 } // namespace spectrel

@@ -15,7 +15,7 @@ public:
     SignalRelay(const SignalRelay&) = delete;
     SignalRelay& operator=(const SignalRelay&) = delete;
 
-    /// -1 when there is none: no signal will be told.
+    /// -1 when there is none: no signal will be reported.
     int file() const;
     /// Empties `file`; before the signals are taken.
     void clear() const;

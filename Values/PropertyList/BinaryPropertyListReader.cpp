@@ -47,7 +47,7 @@ private:
     struct Object {
         std::uint8_t marker = 0;
         std::size_t content = 0; // behind the marker and, where there is one, the count
-        std::size_t count = 0; // of bytes, UTF-16 units, elements or pairs, as the marker tells it
+        std::size_t count = 0; // of bytes, UTF-16 units, elements or pairs, as the marker gives it
     };
 
     std::uint64_t number(std::size_t place, std::size_t width) const;

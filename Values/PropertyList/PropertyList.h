@@ -18,7 +18,7 @@ struct PropertyListLimits {
     static constexpr std::size_t SerialisedBytes = 256 * 1024 * 1024; // a file or message, read or written
 };
 
-/// Reads a property list in its XML or its binary form; which one, the first bytes tell.
+/// Reads a property list in its XML or its binary form; which one, the first bytes decide.
 ///
 /// Strict: malformed numbers, missing values, trailing garbage and unknown elements do not parse. Keys keep the
 /// list's order; a key given twice keeps its last value.
@@ -34,8 +34,9 @@ bool readPropertyList(ByteView bytes, Value& value);
 /// (control characters, malformed UTF-8), a date outside the years 0 to 9999.
 std::optional<std::string> serialisePropertyList(const Value& value);
 
-/// Writes the XML form straight to the path, mode 0600 also where the file exists. A file without room for the list
-/// stays as it was, one that was not there is not left behind.
+/// Writes the XML form straight to the path, mode 0600 also where the file exists. A file that is there is overwritten
+/// only where it is this user's own and no link (`openOwnFile`). One without room for the list stays as it was, one
+/// that was not there is not left behind.
 Outcome writePropertyListToFile(const Value& value, const std::string& path);
 
 /// Reads a whole file as a property list; none when it cannot be read or does not parse.

@@ -1,3 +1,4 @@
+#include "Values/OwnFile.h"
 #include "Values/PropertyList/PropertyList.h"
 
 #include <algorithm>
@@ -29,15 +30,6 @@ Outcome writeAll(int file, std::string_view text)
     return Done();
 }
 
-/// A file that was there keeps its old mode when it is opened; devices and pipes are left alone.
-Outcome makePrivate(int file)
-{
-    struct stat status { };
-    if (::fstat(file, &status) != 0)
-        return Failure::ofSystem();
-    return doneIf(!S_ISREG(status.st_mode) || ::fchmod(file, 0600) == 0);
-}
-
 /// Gives a regular file its new size before the first byte is overwritten: where the disk is full, the file stays as it
 /// was. File systems that cannot reserve tell at the write.
 Outcome reserve(int file, std::size_t size)
@@ -59,8 +51,6 @@ Outcome reserve(int file, std::size_t size)
 
 Outcome fill(int file, std::string_view text)
 {
-    if (auto outcome = makePrivate(file); !outcome)
-        return outcome;
     if (auto outcome = reserve(file, text.size()); !outcome)
         return outcome;
     return writeAll(file, text);
@@ -93,12 +83,13 @@ Outcome writePropertyListToFile(const Value& value, const std::string& path)
     const auto text = serialisePropertyList(value);
     if (!text)
         return Failure {"the value cannot be written as a property list"};
-    int file = ::open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0600);
-    const bool isNew = file >= 0;
-    if (!isNew)
-        file = ::open(path.c_str(), O_WRONLY | O_CREAT | O_CLOEXEC, 0600);
-    if (file < 0)
-        return Failure::ofSystem();
+    auto opened = openOwnFile(path, IfThere::Refuse);
+    const bool isNew = bool(opened);
+    if (!isNew && opened.failure().code == Failure::Code::Exists)
+        opened = openOwnFile(path, IfThere::Overwrite);
+    if (!opened)
+        return opened.failure();
+    const int file = *opened;
     Outcome outcome = fill(file, *text);
     if (::close(file) != 0 && outcome) // some file systems tell only now
         outcome = Failure::ofSystem();

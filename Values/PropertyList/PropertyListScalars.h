@@ -8,7 +8,7 @@
 
 namespace spectrel {
 
-/// Numbers and dates as the XML form spells them. White space around them is allowed; all else must be as told.
+/// Numbers and dates as the XML form spells them. White space around them is allowed; all else must be as described.
 
 /// Decimal, or hexadecimal after 0x, with an optional sign; -2^63 to 2^64-1.
 std::optional<Integer> parseIntegerText(std::string_view text);

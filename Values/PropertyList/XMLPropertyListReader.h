@@ -7,7 +7,7 @@
 
 namespace spectrel {
 
-/// Reads the XML form in any encoding that the document declares or its byte-order mark tells (UTF-8, UTF-16,
+/// Reads the XML form in any encoding that the document declares or its byte-order mark says (UTF-8, UTF-16,
 /// ISO 8859-1, ASCII). None when it does not parse.
 std::optional<Value> parseXMLPropertyList(ByteView bytes);
 

@@ -60,6 +60,16 @@ CDMASector sectorOf(std::size_t site)
     return sector;
 }
 
+CellName oneXNameOf(const CDMASystem& system)
+{
+    return {"cdma", CDMACarriers::OneX, system.pn, system.baseId};
+}
+
+CellName evdoNameOf(const CDMASystem& system)
+{
+    return {"evdo", CDMACarriers::EVDO, system.pn, std::nullopt};
+}
+
 } // namespace
 
 CDMAWorld::CDMAWorld(Scene scene, std::uint32_t seed)
@@ -70,17 +80,21 @@ CDMAWorld::CDMAWorld(Scene scene, std::uint32_t seed)
     for (std::size_t site = 0; site < Sites; ++site)
         _sectors.push_back(sectorOf(site));
     measure();
-    reselect();
+    _serving = _servingEVDO = best();
+    _moves.first(oneXNameOf(serving()));
+    _moves.first(evdoNameOf(serving()));
     maintainActiveSet({});
 }
 
 void CDMAWorld::advance(std::chrono::milliseconds step)
 {
+    _moves.begin();
     _elapsed += step;
     _road.advance(step, _dice);
     _secondAntenna.advance(step, _dice);
     measure();
     reselect();
+    followWithEVDO();
     maintainActiveSet(step);
     // The weaker the pilots, the less power control can hold the one broken frame in a hundred.
     const double active = inDecibels(shareOf(servingSector()));
@@ -104,10 +118,29 @@ void CDMAWorld::measure()
 
 void CDMAWorld::reselect()
 {
-    const auto best =
+    const std::size_t next = best();
+    if (next == _serving)
+        return;
+    _moves.moved(oneXNameOf(serving()), oneXNameOf(_sectors[next].system),
+        activity() == Activity::Voice ? ByHandover : byReselection(ReselectionRule::EqualPriority));
+    _serving = next;
+}
+
+/// EV-DO has the same sector, but sleeps while the phone talks; after that it finds the pilot anew.
+void CDMAWorld::followWithEVDO()
+{
+    if (activity() == Activity::Voice || _servingEVDO == _serving)
+        return;
+    _moves.moved(evdoNameOf(_sectors[_servingEVDO].system), evdoNameOf(serving()),
+        activity() == Activity::Data ? ByHandover : byReselection(ReselectionRule::EqualPriority));
+    _servingEVDO = _serving;
+}
+
+std::size_t CDMAWorld::best() const
+{
+    const auto strongest =
         static_cast<std::size_t>(std::ranges::max_element(_sectors, {}, &CDMASector::power) - _sectors.begin());
-    if (_sectors[best].power > Hysteresis * _sectors[_serving].power)
-        _serving = best;
+    return _sectors[strongest].power > Hysteresis * _sectors[_serving].power ? strongest : _serving;
 }
 
 void CDMAWorld::maintainActiveSet(std::chrono::milliseconds step)

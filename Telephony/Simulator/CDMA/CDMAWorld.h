@@ -5,10 +5,12 @@
 #include "Telephony/Simulator/Dice.h"
 #include "Telephony/Simulator/Journey.h"
 #include "Telephony/Simulator/MastRoad.h"
+#include "Telephony/Simulator/Move.h"
 #include "Telephony/Simulator/Propagation.h"
 
 #include <chrono>
 #include <cstdint>
+#include <span>
 #include <vector>
 
 namespace spectrel {
@@ -65,12 +67,19 @@ public:
     {
         return _countsAtSecond;
     }
+    /// What was decided in the last step.
+    std::span<const Move> moves() const
+    {
+        return _moves.moves();
+    }
     /// All of it, for the records.
     CDMAReport report() const;
 
 private:
     void measure();
     void reselect();
+    void followWithEVDO();
+    std::size_t best() const;
     void maintainActiveSet(std::chrono::milliseconds step);
     const CDMASector& servingSector() const
     {
@@ -87,6 +96,8 @@ private:
     Shadowing _secondAntenna;
     double _total = 0; // mW, noise included
     std::size_t _serving = 0;
+    std::size_t _servingEVDO = 0; // in a voice call, the one before it
+    MoveLog _moves;
     std::chrono::milliseconds _elapsed {0};
     bool _isFrameBad = false;
     EVDOTraffic _traffic;

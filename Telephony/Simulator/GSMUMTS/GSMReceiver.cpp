@@ -31,8 +31,9 @@ std::int32_t whole(double value)
 
 } // namespace
 
-GSMReceiver::GSMReceiver(const GSMUMTSRoad& road)
+GSMReceiver::GSMReceiver(const GSMUMTSRoad& road, MoveLog& moves)
     : _cells(road.gsm())
+    , _moves(moves)
     , _heard(_cells.size())
 {
 }
@@ -163,8 +164,10 @@ void GSMReceiver::reselect(std::chrono::milliseconds step)
     if (_candidateFor < (isDedicated() ? std::chrono::milliseconds(HandoverTime) : ReselectionTime))
         return;
     if (isDedicated()) {
+        _moves.moved(nameOf(servingCell()), nameOf(_cells[best]), ByHandover);
         serve(best);
     } else if (isConnected() || _rr.state == RRState::Idle) { // a packet transfer goes on on the new cell
+        _moves.moved(nameOf(servingCell()), nameOf(_cells[best]), byReselection(ReselectionRule::EqualPriority));
         serve(best);
         become(RRState::CellReselection);
     }

@@ -2,6 +2,7 @@
 
 #include "Telephony/Simulator/Demand.h"
 #include "Telephony/Simulator/GSMUMTS/GSMUMTSRoad.h"
+#include "Telephony/Simulator/Move.h"
 
 #include <chrono>
 #include <vector>
@@ -13,7 +14,8 @@ namespace spectrel {
 /// Idle, reselection goes by C2 (3GPP TS 45.008, 6.6.2); in a call the network hands over to a stronger cell.
 class GSMReceiver {
 public:
-    explicit GSMReceiver(const GSMUMTSRoad& road);
+    /// `moves`: of the world; notes the moves within GSM.
+    GSMReceiver(const GSMUMTSRoad& road, MoveLog& moves);
 
     /// Enters GSM on its strongest cell; the state says how, and lasts about a second.
     void enter(RRState how);
@@ -78,6 +80,7 @@ private:
     void serve(std::size_t cell);
 
     const std::vector<GSMCell>& _cells;
+    MoveLog& _moves;
     std::vector<std::chrono::milliseconds> _heard; // one for each cell
     bool _isOn = false;
     bool _inCall = false;

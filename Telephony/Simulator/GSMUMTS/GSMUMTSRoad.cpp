@@ -63,6 +63,16 @@ GPRSParameters gprsOfCell(std::size_t number, Dice& dice)
 
 } // namespace
 
+CellName nameOf(const UMTSCell& cell)
+{
+    return {"umts", cell.downlinkChannel, cell.scramblingCode, cell.identity};
+}
+
+CellName nameOf(const GSMCell& cell)
+{
+    return {"gsm", cell.arfcn, cell.bsic, cell.identity};
+}
+
 GSMUMTSRoad::GSMUMTSRoad(Scene scene, Dice& dice)
     : _journey(scene, RoadLength, dice)
 {

@@ -4,12 +4,16 @@
 #include "Telephony/Reports/UMTSCell.h"
 #include "Telephony/Simulator/Dice.h"
 #include "Telephony/Simulator/Journey.h"
+#include "Telephony/Simulator/Move.h"
 #include "Telephony/Simulator/Propagation.h"
 
 #include <chrono>
 #include <vector>
 
 namespace spectrel {
+
+CellName nameOf(const UMTSCell& cell);
+CellName nameOf(const GSMCell& cell);
 
 /// A ring road past NodeBs and GSM base stations. Through one stretch, a valley, UMTS does not reach.
 class GSMUMTSRoad {

@@ -36,14 +36,15 @@ GSMUMTSWorld::GSMUMTSWorld(Scene scene, std::uint32_t seed)
     : _dice(seed)
     , _road(scene, _dice)
     , _usage(_dice)
-    , _umts(_road)
-    , _gsm(_road)
+    , _umts(_road, _moves)
+    , _gsm(_road, _moves)
 {
     _now = _before = situation();
 }
 
 void GSMUMTSWorld::advance(std::chrono::milliseconds step)
 {
+    _moves.begin();
     _elapsed += step;
     _road.advance(step, _dice);
     _usage.advance(step, _mobility.isAttached(), _dice);
@@ -96,10 +97,13 @@ void GSMUMTSWorld::chooseFirstSystem()
 {
     if (_elapsed < SearchTime)
         return;
-    if (_umts.strongestCell().ecno > SelectableEcno)
+    if (_umts.strongestCell().ecno > SelectableEcno) {
         _umts.enter(RRCState::Disconnected);
-    else
+        _moves.first(nameOf(_umts.servingCell()));
+    } else {
         _gsm.enter(RRState::PLMNListConstruction);
+        _moves.first(nameOf(_gsm.servingCell()));
+    }
 }
 
 bool GSMUMTSWorld::measuresGSM() const
@@ -107,12 +111,18 @@ bool GSMUMTSWorld::measuresGSM() const
     return _gsm.isOn() || (_umts.isOn() && _umts.servingCell().ecno < UMTSThresholds::SearchGSMBelow);
 }
 
+bool GSMUMTSWorld::isUMTSSuitable() const
+{
+    const UMTSCell& cell = _umts.servingCell();
+    return cell.ecno >= UMTSThresholds::QQualMin && cell.rscp >= UMTSThresholds::QRxLevMin;
+}
+
 bool GSMUMTSWorld::isUMTSTooWeak() const
 {
     const UMTSCell& cell = _umts.servingCell();
     if (_umts.state() == RRCState::CellDCH)
         return cell.ecno < WeakEcno;
-    if (cell.ecno < UMTSThresholds::QQualMin || cell.rscp < UMTSThresholds::QRxLevMin)
+    if (!isUMTSSuitable())
         return true;
     return measuresGSM() && _gsm.strongestCell().rssi - UMTSThresholds::QOffset1 > _umts.servingRank();
 }
@@ -125,10 +135,20 @@ void GSMUMTSWorld::considerGSM(std::chrono::milliseconds step)
         return;
     if (_mobility.isSignalling() && _umts.servingCell().ecno > LostEcno)
         return; // the procedure is let finish
+    const CellName from = nameOf(_umts.servingCell());
+    const MoveCause cause = causeOfMoveToGSM();
     const RRState onAChannel = _mobility.isCalling() ? RRState::FromUMTSByHandover : RRState::FromUMTSByOrder;
     _umts.leave();
     _gsm.enter(hasOwnChannel ? onAChannel : RRState::FromUMTSByReselection);
+    _moves.moved(from, nameOf(_gsm.servingCell()), cause);
     _leaving = 0ms;
+}
+
+MoveCause GSMUMTSWorld::causeOfMoveToGSM() const
+{
+    if (_umts.state() == RRCState::CellDCH)
+        return _mobility.isCalling() ? ByHandover : ByRedirection;
+    return byReselection(isUMTSSuitable() ? ReselectionRule::EqualPriority : ReselectionRule::NotSuitable);
 }
 
 void GSMUMTSWorld::considerUMTS(std::chrono::milliseconds step)
@@ -153,8 +173,11 @@ void GSMUMTSWorld::moveToUMTS(std::chrono::milliseconds step)
     if (_departing < DepartureTime)
         return;
     const bool byHandover = _gsm.rr().state == RRState::ToUMTSByHandover;
+    const CellName from = nameOf(_gsm.servingCell());
     _gsm.leave();
     _umts.enter(byHandover ? RRCState::CellDCH : RRCState::Disconnected);
+    _moves.moved(
+        from, nameOf(_umts.servingCell()), byHandover ? ByHandover : byReselection(ReselectionRule::EqualPriority));
     _departing = 0ms;
 }
 

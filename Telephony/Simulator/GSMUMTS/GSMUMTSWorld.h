@@ -7,6 +7,7 @@
 #include "Telephony/Simulator/GSMUMTS/MobilityManagement.h"
 #include "Telephony/Simulator/GSMUMTS/UMTSReceiver.h"
 #include "Telephony/Simulator/GSMUMTS/UMTSTraffic.h"
+#include "Telephony/Simulator/Move.h"
 #include "Telephony/Simulator/Usage.h"
 
 #include <chrono>
@@ -62,6 +63,11 @@ public:
         return _before;
     }
     RadioSystem system() const;
+    /// What was decided in the last step.
+    std::span<const Move> moves() const
+    {
+        return _moves.moves();
+    }
     const UMTSReceiver& umts() const
     {
         return _umts;
@@ -107,7 +113,9 @@ private:
     void considerGSM(std::chrono::milliseconds step);
     void considerUMTS(std::chrono::milliseconds step);
     void moveToUMTS(std::chrono::milliseconds step);
+    bool isUMTSSuitable() const;
     bool isUMTSTooWeak() const;
+    MoveCause causeOfMoveToGSM() const;
     std::vector<RankedGSMCell> gsmRanking() const;
     void transfer(std::chrono::milliseconds step);
     Situation situation() const;
@@ -116,6 +124,7 @@ private:
     Dice _dice;
     GSMUMTSRoad _road;
     Usage _usage;
+    MoveLog _moves;
     UMTSReceiver _umts;
     GSMReceiver _gsm;
     MobilityManagement _mobility;

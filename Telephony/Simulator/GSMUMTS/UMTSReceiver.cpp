@@ -36,9 +36,10 @@ constexpr double FastPhone = 14; // metres a second: so fast a phone reports onl
 
 } // namespace
 
-UMTSReceiver::UMTSReceiver(const GSMUMTSRoad& road)
+UMTSReceiver::UMTSReceiver(const GSMUMTSRoad& road, MoveLog& moves)
     : _road(road)
     , _cells(road.umts())
+    , _moves(moves)
     , _timers(_cells.size())
 {
 }
@@ -96,15 +97,20 @@ void UMTSReceiver::reselect(std::chrono::milliseconds step)
     const bool isBetter = best != _serving && _timers[best].averageRscp > servingRank();
     keepTime(_candidateFor, isBetter && best == _candidate, step);
     _candidate = best;
-    if (_candidateFor >= TReselection)
-        serveOnly(best);
+    if (_candidateFor < TReselection)
+        return;
+    _moves.moved(nameOf(servingCell()), nameOf(_cells[best]), byReselection(ReselectionRule::EqualPriority));
+    serveOnly(best);
 }
 
 void UMTSReceiver::updateActiveSet(std::chrono::milliseconds step)
 {
     dismiss(step);
     admit(step);
-    _serving = strongestActive();
+    const std::size_t strongest = strongestActive();
+    if (strongest != _serving)
+        _moves.moved(nameOf(servingCell()), nameOf(_cells[strongest]), ByHandover);
+    _serving = strongest;
 }
 
 void UMTSReceiver::admit(std::chrono::milliseconds step)

@@ -2,6 +2,7 @@
 
 #include "Telephony/Simulator/Demand.h"
 #include "Telephony/Simulator/GSMUMTS/GSMUMTSRoad.h"
+#include "Telephony/Simulator/Move.h"
 
 #include <chrono>
 #include <vector>
@@ -15,7 +16,8 @@ namespace spectrel {
 /// 3GPP TS 25.331, 14.1.2; its strongest cell serves.
 class UMTSReceiver {
 public:
-    explicit UMTSReceiver(const GSMUMTSRoad& road);
+    /// `moves`: of the world; notes the moves within UMTS.
+    UMTSReceiver(const GSMUMTSRoad& road, MoveLog& moves);
 
     /// Enters UMTS on its strongest cell; by handover, with a channel at once.
     void enter(RRCState state);
@@ -79,6 +81,7 @@ private:
 
     const GSMUMTSRoad& _road;
     const std::vector<UMTSCell>& _cells;
+    MoveLog& _moves;
     std::vector<Timers> _timers; // one for each cell
     std::vector<std::size_t> _active; // empty while off
     std::size_t _serving = 0;

@@ -19,6 +19,11 @@ constexpr std::chrono::milliseconds Round = 120s;
 constexpr std::chrono::milliseconds CallStart = 30s; // in each round
 constexpr std::chrono::milliseconds CallEnd = 85s;
 
+CellName nameOf(const IFXCell& cell)
+{
+    return {"gsm", cell.channel, cell.networkColour * 8u + cell.stationColour, cell.identity};
+}
+
 } // namespace
 
 IFXWorld::IFXWorld(Scene scene, std::uint32_t seed)
@@ -37,15 +42,19 @@ IFXWorld::IFXWorld(Scene scene, std::uint32_t seed)
     }
     measure();
     _serving = strongest();
+    _moves.first(nameOf(serving()));
 }
 
 void IFXWorld::advance(std::chrono::milliseconds step)
 {
     const double seconds = std::chrono::duration<double>(step).count();
+    _moves.begin();
     _elapsed += step;
     _road.advance(step, _dice);
     measure();
     if (const std::size_t best = strongest(); _cells[best].level > serving().level + Hysteresis) {
+        _moves.moved(nameOf(serving()), nameOf(_cells[best]),
+            isTalking() ? ByHandover : byReselection(ReselectionRule::EqualPriority));
         _serving = best;
         ++_cellsVisited;
     }

@@ -4,9 +4,11 @@
 #include "Telephony/Simulator/Dice.h"
 #include "Telephony/Simulator/Journey.h"
 #include "Telephony/Simulator/MastRoad.h"
+#include "Telephony/Simulator/Move.h"
 
 #include <chrono>
 #include <cstdint>
+#include <span>
 #include <vector>
 
 namespace spectrel {
@@ -49,6 +51,11 @@ public:
     {
         return static_cast<std::uint64_t>(_sent);
     }
+    /// What was decided in the last step.
+    std::span<const Move> moves() const
+    {
+        return _moves.moves();
+    }
     /// All of it, for the message.
     IFXReport report() const;
 
@@ -61,6 +68,7 @@ private:
     std::vector<IFXCell> _cells; // one a mast
     std::size_t _serving = 0;
     std::chrono::milliseconds _elapsed {0};
+    MoveLog _moves;
     unsigned _quality = 0;
     unsigned _cellsVisited = 1;
     double _received = 0;

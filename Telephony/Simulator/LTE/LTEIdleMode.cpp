@@ -44,16 +44,25 @@ void LTEIdleMode::start(std::size_t serving)
     judgeOthers();
 }
 
-std::optional<std::size_t> LTEIdleMode::cycle()
+std::optional<LTEIdleMode::Reselection> LTEIdleMode::cycle()
 {
     ++_turn;
     judgeServing();
     judgeOthers();
     if (_report.cyclesBelowZero >= CyclesUntilLost) {
         if (const auto cell = strongestSuitable())
-            return cell;
+            return Reselection {*cell, ReselectionRule::NotSuitable};
     }
-    return bestOf(TReselection + Cycle); // seen at both ends of the time
+    const auto best = bestOf(TReselection + Cycle); // seen at both ends of the time
+    return best ? std::optional<Reselection>({*best, ruleFor(_road.cells()[*best])}) : std::nullopt;
+}
+
+ReselectionRule LTEIdleMode::ruleFor(const LTECell& cell) const
+{
+    const LTELayer& from = *servingCell().layer;
+    if (cell.layer == &from)
+        return ReselectionRule::EqualPriority;
+    return cell.layer->priority > from.priority ? ReselectionRule::HigherPriority : ReselectionRule::LowerPriority;
 }
 
 void LTEIdleMode::judgeServing()

@@ -2,6 +2,7 @@
 
 #include "Telephony/Reports/LTEReports.h"
 #include "Telephony/Simulator/LTE/LTERoad.h"
+#include "Telephony/Simulator/Move.h"
 
 #include <chrono>
 #include <cstddef>
@@ -21,6 +22,11 @@ namespace spectrel {
 /// technologies are reported, but the phone stays with LTE.
 class LTEIdleMode {
 public:
+    struct Reselection {
+        std::size_t cell;
+        ReselectionRule rule;
+    };
+
     /// The paging cycle: near the usual 1.28 s, in whole steps of the simulation.
     static constexpr std::chrono::milliseconds Cycle {1200};
     static constexpr double QHyst = 4; // dB
@@ -33,8 +39,8 @@ public:
 
     /// Forgets what was measured: a phone comes from a connection, or has moved.
     void start(std::size_t serving);
-    /// One cycle. Answers the cell to move to, if any.
-    std::optional<std::size_t> cycle();
+    /// One cycle. Returns the cell to move to, if any, and by which rule.
+    std::optional<Reselection> cycle();
 
     const LTEServingReport& serving() const
     {
@@ -52,6 +58,7 @@ private:
     void judgeOthers();
     std::vector<const LTELayer*> carriersToMeasure() const;
     std::optional<std::size_t> bestOf(std::chrono::milliseconds minTime) const;
+    ReselectionRule ruleFor(const LTECell& cell) const;
     std::optional<std::size_t> strongestSuitable() const;
     const LTECell& servingCell() const
     {

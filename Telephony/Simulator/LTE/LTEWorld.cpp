@@ -13,6 +13,11 @@ constexpr double Measurable = -19; // dB of RSRQ; of weaker cells the phone know
 constexpr double Audible = -25; // dB of RSRQ
 constexpr std::size_t MaxMeasured = 8;
 
+CellName nameOf(const LTECell& cell)
+{
+    return {"lte", cell.downlinkChannel, cell.physicalCellId, cell.identity};
+}
+
 bool isStronger(const LTECell* a, const LTECell* b)
 {
     return a->average.rsrp > b->average.rsrp;
@@ -28,11 +33,13 @@ LTEWorld::LTEWorld(Scene scene, std::uint32_t seed)
 {
     _road.advance(std::chrono::milliseconds::zero(), _journey, _dice);
     _serving = strongest();
+    _moves.first(nameOf(servingCell()));
     _idleMode.start(_serving);
 }
 
 void LTEWorld::advance(std::chrono::milliseconds step)
 {
+    _moves.begin();
     _elapsed += step;
     _journey.advance(step, _dice);
     _road.advance(step, _journey, _dice);
@@ -52,10 +59,16 @@ void LTEWorld::advanceIdle(bool hasJustBecomeIdle)
         _idleMode.start(_serving);
     if (_elapsed % LTEIdleMode::Cycle != std::chrono::milliseconds::zero())
         return;
-    if (const auto cell = _idleMode.cycle(); cell && *cell != _serving) {
-        _serving = *cell;
+    if (const auto chosen = _idleMode.cycle(); chosen && chosen->cell != _serving) {
+        moveTo(chosen->cell, byReselection(chosen->rule));
         _idleMode.start(_serving);
     }
+}
+
+void LTEWorld::moveTo(std::size_t cell, MoveCause cause)
+{
+    _moves.moved(nameOf(servingCell()), nameOf(_road.cells()[cell]), cause);
+    _serving = cell;
 }
 
 void LTEWorld::advanceConnection(std::chrono::milliseconds step)
@@ -78,7 +91,7 @@ void LTEWorld::handOver(std::chrono::milliseconds step)
     _targetFor = best == _target ? _targetFor + step : step;
     _target = best;
     if (_targetFor >= TimeToTrigger) {
-        _serving = best;
+        moveTo(best, ByHandover);
         _targetFor = {};
     }
 }

@@ -6,10 +6,12 @@
 #include "Telephony/Simulator/Journey.h"
 #include "Telephony/Simulator/LTE/LTEIdleMode.h"
 #include "Telephony/Simulator/LTE/LTERoad.h"
+#include "Telephony/Simulator/Move.h"
 #include "Telephony/Simulator/Usage.h"
 
 #include <chrono>
 #include <cstdint>
+#include <span>
 #include <vector>
 
 namespace spectrel {
@@ -41,6 +43,11 @@ public:
     {
         return _idleMode;
     }
+    /// What was decided in the last step.
+    std::span<const Move> moves() const
+    {
+        return _moves.moves();
+    }
     LTEConnectedReport connectedReport() const;
     /// The strongest other cells, strongest first.
     std::vector<const LTECell*> neighbours(std::size_t maxCount) const;
@@ -58,6 +65,7 @@ private:
     void advanceConnection(std::chrono::milliseconds step);
     void handOver(std::chrono::milliseconds step);
     void transfer(std::chrono::milliseconds step);
+    void moveTo(std::size_t cell, MoveCause cause);
     std::size_t strongest() const;
 
     Dice _dice;
@@ -65,6 +73,7 @@ private:
     LTERoad _road;
     std::size_t _serving = 0;
     LTEIdleMode _idleMode {_road};
+    MoveLog _moves;
     Habit _connection;
     bool _hasLostConnection = false; // until the habit's next turn
     std::chrono::milliseconds _elapsed {0};

@@ -49,6 +49,11 @@ std::uint8_t blockErrors(double signalToInterference)
     return static_cast<std::uint8_t>(std::min(std::round(errors), 100.0));
 }
 
+CellName nameOf(const UTRANCell& cell)
+{
+    return {"umts", cell.channel, cell.cellParameterId, cell.identity};
+}
+
 std::uint8_t signalSteps(double decibels)
 {
     return static_cast<std::uint8_t>(std::clamp(std::round((decibels + 11) * 2), 0.0, 63.0));
@@ -67,6 +72,7 @@ UTRANWorld::UTRANWorld(Scene scene, std::uint32_t seed)
     const auto strongest =
         std::ranges::max_element(_cells, [](const UTRANCell& a, const UTRANCell& b) { return a.rscp < b.rscp; });
     _serving = static_cast<std::size_t>(strongest - _cells.begin());
+    _moves.first(nameOf(servingCell()));
 }
 
 void UTRANWorld::buildRoad()
@@ -100,6 +106,7 @@ void UTRANWorld::buildRoad()
 
 void UTRANWorld::advance(std::chrono::milliseconds step)
 {
+    _moves.begin();
     _journey.advance(step, _dice);
     for (auto* shadowings : {&_shadowing, &_gsmShadowing}) {
         for (Shadowing& shadowing : *shadowings)
@@ -151,9 +158,18 @@ void UTRANWorld::reselect(std::chrono::milliseconds step)
     _candidateFor = index == _candidate ? _candidateFor + step : step;
     _candidate = index;
     if (_candidateFor >= TReselection) {
+        _moves.moved(nameOf(servingCell()), nameOf(_cells[index]), causeOfMove());
         _serving = index;
         _candidateFor = 0ms;
     }
+}
+
+/// Of a move from the serving cell, now.
+MoveCause UTRANWorld::causeOfMove() const
+{
+    if (!isInService())
+        return AfterServiceLost;
+    return _connection.isOnDedicatedChannel() ? ByHandover : byReselection(ReselectionRule::EqualPriority);
 }
 
 std::vector<const UTRANCell*> UTRANWorld::otherCells() const

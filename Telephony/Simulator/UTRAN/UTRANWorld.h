@@ -4,12 +4,14 @@
 #include "Telephony/Reports/UTRANReports.h"
 #include "Telephony/Simulator/Dice.h"
 #include "Telephony/Simulator/Journey.h"
+#include "Telephony/Simulator/Move.h"
 #include "Telephony/Simulator/Propagation.h"
 #include "Telephony/Simulator/RRCConnection.h"
 #include "Telephony/Simulator/Usage.h"
 
 #include <chrono>
 #include <cstdint>
+#include <span>
 #include <vector>
 
 namespace spectrel {
@@ -49,6 +51,11 @@ public:
     std::vector<GSMNeighbour> gsmNeighbours() const;
     /// Empty unless the phone is on a dedicated channel.
     TransportReport transportChannels() const;
+    /// What was decided in the last step.
+    std::span<const Move> moves() const
+    {
+        return _moves.moves();
+    }
     std::uint64_t bytesReceived() const
     {
         return static_cast<std::uint64_t>(_received);
@@ -62,6 +69,7 @@ private:
     void buildRoad();
     void measure();
     void reselect(std::chrono::milliseconds step);
+    MoveCause causeOfMove() const;
     bool isNamed(const UTRANCell& cell) const;
     bool isMeasured(const UTRANCell& cell) const;
     bool isDetected(const UTRANCell& cell) const;
@@ -79,6 +87,7 @@ private:
     Habit _calls;
     Habit _transfers;
     RRCConnection _connection;
+    MoveLog _moves;
     double _signalToInterference = 0; // dB, of the dedicated channels
     double _received = 0;
     double _sent = 0;

@@ -22,7 +22,7 @@ protected:
         for (const std::string_view variable : variables)
             layout->set(variable, variable);
         resources.lists["C2KTemplate"] = layout;
-        C2KLogGenerator::getDisplayFromState(state);
+        generator.getDisplayFromState(state);
         log.takeLog();
     }
 
@@ -42,8 +42,9 @@ protected:
     FakeRunLoop time;
     LogRecorder log;
     FakeResources resources;
+    const Context context {time, resources, log, log};
     Dictionary state;
-    C2KLogGenerator generator;
+    C2KLogGenerator generator {context};
 };
 
 /// A 1x record that holds subpackets, being put together.

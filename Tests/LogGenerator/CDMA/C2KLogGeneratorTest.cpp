@@ -10,7 +10,7 @@
 namespace spectrel {
 namespace {
 
-/// A 0x1183 record that tells this channel, 0 to 255.
+/// A 0x1183 record with this channel, 0 to 255.
 RecordBuilder channelRecord(std::uint8_t channel)
 {
     return RecordBuilder(0x1183, 50).u8(13, channel);
@@ -45,7 +45,7 @@ TEST_F(C2KLogGeneratorTest, StartCommandAsksForTheEightCodesInTheirOrder)
 
 TEST_F(C2KLogGeneratorTest, CreationIsLoggedOnce)
 {
-    C2KLogGenerator::generator();
+    C2KLogGenerator::generator(context);
     const std::string text = log.takeLog();
     EXPECT_EQ(text.find("<4>Creating Log object: 0x"), 0u);
     EXPECT_EQ(text.find('\n'), text.size() - 1);
@@ -54,9 +54,9 @@ TEST_F(C2KLogGeneratorTest, CreationIsLoggedOnce)
 TEST_F(C2KLogGeneratorTest, FirstCallOnAnEmptyStateAnswersTheNewDisplay)
 {
     Dictionary empty;
-    const Value display = C2KLogGenerator::getDisplayFromState(empty);
+    const Value display = generator.getDisplayFromState(empty);
     EXPECT_EQ(displayText(display), "{\"kChannel\": \"\", \"kBandClass\": \"\"}");
-    EXPECT_EQ(display, C2KLogGenerator::getDisplayFromState(empty));
+    EXPECT_EQ(display, generator.getDisplayFromState(empty));
     EXPECT_EQ(displayText(empty[StateKey::ExtraInfo]), "{}");
     EXPECT_EQ(displayText(empty[StateKey::Lookup]),
         "{\"kChannel\": [{\"key\": \"kChannel\", \"dict\": {\"kChannel\": \"\", \"kBandClass\": \"\"}}], "
@@ -83,8 +83,7 @@ TEST_F(C2KLogGeneratorTest, ListAtTwoPlacesIsOneAndTheSame)
 TEST_F(C2KLogGeneratorTest, SortedMarkIsCopiedAndIsNoVariable)
 {
     useTemplate(Dictionary::make({{"_sorted", "_sorted"}, {"1;Channel", "kChannel"}}));
-    EXPECT_EQ(
-        displayText(C2KLogGenerator::getDisplayFromState(state)), "{\"_sorted\": \"_sorted\", \"1;Channel\": \"\"}");
+    EXPECT_EQ(displayText(generator.getDisplayFromState(state)), "{\"_sorted\": \"_sorted\", \"1;Channel\": \"\"}");
     EXPECT_FALSE(state[StateKey::Lookup].dictionary()->contains("_sorted"));
 }
 
@@ -92,13 +91,13 @@ TEST_F(C2KLogGeneratorTest, NumbersAndListsInATemplateAreNotCopied)
 {
     useTemplate(Dictionary::make({{"Number", Value::integer(5)}, {"List", List::make({"kChannel"})},
         {"Truth", Value::boolean(true)}, {"Channel", "kChannel"}}));
-    EXPECT_EQ(displayText(C2KLogGenerator::getDisplayFromState(state)), "{\"Channel\": \"\"}");
+    EXPECT_EQ(displayText(generator.getDisplayFromState(state)), "{\"Channel\": \"\"}");
 }
 
 TEST_F(C2KLogGeneratorTest, EachDictionaryOfTheTemplateIsLoggedAlsoAnEmptyOne)
 {
     useTemplate(Dictionary::make({{"Empty", Dictionary::make()}, {"One", Dictionary::make({{"a", "kChannel"}})}}));
-    C2KLogGenerator::getDisplayFromState(state);
+    generator.getDisplayFromState(state);
     constexpr const char* Line = "<4>Processing the template\n";
     EXPECT_EQ(log.takeLog(), std::string(Line) + Line + Line);
 }
@@ -120,7 +119,7 @@ TEST_F(C2KLogGeneratorTest, MissingTemplateIsLoggedAndTriedAgainAtTheNextMessage
 TEST_F(C2KLogGeneratorTest, TemplateThatIsNoDictionaryCannotBeLoaded)
 {
     useTemplate(List::make({"kChannel"}));
-    EXPECT_TRUE(C2KLogGenerator::getDisplayFromState(state).isAbsent());
+    EXPECT_TRUE(generator.getDisplayFromState(state).isAbsent());
     EXPECT_EQ(log.takeLog(), "<3>Cannot load C2K template for display\n");
 }
 
@@ -246,7 +245,7 @@ protected:
     }
     void use(std::string_view technology, bool hasUnbuiltMessages = false)
     {
-        slot.replace(LogGenerator::generatorFromTechnology(technology), state, hasUnbuiltMessages);
+        slot.replace(LogGenerator::generatorFromTechnology(technology, context), state, hasUnbuiltMessages);
     }
     GeneratorSlot slot;
 };

@@ -47,7 +47,8 @@ protected:
     FakeRunLoop time;
     LogRecorder log;
     Dictionary state;
-    GSMLogGenerator generator;
+    const Context context {.clock = time, .log = log};
+    GSMLogGenerator generator {context};
 };
 
 TEST_F(GSMLogGeneratorTest, StartCommandOnlySetsTheState)
@@ -57,7 +58,7 @@ TEST_F(GSMLogGeneratorTest, StartCommandOnlySetsTheState)
 
 TEST_F(GSMLogGeneratorTest, CreationIsLoggedOnce)
 {
-    GSMLogGenerator::generator();
+    GSMLogGenerator::generator(context);
     const std::string text = log.takeLog();
     EXPECT_EQ(text.find("<4>Creating Log object: 0x"), 0u);
     EXPECT_EQ(text.find('\n'), text.size() - 1);
@@ -227,9 +228,9 @@ TEST_F(GSMLogGeneratorTest, OnlyDictionariesOfOneEntryCanCollapse)
 TEST_F(GSMLogGeneratorTest, NewGeneratorTakesTheDisplayOverUntilTheNextMessage)
 {
     GeneratorSlot slot;
-    slot.replace(LogGenerator::generatorFromTechnology(kRKLogChannelTechnology_IFX), state, false);
+    slot.replace(LogGenerator::generatorFromTechnology(kRKLogChannelTechnology_IFX, context), state, false);
     slot->updateState(state, message(Dictionary::make({{"A", "x"}})));
-    slot.replace(LogGenerator::generatorFromTechnology(kRKLogChannelTechnology_IFX), state, true);
+    slot.replace(LogGenerator::generatorFromTechnology(kRKLogChannelTechnology_IFX, context), state, true);
     EXPECT_EQ(display(), "{\"A\": \"x\"}");
     EXPECT_EQ(displayText(slot->generateLogUsingState(state)), "{\"A\": \"x\"}");
     EXPECT_EQ(state[StateKey::History].list()->count(), 1u) << "the waiting message has its one entry";

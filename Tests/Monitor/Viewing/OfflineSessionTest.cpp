@@ -9,6 +9,8 @@
 #include <cstdlib>
 #include <filesystem>
 #include <gtest/gtest.h>
+#include <initializer_list>
+#include <utility>
 
 namespace spectrel {
 namespace {
@@ -50,7 +52,8 @@ protected:
     FakeResources resources;
     const ScratchFolder scratch;
     const std::string folder = scratch.path().string();
-    OfflineSession session {&LogGenerator::generatorFromTechnology, true};
+    OfflineSession session {
+        &LogGenerator::generatorFromTechnology, true, {.resources = resources, .log = log, .console = log}};
 };
 
 TEST_F(OfflineSessionTest, MessageAtTheVeryTimeOfATickComesBeforeIt)
@@ -97,6 +100,45 @@ TEST_F(OfflineSessionTest, NothingToSaveIsSaid)
     const Outcome saved = session.saveSnapshot(folder);
     ASSERT_FALSE(saved);
     EXPECT_EQ(saved.failure().text, "there is no message to save");
+}
+
+/// Hears the ticks of a session that keeps no history, as seconds after its start.
+class OfflineTicksTest : public OfflineSessionTest {
+protected:
+    OfflineTicksTest()
+    {
+        decoding.setTickHandler([this](Moment tick) {
+            ticks += std::to_string(std::chrono::duration_cast<std::chrono::seconds>(tick - Start).count()) + " ";
+        });
+    }
+    std::string ticksUpTo(std::initializer_list<std::chrono::milliseconds> offsets)
+    {
+        for (const auto offset : offsets)
+            decoding.apply({Start + offset, record});
+        return std::exchange(ticks, {});
+    }
+
+    std::string ticks;
+    OfflineSession decoding {
+        &LogGenerator::generatorFromTechnology, false, {.resources = resources, .log = log, .console = log}};
+};
+
+TEST_F(OfflineTicksTest, TicksFallEveryTwoSecondsWhetherMessagesComeOrNot)
+{
+    EXPECT_EQ(ticksUpTo({0s, 1s}), "");
+    EXPECT_EQ(ticksUpTo({2000ms}), ""); // a message at the very time of a tick comes before it
+    EXPECT_EQ(ticksUpTo({2001ms}), "2 ");
+    EXPECT_EQ(ticksUpTo({9s}), "4 6 8 ");
+    EXPECT_EQ(decoding.lastTime(), Start + 9s);
+}
+
+TEST_F(OfflineTicksTest, LongPauseEndsTheTicksUntilTheNextMessage)
+{
+    ticksUpTo({0s});
+    const std::string pause = ticksUpTo({24h * 365 + 1s});
+    EXPECT_TRUE(pause.starts_with("2 4 ")) << pause;
+    EXPECT_TRUE(pause.ends_with(" 598 600 ")) << pause;
+    EXPECT_EQ(ticksUpTo({24h * 365 + 3s}), "31536002 ");
 }
 
 } // namespace

@@ -82,7 +82,7 @@ protected:
         if (!file)
             return false;
         model = file->makeModel(loop, &LogGenerator::generatorFromTechnology, screens,
-            [this](const std::string& line) { reported += line + "\n"; });
+            [this](const std::string& line) { reported += line + "\n"; }, {loop, resources, log, log});
         model->restartMonitor();
         loop.runQueued();
         return true;

@@ -9,7 +9,7 @@ namespace {
 template <typename Section> void expectOnly(const char* name, const char* trace)
 {
     LogRecorder recorder;
-    SectionRegistry registry;
+    SectionRegistry registry(recorder.context());
     Section section(registry);
     EXPECT_EQ(section.getSectionName(), name);
     EXPECT_EQ(registry.classDict.find(name)->second, &section);

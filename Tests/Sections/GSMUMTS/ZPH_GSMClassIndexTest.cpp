@@ -92,7 +92,7 @@ TEST(ZPH_GSMClassIndexTest, EveryCodeIsDeliveredInTheOrderOfCreation)
 TEST(ZPH_GSMClassIndexTest, RecordsRunThroughTheirSectionsInThatOrder)
 {
     LogRecorder recorder;
-    const ZPH_GSMClassIndex index;
+    const ZPH_GSMClassIndex index(recorder.context());
     recorder.takeLog();
     for (const std::uint32_t code : {0x7132u, 0x5137u}) {
         for (Base* section : *index.getSubscribers(code))
@@ -107,7 +107,7 @@ TEST(ZPH_GSMClassIndexTest, ReleasingItPrintsItsLineOnce)
 {
     LogRecorder recorder;
     {
-        const ZPH_GSMClassIndex index;
+        const ZPH_GSMClassIndex index(recorder.context());
     }
     EXPECT_EQ(recorder.takeConsole(), "Deallocing ZPH_GSMClassIndex\nDeallocing ClassIndex\n");
 }

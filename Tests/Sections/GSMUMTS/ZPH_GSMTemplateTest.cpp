@@ -23,12 +23,7 @@ class ZPH_GSMTemplateTest : public testing::Test {
 protected:
     ZPH_GSMTemplateTest()
     {
-        Resources::install(&_resources);
         generator->getDisplayFromState(state); // builds it
-    }
-    ~ZPH_GSMTemplateTest() override
-    {
-        Resources::install(nullptr);
     }
 
     Value display()
@@ -76,7 +71,8 @@ protected:
         }
     }
 
-    std::unique_ptr<ZPH_GSMLogGenerator> generator = ZPH_GSMLogGenerator::generator();
+    const DirectoryResources resources {sourcePath("Resources")};
+    std::unique_ptr<ZPH_GSMLogGenerator> generator = ZPH_GSMLogGenerator::generator({.resources = resources});
     Dictionary state;
 
 private:
@@ -89,8 +85,6 @@ private:
                 collect(inner, path.empty() ? key : path + ": " + key, found);
         }
     }
-
-    DirectoryResources _resources {sourcePath("Resources")};
 };
 
 std::multiset<std::string> keysOf(const Value& value)

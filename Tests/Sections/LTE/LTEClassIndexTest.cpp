@@ -55,7 +55,7 @@ TEST(LTEClassIndexTest, ReleasingItPrintsItsLineOnce)
 {
     LogRecorder log;
     {
-        const LTEClassIndex index;
+        const LTEClassIndex index(log.context());
     }
     EXPECT_EQ(log.takeConsole(), "Deallocing LTEClassIndex\nDeallocing ClassIndex\n");
 }

@@ -9,7 +9,7 @@ class LTETemplateTest : public TemplateFixture { };
 
 TEST_F(LTETemplateTest, EveryKeyOfEverySectionStandsInTheTemplateAndIsWritten)
 {
-    const auto generator = LTELogGenerator::generator();
+    const auto generator = LTELogGenerator::generator(context);
     build(*generator);
     const std::string shipped = outline();
     for (const std::uint32_t code : {0xB0C2u, 0xB0C1u, 0xB17Fu, 0xB180u})

@@ -12,17 +12,8 @@ constexpr const char* Trace = "<4>RRC Info\n";
 class RRC_StateTest : public SectionFixture<RRC_State>, private DiagnosticLog {
 protected:
     RRC_StateTest()
-        : SectionFixture(Dictionary::make())
+        : SectionFixture(Dictionary::make(), this)
     {
-        DiagnosticLog::install(this);
-    }
-    ~RRC_StateTest() override
-    {
-        stopListening();
-    }
-    static void stopListening()
-    {
-        DiagnosticLog::install(nullptr);
     }
     static RecordBuilder record(std::uint32_t flag, std::uint32_t mode)
     {
@@ -94,11 +85,18 @@ TEST_F(RRC_StateTest, DiagnosticLogTellsTheSectionTheModeAndItsName)
         "Display Dict = {\"State\": \"Unknown RRC Mode\"}, rrc mode = 255 Unknown RRC Mode\n");
 }
 
-TEST_F(RRC_StateTest, WithoutADiagnosticLogItGoesOn)
+class UnheardRRC_StateTest : public SectionFixture<RRC_State> {
+protected:
+    UnheardRRC_StateTest()
+        : SectionFixture(Dictionary::make())
+    {
+    }
+};
+
+TEST_F(UnheardRRC_StateTest, WithoutADiagnosticLogItGoesOn)
 {
-    stopListening();
-    EXPECT_EQ(shownState(1, 1), "\"Connecting\"");
-    EXPECT_EQ(diagnostics, "");
+    deliver(Code, RecordBuilder(Code, 15).u8(13, 1).u8(14, 1));
+    EXPECT_EQ(shown("State"), "\"Connecting\"");
 }
 
 } // namespace

@@ -37,7 +37,7 @@ TEST(UTRANClassIndexTest, TransportChannelsComeBeforeTheCodedCompositeOnes)
 TEST(UTRANClassIndexTest, RecordTooShortForEitherIsTracedByBothInOrder)
 {
     LogRecorder log;
-    const UTRANClassIndex index;
+    const UTRANClassIndex index(log.context());
     log.takeLog();
     const Bytes record(16, 0xFF);
     for (Base* section : *index.getSubscribers(0xD00C))
@@ -49,7 +49,7 @@ TEST(UTRANClassIndexTest, ReleasingItPrintsOnlyTheCommonLine)
 {
     LogRecorder log;
     {
-        const UTRANClassIndex index;
+        const UTRANClassIndex index(log.context());
     }
     EXPECT_EQ(log.takeConsole(), "Deallocing ClassIndex\n");
 }

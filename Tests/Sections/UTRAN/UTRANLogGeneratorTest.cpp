@@ -16,6 +16,7 @@ protected:
     FakeRunLoop time;
     LogRecorder log;
     FakeResources resources;
+    const Context context {time, resources, log, log};
     Dictionary state;
 
     std::string displayOf(UTRANLogGenerator& generator)
@@ -28,7 +29,7 @@ protected:
 TEST_F(UTRANLogGeneratorTest, WithoutATemplateTheStartCommandHasTwoEmptyLists)
 {
     resources.lists["LTE"] = Dictionary::make();
-    const auto generator = UTRANLogGenerator::generator();
+    const auto generator = UTRANLogGenerator::generator(context);
     EXPECT_EQ(displayText(generator->getStartCommand()),
         "{\"SetState\": \"Streaming\", \"SetZephyrLogCodes\": [], \"SetRkExtraCodes\": []}");
     EXPECT_EQ(log.takeLog(), "");
@@ -36,7 +37,7 @@ TEST_F(UTRANLogGeneratorTest, WithoutATemplateTheStartCommandHasTwoEmptyLists)
 
 TEST_F(UTRANLogGeneratorTest, WithoutATemplateItAnswersEveryOperation)
 {
-    const auto generator = UTRANLogGenerator::generator();
+    const auto generator = UTRANLogGenerator::generator(context);
     generator->updateState(state, RecordBuilder(0xB0C2, 40));
     EXPECT_TRUE(generator->generateLogUsingState(state).isAbsent());
     EXPECT_EQ(generator->getSaveContentsFromState(state)->count(), 2u);
@@ -47,7 +48,7 @@ TEST_F(UTRANLogGeneratorTest, FirstPathWithUTRANInAnyCaseIsTheTemplate)
 {
     resources.lists["LTE"] = Dictionary::make();
     resources.lists["My_utran2"] = Dictionary::make({{"Chosen", "yes"}});
-    const auto generator = UTRANLogGenerator::generator();
+    const auto generator = UTRANLogGenerator::generator(context);
     EXPECT_NE(log.takeLogWith("<3>Created UTRANLogGenerator object\n"), "");
     EXPECT_EQ(displayOf(*generator), "{\"Chosen\": \"yes\"}");
 }
@@ -56,14 +57,14 @@ TEST_F(UTRANLogGeneratorTest, FirstOfSeveralInTheListedOrderIsTheTemplate)
 {
     resources.lists["B.utran.1"] = Dictionary::make({{"Chosen", "first"}});
     resources.lists["UTRAN"] = Dictionary::make({{"Chosen", "second"}});
-    EXPECT_EQ(displayOf(*UTRANLogGenerator::generator()), "{\"Chosen\": \"first\"}");
+    EXPECT_EQ(displayOf(*UTRANLogGenerator::generator(context)), "{\"Chosen\": \"first\"}");
 }
 
 TEST_F(UTRANLogGeneratorTest, UTRANAnywhereInThePathCounts)
 {
     resources.lists["LTE"] = Dictionary::make({{"Chosen", "no"}});
     resources.lists["Of utran/LTE"] = Dictionary::make();
-    EXPECT_EQ(displayOf(*UTRANLogGenerator::generator()), "{\"Chosen\": \"no\"}")
+    EXPECT_EQ(displayOf(*UTRANLogGenerator::generator(context)), "{\"Chosen\": \"no\"}")
         << "the name alone tells the resource";
 }
 
@@ -71,7 +72,7 @@ TEST_F(UTRANLogGeneratorTest, LogTellsItOnceItIsThere)
 {
     resources.lists["UTRAN"] = Dictionary::make();
     {
-        const auto generator = UTRANLogGenerator::generator();
+        const auto generator = UTRANLogGenerator::generator(context);
         const std::string lines = log.takeLog();
         const auto initialised = lines.find("<3>Class Index: 1\n");
         ASSERT_NE(initialised, std::string::npos) << lines;

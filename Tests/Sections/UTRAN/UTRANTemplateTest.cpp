@@ -9,7 +9,7 @@ class UTRANTemplateTest : public TemplateFixture { };
 
 TEST_F(UTRANTemplateTest, EveryKeyOfEverySectionStandsInTheTemplateAndIsWritten)
 {
-    const auto generator = UTRANLogGenerator::generator();
+    const auto generator = UTRANLogGenerator::generator(context);
     build(*generator);
     const std::string shipped = outline();
     generator->updateState(state,
@@ -34,7 +34,7 @@ TEST_F(UTRANTemplateTest, EveryKeyOfEverySectionStandsInTheTemplateAndIsWritten)
 
 TEST_F(UTRANTemplateTest, StartCommandAsksForEveryCode)
 {
-    const auto generator = UTRANLogGenerator::generator();
+    const auto generator = UTRANLogGenerator::generator(context);
     const DictionaryRef command = generator->getStartCommand();
     EXPECT_EQ((*command)["SetZephyrLogCodes"].list()->count(), 5u);
     EXPECT_EQ((*command)["SetRkExtraCodes"].list()->count(), 3u);

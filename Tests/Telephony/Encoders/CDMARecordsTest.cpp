@@ -35,7 +35,7 @@ protected:
                  "k1xRoamingHome", "kSystemId", "kNetworkId", "kPacketZoneId", "kBaseId", "kProtocolRevision"})
             layout->set(variable, variable);
         resources.lists["C2KTemplate"] = layout;
-        C2KLogGenerator::getDisplayFromState(state);
+        generator.getDisplayFromState(state);
         log.takeLog();
     }
 
@@ -83,7 +83,7 @@ protected:
     LogRecorder log;
     FakeResources resources;
     Dictionary state;
-    C2KLogGenerator generator;
+    C2KLogGenerator generator {{.resources = resources, .log = log, .console = log}};
 };
 
 std::string decimals(double number)

@@ -31,7 +31,7 @@ protected:
 
     LogRecorder log;
     Dictionary state;
-    GSMLogGenerator generator;
+    GSMLogGenerator generator {log.context()};
     IFXWorld world {Scene::Drive, 5};
 };
 

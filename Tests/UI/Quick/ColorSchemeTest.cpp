@@ -37,7 +37,7 @@ public:
         _thread.wait();
         QDBusConnection::disconnectFromBus(PortalConnection);
     }
-    /// Tells that a setting has another value now.
+    /// Reports that a setting has another value now.
     static void tellChange(const QString& key, uint value)
     {
         QDBusMessage signal = QDBusMessage::createSignal(

@@ -20,7 +20,7 @@ namespace {
 
 struct Ended {
     std::string output; // all that reached the terminal
-    int status = 0; // as waitpid tells it
+    int status = 0; // as waitpid says it
 };
 
 /// Runs the action in a process of its own on a terminal of 20 by 4.
@@ -35,7 +35,7 @@ Ended runOnTerminal(const char* kind, const std::function<void()>& action)
         ::setenv("TERM", kind, 1);
         ::setenv("LC_ALL", "C.UTF-8", 1);
         for (const char* name :
-            {"LINES", "COLUMNS", "TERMINFO", "TERMINFO_DIRS"}) // they would tell of another terminal
+            {"LINES", "COLUMNS", "TERMINFO", "TERMINFO_DIRS"}) // they would speak of another terminal
             ::unsetenv(name);
         action();
         std::exit(0);

@@ -29,7 +29,7 @@ std::string parsed(std::string_view bytes)
     return value ? valueText(*value) : Refused;
 }
 
-/// A binary list in the making; what the trailer tells can be falsified.
+/// A binary list in the making; what the trailer says can be falsified.
 struct BinaryList {
     std::vector<std::string> objects;
     std::size_t offsetWidth = 2;
