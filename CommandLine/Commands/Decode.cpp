@@ -1,5 +1,6 @@
 #include "CommandLine/Commands/Decode.h"
 
+#include "CommandLine/Commands/SeparateDecoding.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/MessageText.h"
@@ -118,6 +119,8 @@ private:
 
 int decode(const DecodeOptions& options, const Context& context)
 {
+    if (options.separate)
+        return decodeSeparately(options, context);
     return Decoding(options, context).run();
 }
 

@@ -32,6 +32,8 @@ struct OutputOptions {
     OutputFormat format = OutputFormat::Tree;
     std::vector<std::string> paths; // globs of the leaves that Tree, Json, Changes and Csv are to show; empty: all
     std::vector<TableColumn> columns; // of Table
+    std::string file; // said first on every line, and above a tree; empty: nowhere
+    bool hasHeader = true; // of Csv and Table
 };
 
 /// Prints displays in one format to a stream, in large writes.
@@ -53,12 +55,14 @@ public:
     bool flush();
 
 private:
+    void printHeader();
     void flushWhenLarge();
 
     std::FILE* _stream;
     const OutputOptions& _options;
     const OutputFormat _format;
     PathChoice _paths;
+    const std::string _lineStart; // of CSV; of JSON's objects, their brace included
     std::string _gathered;
     DisplayChanges _changes;
     bool _hasFailed = false;
