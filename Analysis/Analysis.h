@@ -63,14 +63,16 @@ public:
 
     /// The serving cell as of the last message; null while none is known. Stays where it is until the next message.
     const Cell* serving() const;
+    /// Whether the display says that no cell serves.
+    bool isOutOfService() const;
     /// Everything, as of the last message, with its time.
     const CellReport& report() const;
     /// A path in the display tree; empty for no origin.
     const std::string& pathOf(const Origin& origin) const;
 
 private:
-    class Reading;
-    std::unique_ptr<Reading> _reading;
+    class State;
+    std::unique_ptr<State> _state;
     std::vector<AnalysisListener*> _listeners;
 };
 

@@ -14,14 +14,8 @@ constexpr std::array<std::string_view, LevelCount> LevelNames {
 constexpr std::array<std::string_view, static_cast<std::size_t>(CellKey::FirstLevel)> KeyNames {"plmn", "operator",
     "area", "cell", "site", "rnc", "sector", "id", "channel", "band", "downlinkMHz", "uplinkMHz", "bandwidthMHz"};
 
-/// What cells of a technology are compared by, the best first.
-constexpr std::array<std::array<Level, 2>, 5> Strengths {{
-    {Level::RSSI, Level::C1}, // GSM
-    {Level::RSCP, Level::EcNo}, // UMTS
-    {Level::RSRP, Level::RSRQ}, // LTE
-    {Level::EcIo, Level::RSSI}, // CDMA
-    {Level::EcIo, Level::RSSI}, // EV-DO
-}};
+/// What cells of a technology are compared by.
+constexpr std::array<Level, 5> Strengths {Level::RSSI, Level::RSCP, Level::RSRP, Level::EcIo, Level::EcIo};
 
 /// Whether two values contradict each other; what is not known does not.
 bool contradicts(const std::optional<std::uint32_t>& left, const std::optional<std::uint32_t>& right)
@@ -61,19 +55,9 @@ std::string_view cellKeyName(CellKey key)
     return position < KeyNames.size() ? KeyNames[position] : LevelNames[position - KeyNames.size()];
 }
 
-std::optional<Level> Cell::strengthLevel() const
+Level strengthLevelOf(RadioTechnology technology)
 {
-    for (const Level which : Strengths[static_cast<std::size_t>(technology)]) {
-        if (level(which))
-            return which;
-    }
-    return std::nullopt;
-}
-
-std::optional<double> Cell::strength() const
-{
-    const auto which = strengthLevel();
-    return which ? level(*which) : std::nullopt;
+    return Strengths[static_cast<std::size_t>(technology)];
 }
 
 bool isSameCell(const Cell& left, const Cell& right)

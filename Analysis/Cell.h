@@ -47,6 +47,9 @@ enum class CellKey : std::uint8_t {
 };
 inline constexpr std::size_t CellKeyCount = static_cast<std::size_t>(CellKey::End);
 
+/// What cells of the technology are compared by: RSSI, RSCP, RSRP, or EcIo for both kinds of CDMA.
+Level strengthLevelOf(RadioTechnology technology);
+
 constexpr CellKey cellKeyOf(Level level)
 {
     return static_cast<CellKey>(static_cast<std::size_t>(CellKey::FirstLevel) + static_cast<std::size_t>(level));
@@ -90,6 +93,9 @@ struct Cell {
     std::array<std::optional<double>, LevelCount> levels;
     std::array<Origin, CellKeyCount> origins; // by key; none for what is not known
     Moment stored {}; // when an identity or level of it was last stored
+    /// Of a serving cell: the first message that showed it. Nothing of it was stored before.
+    std::uint64_t sinceMessage = 0;
+    Moment since {};
 
     const std::optional<double>& level(Level which) const
     {
@@ -99,10 +105,17 @@ struct Cell {
     {
         return origins[static_cast<std::size_t>(key)];
     }
-    /// The level that cells of the technology are compared by: RSRP, RSCP, RSSI or EcIo; what stands in for it where
-    /// the display holds no such level, or none.
-    std::optional<Level> strengthLevel() const;
-    std::optional<double> strength() const;
+    /// What cells of the technology are compared by, where it is known of this one.
+    std::optional<Level> strengthLevel() const
+    {
+        const Level which = strengthLevelOf(technology);
+        return level(which) ? std::optional(which) : std::nullopt;
+    }
+    /// That level; none where it is not known.
+    const std::optional<double>& strength() const
+    {
+        return level(strengthLevelOf(technology));
+    }
 };
 
 /// Whether both are the same cell as far as both tell: technology, and each of channel, id and cell that both know; at

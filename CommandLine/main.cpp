@@ -1,4 +1,4 @@
-// spectrel: the application with its terminal screens, and the commands watch, decode, view, record and channel.
+// spectrel: the application with its terminal screens, and the commands.
 
 #include "CommandLine/Commands/Application.h"
 #include "CommandLine/Commands/Arguments.h"
@@ -18,7 +18,7 @@ using namespace spectrel;
 /// A live session tells the system log, a recording that is decoded again does not.
 bool isLive(Job job)
 {
-    return job != Job::Decode && job != Job::View;
+    return job != Job::Decode && job != Job::View && job != Job::Mark && job != Job::Report;
 }
 
 std::string portPrefix(Job job)
@@ -46,6 +46,10 @@ int run(const Arguments& arguments, const Context& context)
         return record(arguments.record, context);
     case Job::Channel:
         return channel(arguments.channel);
+    case Job::Mark:
+        return mark(arguments.mark);
+    case Job::Report:
+        return writeReport(arguments.report);
     case Job::Application:
         return runApplication(arguments, context);
     }

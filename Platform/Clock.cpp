@@ -24,6 +24,11 @@ const UTCClock utcClock;
 
 } // namespace
 
+std::chrono::nanoseconds Clock::steady() const
+{
+    return std::chrono::steady_clock::now().time_since_epoch();
+}
+
 const Clock& Clock::utc()
 {
     return utcClock;

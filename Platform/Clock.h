@@ -2,6 +2,7 @@
 
 #include "Values/Moment.h"
 
+#include <chrono>
 #include <cstdint>
 #include <string>
 #include <string_view>
@@ -18,6 +19,8 @@ class Clock {
 public:
     virtual ~Clock() = default;
     virtual Moment now() const = 0;
+    /// For intervals: the time since some moment that stays the same. Unlike `now` nobody sets it.
+    virtual std::chrono::nanoseconds steady() const;
     virtual ZoneState zoneAt(Moment moment) const = 0;
     /// The moment in the device's time zone by a pattern such as "'Updated' yyyy-MM-dd 'at' HH:mm:ss": quoted text is
     /// literal, yyyy MM dd HH mm ss are the calendar fields.

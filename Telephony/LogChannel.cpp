@@ -135,7 +135,7 @@ std::optional<Bytes> LogChannel::handleRequest(std::int32_t id, ByteView body)
 void LogChannel::startStreaming(Subscription subscription)
 {
     const std::string client = _status.client;
-    _status = {_status.name, client, subscription.description(), true, false, _clock.now(), 0, 0, 0, 0};
+    _status = {_status.name, client, subscription.description(), true, false, _clock.steady(), 0, 0, 0, 0};
     printServiceLine(_status.name + ": streaming " + _status.wish + " to " + client);
     _stream.reset();
     _subscription = std::move(subscription);

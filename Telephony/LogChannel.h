@@ -44,7 +44,7 @@ struct ChannelStatus {
     std::string wish; // "12 codes"
     bool isStreaming = false;
     bool isFull = false; // the client has no room
-    Moment started {}; // with the latest start command
+    std::chrono::nanoseconds started {0}; // steady: with the latest start command
     std::uint64_t sent = 0;
     std::uint64_t notAskedFor = 0;
     std::size_t waiting = 0;

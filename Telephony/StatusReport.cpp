@@ -43,11 +43,11 @@ StatusReport::StatusReport(const Clock& clock, const TelephonyService& service, 
 {
 }
 
-double StatusReport::rate(const ChannelStatus& channel, Moment now) const
+double StatusReport::rate(const ChannelStatus& channel) const
 {
     const auto found = _before.find(channel.name);
     const Counted before = found == _before.end() ? Counted {0, channel.started} : found->second;
-    const std::chrono::duration<double> elapsed = now - before.time;
+    const std::chrono::duration<double> elapsed = _clock.steady() - before.time;
     return elapsed.count() > 0 ? static_cast<double>(channel.sent - before.sent) / elapsed.count() : 0;
 }
 
@@ -56,7 +56,7 @@ std::string StatusReport::headline() const
     const auto channels = _service.status();
     double sum = 0;
     for (const ChannelStatus& channel : channels)
-        sum += rate(channel, _clock.now());
+        sum += rate(channel);
     std::string line = _source.status() + "; " + counted(channels.size(), "client", "clients");
     return channels.empty() ? line : line + ", " + rateText(sum);
 }
@@ -64,11 +64,10 @@ std::string StatusReport::headline() const
 std::vector<std::string> StatusReport::lines()
 {
     std::vector<std::string> lines {headline()};
-    const Moment now = _clock.now();
     std::map<std::string, Counted> counts;
     for (const ChannelStatus& channel : _service.status()) {
-        lines.push_back(channelLine(channel, rate(channel, now)));
-        counts[channel.name] = {channel.sent, now};
+        lines.push_back(channelLine(channel, rate(channel)));
+        counts[channel.name] = {channel.sent, _clock.steady()};
     }
     _before = std::move(counts);
     return lines;

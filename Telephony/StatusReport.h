@@ -30,9 +30,9 @@ public:
 private:
     struct Counted {
         std::uint64_t sent = 0;
-        Moment time {};
+        std::chrono::nanoseconds time {0}; // steady
     };
-    double rate(const ChannelStatus& channel, Moment now) const;
+    double rate(const ChannelStatus& channel) const;
 
     const Clock& _clock;
     const TelephonyService& _service;

@@ -16,6 +16,15 @@ std::string defaultDateForm(Moment moment)
     return text;
 }
 
+std::string secondsForm(Moment moment)
+{
+    const auto seconds = std::chrono::floor<std::chrono::seconds>(moment);
+    char text[40];
+    std::snprintf(text, sizeof text, "%lld.%06lld", static_cast<long long>(seconds.time_since_epoch().count()),
+        static_cast<long long>((moment - seconds).count()));
+    return text;
+}
+
 bool parseDefaultDateForm(std::string_view text, Moment& moment)
 {
     constexpr std::string_view Form = "0000-00-00 00:00:00 +0000"; // 0: a digit

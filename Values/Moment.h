@@ -15,4 +15,7 @@ std::string defaultDateForm(Moment moment);
 /// The moment that such a text says; none when it is not in that form.
 bool parseDefaultDateForm(std::string_view text, Moment& moment);
 
+/// Seconds since 1970 with six decimals: "1733000000.123456".
+std::string secondsForm(Moment moment);
+
 } // namespace spectrel

@@ -1,10 +1,13 @@
 #include "CommandLine/Commands/Arguments.h"
 
 #include "CommandLine/Options/OptionTypes.h"
+#include "Records/Beside/Marks.h"
 
 #include <CLI/CLI.hpp>
 #include <iostream>
 #include <limits>
+#include <utility>
+#include <vector>
 
 namespace spectrel {
 
@@ -23,11 +26,26 @@ constexpr const char* Environment =
     "  NO_COLOR                no colours in the terminal screens\n"
     "Exit status: 0 done, 1 something could not be done, 2 wrong usage.";
 
-constexpr OptionForm<OutputFormat> FormatForm {
-    "tree|json|changes|csv|table|none", outputFormatNamed, "is not one of tree, json, changes, csv, table, none"};
+constexpr OptionForm<OutputFormat> FormatForm {"tree|json|changes|csv|table|cells|summary|events|none",
+    outputFormatNamed, "is not one of tree, json, changes, csv, table, cells, summary, events, none"};
+
+constexpr OptionForm<std::string> CommandForm {"COMMAND",
+    [](std::string_view text) { return text.empty() ? std::nullopt : std::optional<std::string>(text); },
+    "is no command"};
+
+std::optional<std::string> parseNote(std::string_view text)
+{
+    const bool isNote = !text.empty() && text.size() <= LongestNote;
+    return isNote ? std::optional<std::string>(text) : std::nullopt;
+}
+
+constexpr OptionForm<std::string> NoteForm {"TEXT", parseNote, "is no note of 1 to 4096 bytes"};
+static_assert(LongestNote == 4096);
 
 constexpr OptionForm<std::vector<TableColumn>> ColumnsForm {
     "PATH[=NAME],...", parseTableColumns, "is no list of columns PATH[=NAME],..."};
+
+constexpr OptionForm<TimeForm> TimeFormForm {"seconds|rfc3339", timeFormNamed, "is not one of seconds, rfc3339"};
 
 void addOutput(CLI::App& command, OutputOptions& output)
 {
@@ -41,6 +59,9 @@ void addOutput(CLI::App& command, OutputOptions& output)
         ->check([](const std::string& glob) { return glob.empty() ? "'' is no path" : ""; });
     addFormedOption(command, "--columns", output.columns, ColumnsForm,
         "With --format table: the leaves that make its columns, and what stands above them");
+    addFormedOption(command, "--time", output.time, TimeFormForm,
+        "How times are printed: seconds since 1970 (default), or as 2024-03-05T14:07:31.123456Z");
+    command.add_flag("--sources", output.withSources, "With --format cells: where in the tree each value comes from");
 }
 
 /// What no single option can say.
@@ -53,6 +74,57 @@ void checkOutput(const OutputOptions& output)
         throw CLI::ValidationError("--columns", "goes with --format table only");
     if (isTable && !output.paths.empty())
         throw CLI::ValidationError("--path", "a table has its --columns");
+    if (printsCells(output.format) && !output.paths.empty())
+        throw CLI::ValidationError("--path", "chooses leaves, of which cells and summary print none");
+    if (output.withSources && output.format != OutputFormat::Cells)
+        throw CLI::ValidationError("--sources", "goes with --format cells only");
+}
+
+/// Several may be given. The reader throws what makes the option wrong usage.
+template <typename Take>
+CLI::Option* addRepeatedOption(CLI::App& command, const std::string& name, Take take, const std::string& description)
+{
+    const auto takeAll = [take, name](const std::vector<std::string>& texts) {
+        for (const std::string& text : texts) {
+            if (const Outcome taken = take(text); !taken)
+                throw CLI::ValidationError(name, taken.failure().text);
+        }
+    };
+    return command.add_option_function<std::vector<std::string>>(name, takeAll, description)
+        ->expected(1, 1)
+        ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
+}
+
+void addEvents(CLI::App& command, EventOptions& events)
+{
+    const auto takeAlarm = [](const std::string& text, auto store) -> Outcome {
+        auto alarm = parseAlarm(text);
+        if (!alarm)
+            return alarm.failure();
+        store(*std::move(alarm));
+        return Done();
+    };
+    addRepeatedOption(
+        command, "--alarm",
+        [&events, takeAlarm](const std::string& text) {
+            return takeAlarm(text, [&events](AlarmCondition alarm) { events.alarms.push_back(std::move(alarm)); });
+        },
+        "Raise an alarm, such as 'RSRP < -110 for 10s': a level of the serving cell or a path in quotes, a comparison, "
+        "a number and a time; may be given several times")
+        ->type_name("ALARM");
+    addFormedOption(command, "--alarm-command", events.alarmCommand, CommandForm,
+        "Run this command of the shell at each alarm, with the event on its standard input");
+    addRepeatedOption(
+        command, "--until",
+        [&events, takeAlarm](const std::string& text) {
+            return takeAlarm(text, [&events](AlarmCondition alarm) { events.until = std::move(alarm); });
+        },
+        "End when this alarm is raised")
+        ->type_name("ALARM");
+    addRepeatedOption(
+        command, "--threshold", [&events](const std::string& text) { return events.thresholds.set(text); },
+        "With --format events: set what a finding depends on; may be given several times")
+        ->type_name("NAME=VALUE");
 }
 
 void addLimits(CLI::App& command, std::optional<std::uint64_t>& count, const char* what,
@@ -115,6 +187,7 @@ void addWatch(CLI::App& program, Arguments& arguments)
     command.callback([&arguments] { arguments.job = Job::Watch; });
     addCommon(command, arguments);
     addOutput(command, arguments.watch.output);
+    addEvents(command, arguments.watch.events);
     addLimits(command, arguments.watch.count, "End after this many refreshes", arguments.watch.duration);
 }
 
@@ -129,6 +202,7 @@ void addDecode(CLI::App& program, Arguments& arguments)
         ->required()
         ->type_name("");
     addOutput(command, decode.output);
+    addEvents(command, decode.events);
     command.add_flag("--each", decode.each, "With --format json: one line for each message");
     addTechnology(command, decode.technology);
     addFormedOption(command, "--snapshot", decode.snapshotDirectory, FolderForm,
@@ -189,6 +263,40 @@ void addChannel(CLI::App& program, Arguments& arguments)
         command, "--format", channel.format, ChannelFormatForm, "How the bands are printed (default: text)");
 }
 
+void addMark(CLI::App& program, Arguments& arguments)
+{
+    CLI::App& command = *program.add_subcommand("mark", "Write a bookmark of this moment into a running recording");
+    command.callback([&arguments] { arguments.job = Job::Mark; });
+    addCommon(command, arguments);
+    addFormedOption(command, "TEXT", arguments.mark.note, NoteForm, "What there is to note")->required()->type_name("");
+    addFormedOption(command, "--recording", arguments.mark.recording, FileForm,
+        "The recording beside which it is written (default: that of the running recorder)");
+}
+
+void addReport(CLI::App& program, Arguments& arguments)
+{
+    ReportOptions& report = arguments.report;
+    CLI::App& command =
+        *program.add_subcommand("report", "Write recordings as one HTML page: levels, cells, events and findings");
+    command.callback([&arguments] { arguments.job = Job::Report; });
+    addCommon(command, arguments);
+    command
+        .add_option("FILE", report.files,
+            "The recordings. Files that `record` has numbered (drive.pcap, drive-2.pcap) are one recording; others "
+            "stand "
+            "side by side. - is standard input")
+        ->required()
+        ->type_name("");
+    addFormedOption(command, "-o,--output", report.output, FileForm,
+        "The page; a report that is there is overwritten, any other file is not. - is standard output")
+        ->required();
+    addTechnology(command, report.technology);
+    addRepeatedOption(
+        command, "--threshold", [&report](const std::string& text) { return report.thresholds.set(text); },
+        "Set what a finding depends on; may be given several times")
+        ->type_name("NAME=VALUE");
+}
+
 /// What no single option can tell.
 void checkTogether(const Arguments& arguments)
 {
@@ -224,6 +332,8 @@ std::optional<int> readArguments(int argc, char** argv, Arguments& arguments)
     addView(program, arguments);
     addRecord(program, arguments);
     addChannel(program, arguments);
+    addMark(program, arguments);
+    addReport(program, arguments);
     try {
         program.parse(argc, argv);
         checkTogether(arguments);

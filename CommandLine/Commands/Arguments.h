@@ -2,7 +2,9 @@
 
 #include "CommandLine/Commands/Channel.h"
 #include "CommandLine/Commands/Decode.h"
+#include "CommandLine/Commands/Mark.h"
 #include "CommandLine/Commands/Record.h"
+#include "CommandLine/Commands/Report.h"
 #include "CommandLine/Commands/View.h"
 #include "CommandLine/Commands/Watch.h"
 #include "CommandLine/Program/ExitStatus.h"
@@ -15,7 +17,7 @@
 
 namespace spectrel {
 
-enum class Job : std::uint8_t { Application, Watch, Decode, View, Record, Channel };
+enum class Job : std::uint8_t { Application, Watch, Decode, View, Record, Channel, Mark, Report };
 
 /// Which screens the application was asked to open; by default it finds out by itself.
 enum class ScreenChoice : std::uint8_t { Automatic, Graphical, Terminal };
@@ -31,6 +33,8 @@ struct Arguments {
     WatchOptions watch;
     RecordOptions record;
     ChannelOptions channel;
+    MarkOptions mark;
+    ReportOptions report;
 };
 
 /// Reads the command line. An exit status when the program is done with that: after --help, --version or wrong usage,

@@ -1,7 +1,7 @@
 #include "CommandLine/Commands/Channel.h"
 
 #include "Analysis/Bands/Bands.h"
-#include "CommandLine/Output/JsonText.h"
+#include "Values/JsonText.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/ExitStatus.h"
 #include "Values/Table.h"

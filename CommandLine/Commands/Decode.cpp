@@ -1,13 +1,17 @@
 #include "CommandLine/Commands/Decode.h"
 
+#include "CommandLine/Commands/EventOutput.h"
 #include "CommandLine/Commands/SeparateDecoding.h"
+#include "CommandLine/Output/CellOutput.h"
 #include "CommandLine/Program/ErrorLine.h"
+#include "CommandLine/Program/ProviderNames.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/MessageText.h"
 #include "Monitor/Viewing/OfflineSession.h"
 
 #include <cstdio>
 #include <exception>
+#include <optional>
 
 namespace spectrel {
 
@@ -22,8 +26,14 @@ public:
         , _journal(printsChanges(options.output.format) ? &_session.displayState().followChanges() : nullptr)
         , _output(stdout, options.output)
     {
+        if (options.output.format == OutputFormat::Events || options.events.hasAlarms())
+            _events.emplace(_session.displayState(), options.events, options.output, _output, &_operators);
         if (options.output.format == OutputFormat::Table)
             _session.setTickHandler([this](Moment tick) { _output.printRow(tick, _session.display()); });
+        if (printsCells(options.output.format)) {
+            _cells.emplace(_session.displayState(), _output, options.output, &_operators);
+            _session.setTickHandler([this](Moment tick) { _cells->refresh(tick); });
+        }
     }
 
     int run()
@@ -32,17 +42,29 @@ public:
             if (!decodeFile(file))
                 break;
         }
+        if (_events)
+            _events->finish();
         if (!_options.each)
             _output.printDisplay(_session.display());
         if (_session.messages() > 0)
-            _output.printRow(_session.lastTime(), _session.display());
+            printLast();
         saveSnapshot();
+        if (_options.events.until && !_events->isUntilMet())
+            fail("the alarm '" + _options.events.until->text + "' was not raised");
         if (!_output.flush())
             fail("standard output: cannot be written");
         return _status;
     }
 
 private:
+    /// What ticks print, once more after the last message.
+    void printLast()
+    {
+        _output.printRow(_session.lastTime(), _session.display());
+        if (_cells)
+            _cells->refresh(_session.lastTime());
+    }
+
     void fail(const std::string& line)
     {
         _output.flush(); // what was decoded comes before the complaint
@@ -50,7 +72,7 @@ private:
         _status = 1;
     }
 
-    /// False when a message has ended the decoding.
+    /// False when a message or an alarm has ended the decoding.
     bool decodeFile(const std::string& path)
     {
         const bool isStandardInput = path == "-";
@@ -96,7 +118,7 @@ private:
             _output.printNumberedJson(n, _session.display());
         else if (_journal)
             _output.printChanges(n, message.time, _session.display(), *_journal);
-        return true;
+        return !_events || !_events->isUntilMet();
     }
 
     void saveSnapshot()
@@ -111,6 +133,9 @@ private:
     OfflineSession _session;
     Journal* const _journal; // where changes are printed
     OutputWriter _output;
+    ProviderNames _operators;
+    std::optional<CellOutput> _cells;
+    std::optional<EventOutput> _events; // where events are printed
     std::uint64_t _n = 0;
     int _status = 0;
 };

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "CommandLine/Commands/EventOutput.h"
 #include "CommandLine/Output/OutputWriter.h"
 #include "Platform/Context.h"
 #include "Records/Recording.h"
@@ -21,6 +22,7 @@ struct DecodeOptions {
     std::optional<std::string> snapshotDirectory;
     bool separate = false; // each file a session of its own
     std::optional<std::uint64_t> jobs; // with separate: files at a time; as many as there are processors
+    EventOptions events;
 };
 
 /// Decodes the recordings one after the other, as one session or each as its own, and prints the display to standard

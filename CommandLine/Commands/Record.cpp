@@ -2,12 +2,16 @@
 
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/LiveServices.h"
+#include "CommandLine/Program/RecorderPort.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/Session.h"
 #include "Platform/Qt/TerminationSignals.h"
+#include "Records/Beside/Marks.h"
 #include "Records/Recording.h"
 
+#include <filesystem>
 #include <memory>
+#include <string>
 
 namespace spectrel {
 
@@ -20,9 +24,11 @@ class Recorder final : public SessionSink {
 public:
     Recorder(const RecordOptions& options, const Context& context)
         : _options(options)
-        , _files(options.files)
         , _live(context)
+        , _files(options.files, _live.clock())
         , _session(_live.services(), *this, LiveServices::portPrefixFor("Record"))
+        , _marks(_live.services().ports, LiveServices::portPrefixFor("Record"),
+              {[this] { return recording(); }, [this](const std::string& note) { return mark(note); }})
     {
     }
 
@@ -84,14 +90,14 @@ private:
         const auto technology = technologyOfConstant(_session.technology());
         if (!technology || _status != 0)
             return;
-        if (const auto begun = _files.begin(*technology, _live.clock().now()); !begun)
+        if (const auto begun = _files.begin(*technology); !begun)
             fail(begun.failure().text);
     }
 
     void write(Technology technology, ByteView body)
     {
         const std::size_t before = _files.count();
-        if (const auto written = _files.write(technology, _live.clock().now(), body); !written)
+        if (const auto written = _files.write(technology, body); !written)
             return fail(written.failure().text);
         if (before > 0 && _files.count() > before)
             report("recording into " + _files.path());
@@ -103,6 +109,28 @@ private:
             _live.runLoop().quit();
     }
 
+    /// The file that is being written, for whoever asks from another folder.
+    Result<std::string> recording() const
+    {
+        if (_options.files.target == "-")
+            return Failure {"standard output is recorded to, beside which no bookmark can stand"};
+        if (_files.count() == 0)
+            return Failure {"the recorder has no file yet, for no session is open"};
+        std::error_code error;
+        const auto path = std::filesystem::absolute(_files.path(), error);
+        return error ? _files.path() : path.string();
+    }
+
+    Result<std::string> mark(const std::string& note) const
+    {
+        const auto file = recording();
+        if (!file)
+            return file;
+        if (auto appended = appendMark(*file, {_live.clock().now(), note}); !appended)
+            return appended.failure();
+        return file;
+    }
+
     void flush()
     {
         _flushIsDue = false;
@@ -111,10 +139,11 @@ private:
     }
 
     const RecordOptions& _options;
-    RecordingFiles _files;
     LiveServices _live;
+    RecordingFiles _files;
     std::unique_ptr<LogGenerator> _generator; // for its start command: nothing is decoded
     Session _session;
+    RecorderPort _marks;
     std::uint64_t _messages = 0;
     bool _flushIsDue = false;
     int _status = 0;

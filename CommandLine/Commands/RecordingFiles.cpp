@@ -1,5 +1,6 @@
 #include "CommandLine/Commands/RecordingFiles.h"
 
+#include "Records/Beside/Beside.h"
 #include "Records/Capture/CaptureFormat.h"
 #include "Values/OwnFile.h"
 
@@ -55,14 +56,16 @@ std::vector<std::pair<std::uint64_t, fs::path>> numberedFiles(const std::string&
     return files;
 }
 
-/// A file that somebody writes is locked, and stays.
+/// With what stands beside it. A file that somebody writes is locked, and stays.
 void removeUnlessWritten(const fs::path& path)
 {
     const int file = ::open(path.c_str(), O_RDONLY | O_NOFOLLOW | O_NONBLOCK | O_CLOEXEC);
     if (file < 0)
         return;
-    if (::flock(file, LOCK_EX | LOCK_NB) == 0)
+    if (::flock(file, LOCK_EX | LOCK_NB) == 0) {
         ::unlink(path.c_str());
+        removeBeside(path.string());
+    }
     ::close(file);
 }
 
@@ -75,8 +78,9 @@ bool isOther(const std::string& path)
 
 } // namespace
 
-RecordingFiles::RecordingFiles(RecordingFilesOptions options)
+RecordingFiles::RecordingFiles(RecordingFilesOptions options, const Clock& clock)
     : _options(std::move(options))
+    , _clock(clock)
 {
 }
 
@@ -121,33 +125,33 @@ Result<std::uint64_t> RecordingFiles::nextNumber() const
     return latest + 1;
 }
 
-Outcome RecordingFiles::begin(Technology technology, Moment time)
+Outcome RecordingFiles::begin(Technology technology)
 {
-    return _writer ? Done() : beginNext(technology, time);
+    return _writer ? Done() : beginNext(technology);
 }
 
-Outcome RecordingFiles::write(Technology technology, Moment time, ByteView message)
+Outcome RecordingFiles::write(Technology technology, ByteView message)
 {
-    if (!_writer || technology != _technology || isFull(message.size(), time)) {
-        if (auto begun = beginNext(technology, time); !begun)
+    if (!_writer || technology != _technology || isFull(message.size())) {
+        if (auto begun = beginNext(technology); !begun)
             return begun;
     }
-    if (const auto written = _writer->write(time, message); !written)
+    if (const auto written = _writer->write(_clock.now(), message); !written)
         return written.failure().of(spoken(_path));
     _bytes += PacketHeaderSize + message.size();
     return Done();
 }
 
 /// A file holds at least one message, however large.
-bool RecordingFiles::isFull(std::size_t message, Moment time) const
+bool RecordingFiles::isFull(std::size_t message) const
 {
     if (_options.largestFile && _bytes > CaptureHeaderSize
         && _bytes + PacketHeaderSize + message > *_options.largestFile)
         return true;
-    return _options.longestFile && time - _begun >= *_options.longestFile;
+    return _options.longestFile && _clock.steady() - _begun >= *_options.longestFile;
 }
 
-Outcome RecordingFiles::beginNext(Technology technology, Moment time)
+Outcome RecordingFiles::beginNext(Technology technology)
 {
     if (_writer && _options.target == "-")
         return Failure {"standard output: one stream cannot tell of another technology; the recording ends"};
@@ -158,7 +162,7 @@ Outcome RecordingFiles::beginNext(Technology technology, Moment time)
     ++_count;
     _technology = technology;
     _bytes = CaptureHeaderSize;
-    _begun = time;
+    _begun = _clock.steady();
     removeOldest();
     return Done();
 }
@@ -176,6 +180,8 @@ Outcome RecordingFiles::createNext(Technology technology)
         const bool mayOverwrite = isTarget && (_path == "-" || _options.overwrite || isOther(_path));
         auto created = (mayOverwrite ? createRecording : createNewRecording)(_path, technology);
         if (created) {
+            if (_path != "-")
+                removeBeside(_path); // of an earlier recording of this name
             _writer = *std::move(created);
             return Done();
         }

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Platform/Clock.h"
 #include "Records/Recording.h"
 #include "Values/Result.h"
 
@@ -29,14 +30,15 @@ struct RecordingFilesOptions {
 /// technology changes. Files that are being written, here or by another recorder, are never removed.
 class RecordingFiles {
 public:
-    explicit RecordingFiles(RecordingFilesOptions options);
+    /// The clock outlives this; messages have its time.
+    RecordingFiles(RecordingFilesOptions options, const Clock& clock);
 
     // Failures name the file.
     /// Makes the folder at need. Fails when there is no place to write.
     Outcome prepare();
     /// Begins the first file, so that it is there before the first message.
-    Outcome begin(Technology technology, Moment time);
-    Outcome write(Technology technology, Moment time, ByteView message);
+    Outcome begin(Technology technology);
+    Outcome write(Technology technology, ByteView message);
     Outcome flush();
 
     /// A file's name as messages tell it; "-" is standard output.
@@ -52,8 +54,8 @@ public:
     }
 
 private:
-    bool isFull(std::size_t message, Moment time) const;
-    Outcome beginNext(Technology technology, Moment time);
+    bool isFull(std::size_t message) const;
+    Outcome beginNext(Technology technology);
     Outcome createNext(Technology technology);
     std::string numberedPath(Technology technology) const;
     Result<std::uint64_t> nextNumber() const;
@@ -61,6 +63,7 @@ private:
     void removeOldest();
 
     RecordingFilesOptions _options;
+    const Clock& _clock;
     bool _isFolder = false;
     std::uint64_t _number = 0; // of the latest file
     std::unique_ptr<RecordingWriter> _writer;
@@ -68,7 +71,7 @@ private:
     std::string _path;
     std::size_t _count = 0; // of files begun
     std::uint64_t _bytes = 0; // of the current file
-    Moment _begun {}; // the current file
+    std::chrono::nanoseconds _begun {0}; // steady: the current file
     std::vector<std::string> _written; // outside of folders: the files begun, oldest first
 };
 

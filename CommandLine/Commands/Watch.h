@@ -1,5 +1,6 @@
 #pragma once
 
+#include "CommandLine/Commands/EventOutput.h"
 #include "CommandLine/Output/OutputWriter.h"
 #include "Platform/Context.h"
 
@@ -14,6 +15,7 @@ struct WatchOptions {
     OutputOptions output;
     std::optional<std::uint64_t> count; // refreshes
     std::optional<std::chrono::milliseconds> duration;
+    EventOptions events;
 };
 
 /// Prints a live session, once at each refresh, until interrupted or until what was asked for has been printed. Answers

@@ -1,9 +1,9 @@
 #include "CommandLine/Output/DisplayPrinter.h"
 
-#include "CommandLine/Output/JsonText.h"
 #include "Monitor/DisplayOrder.h"
 #include "Monitor/SpectrelModelNode.h"
 #include "Monitor/TreeText.h"
+#include "Values/JsonText.h"
 #include "Values/List.h"
 
 #include <cstddef>

@@ -1,7 +1,8 @@
 #include "CommandLine/Output/OutputWriter.h"
 
 #include "CommandLine/Output/DisplayPrinter.h"
-#include "CommandLine/Output/JsonText.h"
+#include "Values/JsonText.h"
+#include "Values/Moment.h"
 #include "Values/Table.h"
 
 #include <array>
@@ -11,16 +12,6 @@ namespace spectrel {
 namespace {
 
 constexpr std::size_t WriteSize = 64 * 1024;
-
-/// Seconds since 1970 with six decimals.
-std::string timeText(Moment time)
-{
-    const auto seconds = std::chrono::floor<std::chrono::seconds>(time);
-    char text[40];
-    std::snprintf(text, sizeof text, "%lld.%06lld", static_cast<long long>(seconds.time_since_epoch().count()),
-        static_cast<long long>((time - seconds).count()));
-    return text;
-}
 
 /// Whether the field holds nothing that must be quoted. Looks at all of it, so that the machine looks at many at once.
 bool isPlainCsv(std::string_view field)
@@ -75,12 +66,15 @@ std::optional<OutputFormat> outputFormatNamed(std::string_view name)
         std::string_view name;
         OutputFormat format;
     };
-    static constexpr std::array<NamedFormat, 6> Formats {{
+    static constexpr std::array<NamedFormat, 9> Formats {{
         {"tree", OutputFormat::Tree},
         {"json", OutputFormat::Json},
         {"changes", OutputFormat::Changes},
         {"csv", OutputFormat::Csv},
         {"table", OutputFormat::Table},
+        {"cells", OutputFormat::Cells},
+        {"summary", OutputFormat::Summary},
+        {"events", OutputFormat::Events},
         {"none", OutputFormat::None},
     }};
     const auto* known = findRow(Formats, name, &NamedFormat::name);
@@ -141,7 +135,7 @@ void OutputWriter::printChanges(std::uint64_t n, Moment time, const Value& displ
     _changes.update(display, journal, [&](const std::string& path, const std::string* value) {
         if (_format == OutputFormat::Csv) {
             if (stamp.empty())
-                stamp = _lineStart + std::to_string(n) + "," + timeText(time) + ",";
+                stamp = _lineStart + std::to_string(n) + "," + timeText(time, _options.time) + ",";
             _gathered += stamp;
             appendCsvField(path, _gathered);
             _gathered += ',';
@@ -150,7 +144,8 @@ void OutputWriter::printChanges(std::uint64_t n, Moment time, const Value& displ
             return;
         }
         if (stamp.empty())
-            stamp = _lineStart + "\"n\": " + std::to_string(n) + ", \"time\": " + timeText(time) + ", \"path\": ";
+            stamp = _lineStart + "\"n\": " + std::to_string(n) + ", \"time\": " + jsonTimeText(time, _options.time)
+                + ", \"path\": ";
         _gathered += stamp;
         appendJsonText(path, _gathered);
         _gathered += ", \"value\": ";
@@ -167,7 +162,7 @@ void OutputWriter::printRow(Moment time, const Value& display)
 {
     if (_format != OutputFormat::Table)
         return;
-    _gathered += _lineStart + timeText(time);
+    _gathered += _lineStart + timeText(time, _options.time);
     for (const TableColumn& column : _options.columns) {
         _gathered += ',';
         appendCsvField(leafAtPath(display, column.path).value_or(""), _gathered);

@@ -2,6 +2,7 @@
 
 #include "CommandLine/Output/DisplayChanges.h"
 #include "CommandLine/Output/TableColumns.h"
+#include "CommandLine/Output/TimeForm.h"
 #include "Monitor/Journal.h"
 #include "Monitor/PathChoice.h"
 #include "Platform/Clock.h"
@@ -16,15 +17,21 @@
 
 namespace spectrel {
 
-enum class OutputFormat : std::uint8_t { Tree, Json, Changes, Csv, Table, None };
+enum class OutputFormat : std::uint8_t { Tree, Json, Changes, Csv, Table, Cells, Summary, Events, None };
 
-/// "tree", "json", "changes", "csv", "table", "none".
+/// "tree", "json", "changes", "csv", "table", "cells", "summary", "events", "none".
 std::optional<OutputFormat> outputFormatNamed(std::string_view name);
 
 /// Whether displays are printed as their changes.
 constexpr bool printsChanges(OutputFormat format)
 {
     return format == OutputFormat::Changes || format == OutputFormat::Csv;
+}
+
+/// Whether what the display means is printed, at each refresh.
+constexpr bool printsCells(OutputFormat format)
+{
+    return format == OutputFormat::Cells || format == OutputFormat::Summary;
 }
 
 /// What is printed, and how.
@@ -34,6 +41,8 @@ struct OutputOptions {
     std::vector<TableColumn> columns; // of Table
     std::string file; // said first on every line, and above a tree; empty: nowhere
     bool hasHeader = true; // of Csv and Table
+    TimeForm time = TimeForm::Seconds;
+    bool withSources = false; // with Cells: the paths that values come from
 };
 
 /// Prints displays in one format to a stream, in large writes.

@@ -58,8 +58,6 @@ std::optional<std::string> parseAddress(std::string_view text)
     return text.empty() ? std::nullopt : std::optional<std::string>(text);
 }
 
-constexpr OptionForm<Scene> SceneForm {
-    "still|walk|drive|stress", parseScene, "is not one of still, walk, drive, stress"};
 constexpr OptionForm<std::uint32_t> SeedForm {"N", parseSeed, "is no whole number from 0 to 4294967295"};
 constexpr OptionForm<double> RateForm {"FACTOR", parseRate, "is no number from 0.01 to 1000"};
 constexpr OptionForm<double> SpeedForm {"FACTOR", parseSpeed, "is neither 0 nor a number from 0.001 to 1000000"};
@@ -71,8 +69,11 @@ constexpr OptionForm<std::string> AddressForm {
 
 void describeSimulation(CLI::App& program, CLI::Option& simulate, SimulateOptions& options)
 {
-    addFormedOption(program, "--scene", options.scene, SceneForm,
-        "With --simulate: how the phone moves; stress sends every record ten times a second (default: drive)")
+    static const std::string typeName = sceneNames("|"); // the option reads them later
+    static const std::string complaint = "is not one of " + sceneNames(", ");
+    addFormedOption(program, "--scene", options.scene,
+        OptionForm<Scene> {typeName.c_str(), parseScene, complaint.c_str()},
+        "With --simulate: what the phone goes through; stress sends every record ten times a second (default: drive)")
         ->needs(&simulate);
     addFormedOption(
         program, "--seed", options.seed, SeedForm, "With --simulate: the same seed gives the same drive (default: 1)")
@@ -153,6 +154,11 @@ std::optional<int> readServiceOptions(int argc, char** argv, ServiceOptions& opt
         const auto& [from, to] = std::tie(options.replay.from, options.replay.to);
         if (from && to && from->isOffset() && to->isOffset() && from->offset() > to->offset())
             throw CLI::ValidationError("--to", "lies before --from");
+        const auto& [technology, scene] = std::tie(options.simulate.technology, options.simulate.scene);
+        if (technology && !hasScene(*technology, scene))
+            throw CLI::ValidationError("--scene",
+                "'" + std::string(sceneName(scene)) + "' is there for " + technologiesOf(scene) + ", not for "
+                    + std::string(technologyName(*technology)));
     } catch (const CLI::Success& answered) {
         return program.exit(answered);
     } catch (const CLI::ParseError& error) {

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Records/Recording.h"
-#include "Telephony/Simulator/Journey.h"
+#include "Telephony/Simulator/Scene.h"
 #include "Telephony/Sources/ReplaySource.h"
 
 #include <chrono>

@@ -102,7 +102,7 @@ int writeRecording(const SimulateOptions& options)
                 truth->write(time, move);
         });
     if (!written)
-        return fail(written.failure().of(options.file).text);
+        return fail(written.failure().text);
     if (const auto finished = truth ? truth->finish() : Done(); !finished)
         return fail(finished.failure().of(options.truth).text);
     return 0;

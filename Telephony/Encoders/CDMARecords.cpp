@@ -46,6 +46,9 @@ std::uint8_t oneXDeviceState(const CDMAReport& report)
     constexpr std::uint8_t Paging = 6;
     constexpr std::uint8_t Sleep = 7;
     constexpr std::uint8_t Traffic = 8;
+    constexpr std::uint8_t Acquisition = 3;
+    if (!report.isInService)
+        return Acquisition;
     if (report.activity == Activity::Voice)
         return Traffic;
     return report.isAwake ? Paging : Sleep;
@@ -125,9 +128,12 @@ std::uint16_t energyOf(double ratio)
     return static_cast<std::uint16_t>(std::clamp<long>(std::lround(ratio * 512), 1, 0xFFFF));
 }
 
-std::uint8_t evdoDeviceState(Activity activity)
+std::uint8_t evdoDeviceState(const CDMAReport& report)
 {
-    switch (activity) {
+    constexpr std::uint8_t Acquisition = 1;
+    if (!report.isInService)
+        return Acquisition;
+    switch (report.activity) {
     case Activity::Voice:
         return 0; // inactive
     case Activity::Idle:
@@ -142,7 +148,7 @@ std::uint8_t evdoDeviceState(Activity activity)
 
 bool hasEVDO(const CDMAReport& report)
 {
-    return report.activity != Activity::Voice;
+    return report.activity != Activity::Voice && report.isInService;
 }
 
 std::uint8_t wholePower(double power)
@@ -211,7 +217,7 @@ Bytes evdoAirLinkRecord(const CDMAReport& report, Moment time)
         .u8(wholePower(report.transmitted))
         .u16(hasEVDO(report) ? report.serving.pn : UnassignedPN)
         .zeros(16) // rates asked for and granted
-        .u8(evdoDeviceState(report.activity))
+        .u8(evdoDeviceState(report))
         .u8(SessionOpen)
         .u16(UATI)
         .u8(UATI >> 16)

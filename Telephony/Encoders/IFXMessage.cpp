@@ -33,7 +33,7 @@ std::string criterion(const IFXCell& cell)
 Value registration(const IFXReport& report)
 {
     return Dictionary::make({
-        {"State", "Registered, home"},
+        {"State", report.isInService ? "Registered, home" : "No service"},
         {"Network", Dictionary::make({{"PLMN", Network}, {"Name", "Test Network"}})},
         {"Area",
             Dictionary::make({

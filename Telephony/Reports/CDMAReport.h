@@ -37,7 +37,8 @@ struct CDMAPilot {
 struct CDMAReport {
     CDMAActivity activity = CDMAActivity::Idle;
     bool isAwake = true; // idle, whether it listens to its paging channel just now, or sleeps
-    CDMASystem serving;
+    bool isInService = true; // otherwise it searches for a pilot
+    CDMASystem serving; // or the lost one
     std::vector<CDMAPilot> activePilots; // at least one, the serving one first
     double received = 0; // dBm on a carrier
     double receivedBySecond = 0; // dBm, by the second antenna

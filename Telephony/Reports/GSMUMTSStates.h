@@ -36,6 +36,7 @@ enum class MMState : std::uint8_t {
     WaitForOutgoingConnection = 5,
     ConnectionActive = 6,
     WaitForNetworkCommand = 9,
+    LocationUpdateRejected = 10,
     WaitForRRConnectionToUpdate = 13,
     WaitForRRConnectionToCall = 14,
     Idle = 19,
@@ -44,6 +45,7 @@ enum class MMState : std::uint8_t {
 enum class MMSubState : std::uint8_t {
     None = 0,
     PLMNSearch = 2,
+    LimitedService = 3,
     LocationUpdateNeeded = 5,
     NoCellAvailable = 6,
     NormalService = 8,
@@ -61,6 +63,7 @@ enum class GMMState : std::uint8_t {
 
 enum class GMMSubState : std::uint8_t {
     NormalService = 0,
+    LimitedService = 1,
     AttachNeeded = 2,
     NoCellAvailable = 5,
     PLMNSearch = 6,
@@ -69,8 +72,9 @@ enum class GMMSubState : std::uint8_t {
     None = 12,
 };
 
-/// Update status U1 or U2 of the SIM (3GPP TS 24.008, 4.1.2.2), and GU1 or GU2 for packets.
-enum class UpdateStatus : std::uint8_t { Updated, NotUpdated };
+/// Update status U1 to U3 of the SIM (3GPP TS 24.008, 4.1.2.2), and GU1 to GU3 for packets. U3 by area: the location
+/// area or the routing area is not allowed.
+enum class UpdateStatus : std::uint8_t { Updated = 0, NotUpdated = 1, AreaNotAllowed = 3 };
 
 enum class RegistrationState : std::uint8_t { Inactive = 0, Idle = 1, Registering = 2, AutomaticSearch = 5 };
 

@@ -19,7 +19,8 @@ struct IFXCell {
 
 /// A phone of the dictionary-reporting baseband at one moment.
 struct IFXReport {
-    IFXCell serving;
+    bool isInService = true;
+    IFXCell serving; // or the lost one
     std::vector<IFXCell> neighbours; // strongest first
     bool isTalking = false;
     std::chrono::seconds talkingFor {0}; // since the call began; 0 without one

@@ -1,9 +1,15 @@
 #include "Telephony/Simulator/Baseband.h"
 
+#include "Telephony/Simulator/JourneyBaseband.h"
+
 namespace spectrel {
 
 std::unique_ptr<Baseband> makeBaseband(Technology technology, Scene scene, std::uint32_t seed)
 {
+    if (!hasScene(technology, scene))
+        return nullptr;
+    if (scene == Scene::Journey)
+        return std::make_unique<JourneyBaseband>(technology, seed);
     switch (technology) {
     case Technology::IFX:
         return makeIFXBaseband(scene, seed);

@@ -21,6 +21,8 @@ public:
     using Emit = std::function<void(ByteView record)>;
 
     virtual ~Baseband() = default;
+    /// May be another one after a step: the records of that step are the old one's, and a listener is to be greeted
+    /// anew.
     virtual Technology technology() const = 0;
     /// The slow records, which a new channel gets at once.
     virtual void greet(Moment now, const Emit& emit) const = 0;
@@ -77,6 +79,14 @@ public:
     {
         return _world.moves();
     }
+    World& world()
+    {
+        return _world;
+    }
+    const World& world() const
+    {
+        return _world;
+    }
 
 private:
     void report(const Cadence<World>& cadence, Moment now, const Emit& emit) const
@@ -92,7 +102,7 @@ private:
     std::chrono::milliseconds _elapsed {0};
 };
 
-/// The simulated baseband of a technology; null where there is none.
+/// The simulated baseband of a technology; null where it has no such scene. On a journey it begins with the technology.
 std::unique_ptr<Baseband> makeBaseband(Technology technology, Scene scene, std::uint32_t seed);
 
 // One for each technology that can be simulated.

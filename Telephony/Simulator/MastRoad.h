@@ -35,6 +35,7 @@ private:
     };
 
     Journey _journey;
+    OpenWater _water; // in front of the first mast
     std::vector<Mast> _masts;
 };
 

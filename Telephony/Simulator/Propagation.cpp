@@ -18,6 +18,12 @@ double Valley::lossAt(const Journey& journey) const
     return out >= 1 ? 0 : loss * (1 + std::cos(out * std::numbers::pi)) / 2;
 }
 
+double OpenWater::gainAt(const Journey& journey) const
+{
+    constexpr double Gain = 50; // free space and a high mast, instead of streets
+    return journey.scene() == Scene::Overshoot ? Valley {from, to, Gain}.lossAt(journey) : 0;
+}
+
 double pathLoss(double metres)
 {
     return 128.1 + 37.6 * std::log10(std::max(metres, 35.0) / 1000);

@@ -16,7 +16,9 @@ constexpr Moment SimulatedRecordingStart {std::chrono::seconds(1767254400)};
 /// Hears of each move that the simulated world decides, at the time of the decision.
 using MoveHandler = std::function<void(Moment time, const Move& move)>;
 
-/// Writes as much of the baseband's life into a capture file as `duration` says, without waiting.
+/// Writes as much of the baseband's life into a capture file as `duration` says, without waiting. When its technology
+/// changes it goes on in a further file: "drive.pcap", "drive-2.pcap" and so on; all are overwritten. A failure names
+/// the file.
 Outcome writeSimulatedRecording(
     Baseband& baseband, const std::string& path, std::chrono::milliseconds duration, const MoveHandler& onMove = {});
 

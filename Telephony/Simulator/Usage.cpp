@@ -19,8 +19,9 @@ void Habit::advance(std::chrono::milliseconds step, Dice& dice)
     _left = dice.between(span.min, span.max);
 }
 
-Usage::Usage(Dice& dice)
-    : _calls({30, 70}, {14, 30}, {15, 50}, dice)
+Usage::Usage(Scene scene, Dice& dice)
+    : _isAlwaysCalling(scene == Scene::Handover)
+    , _calls({30, 70}, {14, 30}, {15, 50}, dice)
     , _sessions({8, 14}, {90, 150}, {2, 4}, dice)
     , _transfers({5, 35}, {8, 25}, {3, 5}, dice)
 {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Telephony/Simulator/Dice.h"
+#include "Telephony/Simulator/Scene.h"
 
 #include <chrono>
 
@@ -34,14 +35,15 @@ private:
 /// How its user uses the phone: voice calls, data sessions, and transfers within them.
 class Usage {
 public:
-    explicit Usage(Dice& dice);
+    /// In the handover scene a call lasts all the time.
+    Usage(Scene scene, Dice& dice);
 
     /// Only a phone that is attached is used.
     void advance(std::chrono::milliseconds step, bool isAttached, Dice& dice);
 
     bool wantsCall() const
     {
-        return _calls.isOn();
+        return _isAlwaysCalling || _calls.isOn();
     }
     bool hasSession() const
     {
@@ -53,6 +55,7 @@ public:
     }
 
 private:
+    bool _isAlwaysCalling;
     Habit _calls;
     Habit _sessions;
     Habit _transfers;

@@ -82,13 +82,13 @@ private:
         const bool isAfterGap = _isFirstOfFile && _message->time - _previous > MaxGap;
         if (!_origin || _message->time < _previous || isAfterGap) {
             _origin = _message->time;
-            _startedAt = _clock.now();
+            _startedAt = _clock.steady();
         }
         _previous = _message->time;
         _isFirstOfFile = false;
         const auto recorded = static_cast<double>((_message->time - *_origin).count());
         const std::chrono::microseconds place(std::llround(recorded / _options.speed));
-        return place - (_clock.now() - _startedAt);
+        return place - (_clock.steady() - _startedAt);
     }
 
     /// The next message between the two points.
@@ -162,7 +162,7 @@ private:
     std::optional<RecordedMessage> _message; // read, not delivered yet
     std::optional<std::pair<Moment, Moment>> _range; // of the messages to play; known from the first message on
     std::optional<Moment> _origin;
-    Moment _startedAt {};
+    std::chrono::nanoseconds _startedAt {0}; // steady
     Moment _previous {}; // that of the message before
     bool _isFirstOfFile = false;
     bool _isEmpty = true; // nothing was played so far

@@ -1,6 +1,7 @@
 #include "Telephony/Sources/SimulatorSource.h"
 
 #include "Telephony/ChannelQueue.h"
+#include "Telephony/ServiceLine.h"
 
 #include <algorithm>
 
@@ -71,8 +72,24 @@ void SimulatorSource::remove(Stream& stream)
 void SimulatorSource::tick()
 {
     constexpr double StepLength = Baseband::Step.count();
-    for (_owed += StepLength * _rate; _owed >= StepLength; _owed -= StepLength)
+    for (_owed += StepLength * _rate; _owed >= StepLength; _owed -= StepLength) {
+        const Technology before = technology();
         _baseband->advance(_clock.now(), [this](ByteView record) { send(record); });
+        if (technology() != before && _basebandHandler)
+            return changeTechnology();
+    }
+}
+
+/// The world stands still until clients have asked for the new technology.
+void SimulatorSource::changeTechnology()
+{
+    printServiceLine("the phone has moved to technology " + std::string(technologyName(technology())));
+    _owed = 0;
+    _timer.reset();
+    _runLoop.async(_lifetime.guard([this] {
+        if (_basebandHandler)
+            _basebandHandler(); // ends the channels, and with them their streams
+    }));
 }
 
 void SimulatorSource::send(ByteView record)

@@ -1,10 +1,12 @@
 #pragma once
 
 #include "Platform/Clock.h"
+#include "Platform/Lifetime.h"
 #include "Platform/RunLoop.h"
 #include "Telephony/LogSource.h"
 #include "Telephony/Simulator/Baseband.h"
 
+#include <functional>
 #include <memory>
 #include <string>
 #include <vector>
@@ -24,6 +26,10 @@ public:
         return _baseband->technology();
     }
     std::unique_ptr<LogStream> start(MessageSink& sink) override;
+    void setBasebandHandler(std::function<void()> handler) override
+    {
+        _basebandHandler = std::move(handler);
+    }
     std::string status() const override
     {
         return "a simulated " + std::string(technologyName(technology())) + " baseband";
@@ -33,6 +39,7 @@ private:
     class Stream;
 
     void tick();
+    void changeTechnology();
     void send(ByteView record);
     void remove(Stream& stream);
 
@@ -43,6 +50,8 @@ private:
     double _owed = 0; // simulated milliseconds not stepped through yet
     std::vector<Stream*> _streams;
     std::unique_ptr<Timer> _timer; // only while somebody listens
+    std::function<void()> _basebandHandler;
+    Lifetime _lifetime;
 };
 
 } // namespace spectrel

@@ -179,6 +179,17 @@ TEST(ReadArgumentsTest, TableAndItsColumnsComeTogether)
     EXPECT_EQ(complaintAbout({"watch", "--path", ""}), "spectrel: --path: '' is no path (see spectrel --help)\n");
 }
 
+TEST(ReadArgumentsTest, MarkTakesATextAndPerhapsARecording)
+{
+    Arguments arguments;
+    EXPECT_EQ(read({"mark", "tunnel, south end", "--recording", "drive.pcap"}, arguments), std::nullopt);
+    EXPECT_EQ(arguments.job, Job::Mark);
+    EXPECT_EQ(arguments.mark.note, "tunnel, south end");
+    EXPECT_EQ(arguments.mark.recording, "drive.pcap");
+    EXPECT_EQ(complaintAbout({"mark"}), "spectrel: TEXT is required (see spectrel --help)\n");
+    EXPECT_EQ(complaintAbout({"mark", ""}), "spectrel: TEXT: '' is no note of 1 to 4096 bytes (see spectrel --help)\n");
+}
+
 TEST(ReadArgumentsTest, StandardOutputTakesNoOptionOfSeveralFiles)
 {
     for (const auto& [option, value] : std::vector<std::pair<const char*, const char*>> {
@@ -191,7 +202,7 @@ TEST(ReadArgumentsTest, StandardOutputTakesNoOptionOfSeveralFiles)
 
 TEST(ReadArgumentsTest, EveryCommandTellsHelpAndVersion)
 {
-    for (const char* command : {"watch", "decode", "view", "record", "channel"}) {
+    for (const char* command : {"watch", "decode", "view", "record", "channel", "mark"}) {
         for (const char* option : {"--help", "--version"}) {
             Arguments arguments;
             testing::internal::CaptureStdout();

@@ -1,6 +1,7 @@
 #include "CommandLine/Commands/RecordingFiles.h"
 
 #include "CommandLine/Options/OptionTypes.h"
+#include "Tests/Fakes/FakeRunLoop.h"
 #include "Tests/Fakes/RecordBuilder.h"
 #include "Tests/Fakes/ScratchFolder.h"
 
@@ -18,15 +19,17 @@ class RecordingFilesTest : public testing::Test {
 protected:
     RecordingFiles open(RecordingFilesOptions options)
     {
-        RecordingFiles files(std::move(options));
+        RecordingFiles files(std::move(options), loop);
         EXPECT_TRUE(files.prepare());
         return files;
     }
     /// One message of 13 bytes a second: 29 bytes in the file, behind 24 bytes of its head.
     void write(RecordingFiles& files, int count, Technology technology = Technology::LTE)
     {
-        for (int number = 0; number < count; ++number)
-            EXPECT_TRUE(files.write(technology, time += 1s, RecordBuilder(0xB0C2, 13)));
+        for (int number = 0; number < count; ++number) {
+            loop.advance(1s);
+            EXPECT_TRUE(files.write(technology, RecordBuilder(0xB0C2, 13)));
+        }
         EXPECT_TRUE(files.flush());
     }
     /// The files of a folder with the number of messages in each: "a.pcap: 3".
@@ -46,7 +49,7 @@ protected:
     }
 
     ScratchFolder scratch;
-    Moment time {1'000'000s};
+    FakeRunLoop loop;
 };
 
 TEST_F(RecordingFilesTest, OneFileWithoutLimits)
@@ -76,6 +79,17 @@ TEST_F(RecordingFilesTest, FileIsNotLongerThanItsTime)
     auto files = open({scratch.file("a.pcap"), {}, 3s, {}});
     write(files, 7);
     EXPECT_THAT(contents(scratch.path().string()), ElementsAre("a-2.pcap: 3", "a-3.pcap: 1", "a.pcap: 3"));
+}
+
+TEST_F(RecordingFilesTest, ClockThatIsSetNeitherDelaysNorHastensTheNextFile)
+{
+    auto files = open({scratch.file("a.pcap"), {}, 3s, {}});
+    write(files, 2);
+    loop.setClock(-1h);
+    write(files, 2);
+    loop.setClock(2h);
+    write(files, 1);
+    EXPECT_THAT(contents(scratch.path().string()), ElementsAre("a-2.pcap: 2", "a.pcap: 3"));
 }
 
 TEST_F(RecordingFilesTest, FolderIsMadeAndItsFilesAreNumberedAcrossTechnologies)
@@ -121,7 +135,7 @@ TEST_F(RecordingFilesTest, FurtherFilesOverwriteNothing)
 TEST_F(RecordingFilesTest, FileThatIsThereIsLeftAloneUnlessItMayBeOverwritten)
 {
     scratch.write("a.pcap", "mine");
-    RecordingFiles refused({scratch.file("a.pcap"), {}, {}, {}});
+    RecordingFiles refused({scratch.file("a.pcap"), {}, {}, {}}, loop);
     const auto prepared = refused.prepare();
     ASSERT_FALSE(prepared);
     EXPECT_EQ(prepared.failure().text, scratch.file("a.pcap") + ": is there already (--overwrite writes over it)");
@@ -135,7 +149,7 @@ TEST_F(RecordingFilesTest, FileThatHasComeInTheMeantimeIsLeftAlone)
 {
     auto files = open({scratch.file("a.pcap"), {}, {}, {}});
     scratch.write("a.pcap", "mine");
-    EXPECT_FALSE(files.begin(Technology::LTE, time));
+    EXPECT_FALSE(files.begin(Technology::LTE));
     EXPECT_EQ(scratch.read("a.pcap"), "mine");
 }
 
@@ -144,9 +158,9 @@ TEST_F(RecordingFilesTest, PlantedLinksAreNotFollowed)
     scratch.write("victim", "text");
     std::filesystem::create_symlink("victim", scratch.file("a.pcap"));
     std::filesystem::create_symlink("victim", scratch.file(".b.pcap-" + std::to_string(::getpid())));
-    RecordingFiles linked({scratch.file("a.pcap"), {}, {}, {}, true});
+    RecordingFiles linked({scratch.file("a.pcap"), {}, {}, {}, true}, loop);
     EXPECT_TRUE(linked.prepare());
-    const auto begun = linked.begin(Technology::LTE, time);
+    const auto begun = linked.begin(Technology::LTE);
     ASSERT_FALSE(begun);
     EXPECT_EQ(begun.failure().text, scratch.file("a.pcap") + ": it is a link, and links are not followed");
     auto files = open({scratch.file("b.pcap"), {}, {}, {}});
@@ -164,8 +178,8 @@ TEST_F(RecordingFilesTest, FileThatAnotherRecorderWritesIsNeitherOverwrittenNorR
     write(one, 1);
     EXPECT_THAT(contents(scratch.path().string()),
         ElementsAre("spectrel-000001-lte.pcap: 2", "spectrel-000004-lte.pcap: 1", "spectrel-000005-lte.pcap: 1"));
-    RecordingFiles third({one.path(), {}, {}, {}, true});
-    const auto begun = third.begin(Technology::LTE, time);
+    RecordingFiles third({one.path(), {}, {}, {}, true}, loop);
+    const auto begun = third.begin(Technology::LTE);
     ASSERT_FALSE(begun);
     EXPECT_EQ(begun.failure().text, one.path() + ": another program is writing it");
     EXPECT_THAT(contents(scratch.path().string()), testing::Contains("spectrel-000001-lte.pcap: 2"));
@@ -175,7 +189,7 @@ TEST_F(RecordingFilesTest, HighestNumberIsNotCountedBeyond)
 {
     const std::string highest = scratch.write("spectrel-18446744073709551615-lte.pcap", "old");
     auto files = open({scratch.path().string(), {}, 1s, 2});
-    const auto written = files.write(Technology::LTE, time, RecordBuilder(0xB0C2, 13));
+    const auto written = files.write(Technology::LTE, RecordBuilder(0xB0C2, 13));
     ASSERT_FALSE(written);
     EXPECT_EQ(written.failure().text, highest + ": has the highest number that there is; no file can follow it");
     EXPECT_EQ(scratch.read("spectrel-18446744073709551615-lte.pcap"), "old");
@@ -201,12 +215,12 @@ TEST_F(RecordingFilesTest, OfNamedFilesOnlyThisRecordingsAreRemoved)
 
 TEST_F(RecordingFilesTest, PlaceThatCannotBeWrittenIsToldBeforehand)
 {
-    RecordingFiles files({scratch.file("nowhere/a.pcap"), {}, {}, {}});
+    RecordingFiles files({scratch.file("nowhere/a.pcap"), {}, {}, {}}, loop);
     const auto prepared = files.prepare();
     ASSERT_FALSE(prepared);
     EXPECT_EQ(prepared.failure().text, scratch.file("nowhere/a.pcap") + ": No such file or directory");
     scratch.write("file", "");
-    RecordingFiles folder({scratch.file("file/folder/"), {}, {}, {}});
+    RecordingFiles folder({scratch.file("file/folder/"), {}, {}, {}}, loop);
     EXPECT_FALSE(folder.prepare());
 }
 

@@ -2,9 +2,10 @@
 
 import json
 import os
+import subprocess
 import unittest
 
-from harness import Place
+from harness import BIN, WAIT, Place
 
 TECHNOLOGIES = ("lte", "gsm", "utran", "cdma", "ifx")
 
@@ -35,7 +36,7 @@ class Simulate(Place):
 
     def test_every_scene_decodes_cleanly(self):
         for technology in TECHNOLOGIES:
-            for scene in ("still", "walk", "drive", "stress"):
+            for scene in ("still", "walk", "drive", "stress", "handover", "tunnel", "ping-pong", "overshoot"):
                 with self.subTest(technology=technology, scene=scene):
                     self.written("a.pcap", "--simulate", technology, "--scene", scene, "--duration", "30s")
                     done = self.run_spectrel("decode", "--format", "none", self.path("a.pcap"))
@@ -72,6 +73,49 @@ class Simulate(Place):
             done = self.service("--simulate", "lte", "--write", "/dev/full", "--duration", "10m")
             self.assertEqual((done.returncode, done.stderr),
                              (1, "spectrel-telephonyd: /dev/full: No space left on device\n"))
+
+    def test_rejected_registration_is_shown(self):
+        self.written("a.pcap", "--simulate", "gsm", "--scene", "rejected", "--duration", "10m")
+        done = self.run_spectrel("decode", "--format", "changes", self.path("a.pcap"))
+        self.assertEqual(done.returncode, 0, done.stderr)
+        for value in ("MM_LOCATION_UPDATE_REJECTED", "MM_LIMITED_SERVICE", "LOCATION_AREA_NOT_ALLOWED",
+                      "GMM_GU3_ROUTING_AREA_NOT_ALLOWED"):
+            self.assertIn(f'"value": "{value}"', done.stdout)
+
+    def test_journey_goes_on_in_further_files(self):
+        self.written("a.pcap", "--simulate", "lte", "--scene", "journey", "--duration", "3m", "--truth",
+                     self.path("truth"))
+        files = sorted(name for name in os.listdir(self.folder) if name.endswith(".pcap"))
+        self.assertLessEqual({"a.pcap", "a-2.pcap", "a-3.pcap"}, set(files))
+        for name in files:
+            done = self.run_spectrel("decode", "--format", "none", self.path(name))
+            self.assertEqual(done.returncode, 0, done.stderr)
+        with open(self.path("truth"), encoding="utf-8") as file:
+            radios = [json.loads(line)["to"]["technology"] for line in file]
+        self.assertEqual({"lte", "umts", "gsm"}, set(radios))
+
+    def test_journey_on_standard_output_ends_with_the_technology(self):
+        with open(self.path("a.pcap"), "wb") as file:
+            process = self.run_background(
+                [os.path.join(BIN, "spectrel-telephonyd"), "--simulate", "lte", "--scene", "journey", "--duration",
+                 "3m", "--write", "-"], stdout=file, stderr=subprocess.PIPE)
+            _, complaint = process.communicate(timeout=WAIT)
+        self.assertEqual((process.returncode, complaint), (
+            1, "spectrel-telephonyd: -: standard output holds the messages of one technology only\n"))
+        self.assertEqual(self.run_spectrel("decode", "--format", "none", self.path("a.pcap")).returncode, 0)
+
+    def test_live_journey_has_clients_ask_anew(self):
+        self.start_service("--simulate", "lte", "--scene", "journey", "--rate", "20")
+        done = self.run_spectrel("record", self.path("live.pcap"), "--duration", "20s")
+        self.assertEqual(done.returncode, 0, done.stderr)
+        self.assertTrue(os.path.exists(self.path("live-2.pcap")))
+
+    def test_scene_that_a_technology_lacks_is_told(self):
+        for technology, scene, there in (("lte", "rejected", "gsm"), ("cdma", "journey", "lte, gsm, utran")):
+            done = self.service("--simulate", technology, "--scene", scene)
+            self.assertEqual((done.returncode, done.stderr), (
+                2, f"spectrel-telephonyd: --scene: '{scene}' is there for {there}, not for {technology} "
+                   "(see spectrel-telephonyd --help)\n"))
 
     def truth(self, name, *arguments):
         self.written(name, *arguments, "--truth", self.path(name + ".truth"))

@@ -56,7 +56,7 @@ std::unique_ptr<Timer> FakeRunLoop::repeat(std::chrono::nanoseconds interval, Jo
 
 Moment FakeRunLoop::now() const
 {
-    return Start + std::chrono::duration_cast<std::chrono::microseconds>(_elapsed);
+    return Start + _ahead + std::chrono::duration_cast<std::chrono::microseconds>(_elapsed);
 }
 
 ZoneState FakeRunLoop::zoneAt(Moment) const

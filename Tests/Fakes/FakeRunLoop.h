@@ -21,6 +21,10 @@ public:
     std::unique_ptr<Timer> repeat(std::chrono::nanoseconds interval, Job action) override;
 
     Moment now() const override;
+    std::chrono::nanoseconds steady() const override
+    {
+        return _elapsed;
+    }
     ZoneState zoneAt(Moment moment) const override;
     std::string formatted(Moment moment, std::string_view pattern) const override;
 
@@ -29,6 +33,11 @@ public:
     /// Moves the time on, running what falls due at its own moment.
     void advance(std::chrono::nanoseconds duration);
 
+    /// Sets the clock, ahead or back; intervals go on.
+    void setClock(std::chrono::seconds ahead)
+    {
+        _ahead += ahead;
+    }
     void setZone(ZoneState zone)
     {
         _zone = zone;
@@ -50,6 +59,7 @@ private:
         const std::shared_ptr<Job>& action);
 
     std::chrono::nanoseconds _elapsed {0};
+    std::chrono::seconds _ahead {0}; // of the wall clock, as it was set
     ZoneState _zone;
     std::deque<Job> _queue;
     std::map<std::pair<std::chrono::nanoseconds, std::uint64_t>, Job> _waiting; // by due time, then by order

@@ -259,6 +259,15 @@ TEST_F(TelephonyServiceTest, StatusShowsWhatIsStreamedToWhom)
     EXPECT_EQ(report.headline(), "a list; 1 client, 0.0 messages/s") << "rates count from the report before";
 }
 
+TEST_F(TelephonyServiceTest, ClockThatIsSetChangesNoRate)
+{
+    StatusReport report(loop, service, source);
+    start(openChannel("org.spectrel.Watch.7.BasebandStateReport.LogChannel"), codes({0xB0C2}), codes({1}));
+    loop.setClock(-1h);
+    loop.advance(2s);
+    EXPECT_EQ(report.headline(), "a list; 1 client, 1.0 messages/s");
+}
+
 TEST_F(TelephonyServiceTest, ComingAndGoingOfChannelsIsAChange)
 {
     int changes = 0;

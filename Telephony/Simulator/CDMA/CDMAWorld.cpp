@@ -22,21 +22,9 @@ constexpr double DropShare = 0.126; // T_DROP, -16 dB
 constexpr std::chrono::milliseconds DropTime = 4s; // T_TDROP
 constexpr std::size_t MaxActiveSet = 6;
 
-/// What the phone does, and until when in each round.
-struct Phase {
-    std::chrono::milliseconds end;
-    CDMAWorld::Activity activity;
-};
-
-constexpr std::array<Phase, 6> Phases {{
-    {10s, CDMAWorld::Activity::Idle},
-    {11s, CDMAWorld::Activity::DataSetup},
-    {66s, CDMAWorld::Activity::Data},
-    {72s, CDMAWorld::Activity::Idle},
-    {114s, CDMAWorld::Activity::Voice},
-    {120s, CDMAWorld::Activity::Idle},
-}};
-constexpr std::chrono::milliseconds Round = Phases.back().end;
+// Of a sector's share in the received power.
+constexpr double LostShare = 0.02; // below it even the pilot cannot be found
+constexpr double FoundShare = 0.1;
 
 double milliwatts(double decibels)
 {
@@ -72,8 +60,23 @@ CellName evdoNameOf(const CDMASystem& system)
 
 } // namespace
 
+constexpr std::array<CDMAWorld::Phase, 6> CDMAWorld::UsualPhases {{
+    {10s, Activity::Idle},
+    {11s, Activity::DataSetup},
+    {66s, Activity::Data},
+    {72s, Activity::Idle},
+    {114s, Activity::Voice},
+    {120s, Activity::Idle},
+}};
+
+constexpr std::array<CDMAWorld::Phase, 2> CDMAWorld::BusyPhases {{
+    {60s, Activity::Data},
+    {120s, Activity::Voice},
+}};
+
 CDMAWorld::CDMAWorld(Scene scene, std::uint32_t seed)
-    : _dice(seed)
+    : _phases(scene == Scene::Handover ? std::span<const Phase>(BusyPhases) : std::span<const Phase>(UsualPhases))
+    , _dice(seed)
     , _road(scene, Sites, SiteDistance, _dice)
     , _secondAntenna(_dice)
 {
@@ -93,8 +96,14 @@ void CDMAWorld::advance(std::chrono::milliseconds step)
     _road.advance(step, _dice);
     _secondAntenna.advance(step, _dice);
     measure();
-    reselect();
-    followWithEVDO();
+    if (_isInService && shareOf(servingSector()) < LostShare)
+        _isInService = false;
+    if (_isInService)
+        reselect();
+    else
+        searchService();
+    if (_isInService)
+        followWithEVDO();
     maintainActiveSet(step);
     // The weaker the pilots, the less power control can hold the one broken frame in a hundred.
     const double active = inDecibels(shareOf(servingSector()));
@@ -118,12 +127,29 @@ void CDMAWorld::measure()
 
 void CDMAWorld::reselect()
 {
-    const std::size_t next = best();
-    if (next == _serving)
+    const bool isTalking = activity() == Activity::Voice;
+    if (const std::size_t next = best(); next != _serving)
+        serve(next, isTalking ? ByHandover : byReselection(ReselectionRule::EqualPriority));
+}
+
+void CDMAWorld::searchService()
+{
+    const std::size_t found = best();
+    if (shareOf(_sectors[found]) < FoundShare)
         return;
-    _moves.moved(oneXNameOf(serving()), oneXNameOf(_sectors[next].system),
-        activity() == Activity::Voice ? ByHandover : byReselection(ReselectionRule::EqualPriority));
-    _serving = next;
+    _isInService = true;
+    if (found != _serving)
+        serve(found, AfterServiceLost);
+    if (activity() == Activity::Voice || _servingEVDO == _serving)
+        return;
+    _moves.moved(evdoNameOf(_sectors[_servingEVDO].system), evdoNameOf(serving()), AfterServiceLost);
+    _servingEVDO = _serving;
+}
+
+void CDMAWorld::serve(std::size_t sector, MoveCause cause)
+{
+    _moves.moved(oneXNameOf(serving()), oneXNameOf(_sectors[sector].system), cause);
+    _serving = sector;
 }
 
 /// EV-DO has the same sector, but sleeps while the phone talks; after that it finds the pilot anew.
@@ -160,8 +186,10 @@ void CDMAWorld::maintainActiveSet(std::chrono::milliseconds step)
 
 CDMAWorld::Activity CDMAWorld::activity() const
 {
-    const auto now = _elapsed % Round;
-    return std::ranges::find_if(Phases, [now](const Phase& phase) { return now < phase.end; })->activity;
+    if (!_isInService)
+        return Activity::Idle;
+    const auto now = _elapsed % _phases.back().end;
+    return std::ranges::find_if(_phases, [now](const Phase& phase) { return now < phase.end; })->activity;
 }
 
 bool CDMAWorld::isAwake() const
@@ -206,8 +234,8 @@ double CDMAWorld::servingSignal() const
 
 CDMAReport CDMAWorld::report() const
 {
-    return {activity(), isAwake(), serving(), activePilots(), received(), receivedBySecond(), transmitted(),
-        servingSignal(), isFrameBad(), second(), countsAtSecond()};
+    return {activity(), isAwake(), _isInService, serving(), activePilots(), received(), receivedBySecond(),
+        transmitted(), servingSignal(), isFrameBad(), second(), countsAtSecond()};
 }
 
 } // namespace spectrel

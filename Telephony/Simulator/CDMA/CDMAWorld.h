@@ -8,6 +8,7 @@
 #include "Telephony/Simulator/Move.h"
 #include "Telephony/Simulator/Propagation.h"
 
+#include <array>
 #include <chrono>
 #include <cstdint>
 #include <span>
@@ -34,7 +35,12 @@ public:
 
     void advance(std::chrono::milliseconds step);
 
+    /// Idle without service.
     Activity activity() const;
+    bool isInService() const
+    {
+        return _isInService;
+    }
     /// Whether an idle phone listens to its paging channel just now, or sleeps.
     bool isAwake() const;
     const CDMASystem& serving() const
@@ -76,8 +82,18 @@ public:
     CDMAReport report() const;
 
 private:
+    /// What the phone does, and until when in each round.
+    struct Phase {
+        std::chrono::milliseconds end;
+        Activity activity;
+    };
+    static const std::array<Phase, 6> UsualPhases;
+    static const std::array<Phase, 2> BusyPhases;
+
     void measure();
     void reselect();
+    void searchService();
+    void serve(std::size_t sector, MoveCause cause);
     void followWithEVDO();
     std::size_t best() const;
     void maintainActiveSet(std::chrono::milliseconds step);
@@ -90,6 +106,7 @@ private:
         return sector.power / _total;
     }
 
+    std::span<const Phase> _phases; // of a round
     Dice _dice;
     MastRoad _road;
     std::vector<CDMASector> _sectors; // one a mast
@@ -99,6 +116,7 @@ private:
     std::size_t _servingEVDO = 0; // in a voice call, the one before it
     MoveLog _moves;
     std::chrono::milliseconds _elapsed {0};
+    bool _isInService = true;
     bool _isFrameBad = false;
     EVDOTraffic _traffic;
     EVDOCounts _countsAtSecond;

@@ -5,6 +5,7 @@
 #include "Telephony/Encoders/UMTSRecords.h"
 #include "Telephony/Simulator/Baseband.h"
 #include "Telephony/Simulator/GSMUMTS/GSMUMTSWorld.h"
+#include "Telephony/Simulator/TechnologyPart.h"
 
 #include <array>
 
@@ -217,6 +218,11 @@ constexpr auto Cadences = std::to_array<Cadence<World>>({
 std::unique_ptr<Baseband> makeGSMUMTSBaseband(Scene scene, std::uint32_t seed)
 {
     return std::make_unique<SteadyBaseband<World>>(Technology::GSM, scene, seed, Cadences);
+}
+
+std::unique_ptr<TechnologyPart> makeGSMPart(std::uint32_t seed)
+{
+    return std::make_unique<SteadyPart<World>>(Technology::GSM, seed, Cadences);
 }
 
 } // namespace spectrel

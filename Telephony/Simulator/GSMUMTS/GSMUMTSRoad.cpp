@@ -8,11 +8,16 @@ namespace spectrel {
 
 namespace {
 
-constexpr double RoadLength = 4000; // metres, a ring
+constexpr double OwnLength = 4000; // metres, a ring
 constexpr double ValleyCentre = 3000;
 constexpr double ValleyEdge = 600; // metres from the centre: here UMTS begins to fade
 constexpr double ValleyFloor = 250; // and here it has gone
 constexpr double ValleyLoss = 45; // dB
+constexpr double OutOfReach = 100; // dB: on a journey this network has GSM alone
+
+constexpr OpenWater Water {1250, 1700}; // in front of the first NodeB
+constexpr double PacingPlace = 1000; // between two NodeBs
+constexpr double PacingReach = 90;
 
 constexpr double NodeBDistance = 500;
 constexpr double PilotPower = 33; // dBm
@@ -74,7 +79,8 @@ CellName nameOf(const GSMCell& cell)
 }
 
 GSMUMTSRoad::GSMUMTSRoad(Scene scene, Dice& dice)
-    : _journey(scene, RoadLength, dice)
+    : _length(scene == Scene::Journey ? Journey::SharedLength : OwnLength)
+    , _journey(scene, _length, dice)
 {
     buildUMTS(dice);
     buildGSM(dice);
@@ -82,12 +88,14 @@ GSMUMTSRoad::GSMUMTSRoad(Scene scene, Dice& dice)
         _umtsShadowing.emplace_back(dice);
     for (std::size_t cell = 0; cell < _gsm.size(); ++cell)
         _gsmShadowing.emplace_back(dice);
+    if (scene == Scene::PingPong)
+        _journey.stayAround(PacingPlace, PacingReach);
     measure();
 }
 
 void GSMUMTSRoad::buildUMTS(Dice& dice)
 {
-    for (double position = NodeBDistance / 2; position < RoadLength; position += NodeBDistance) {
+    for (double position = NodeBDistance / 2; position < _length; position += NodeBDistance) {
         if (std::fabs(position - ValleyCentre) >= ValleyEdge)
             addSectors(position, dice);
     }
@@ -122,7 +130,7 @@ void GSMUMTSRoad::addSectors(double position, Dice& dice)
 void GSMUMTSRoad::buildGSM(Dice& dice)
 {
     bool has1800 = false;
-    for (double position = BaseStationDistance / 4; position < RoadLength; position += BaseStationDistance) {
+    for (double position = BaseStationDistance / 4; position < _length; position += BaseStationDistance) {
         const double place = position + dice.between(-60, 60);
         addGSMCell(place, false, dice);
         if (has1800)
@@ -134,7 +142,8 @@ void GSMUMTSRoad::buildGSM(Dice& dice)
 void GSMUMTSRoad::addGSMCell(double position, bool is1800, Dice& dice)
 {
     const std::size_t number = _gsm.size();
-    const auto carrier = static_cast<std::uint16_t>(number * 11 + dice.below(10));
+    constexpr std::size_t Carriers = 113; // to choose from in the band of 900 MHz
+    const auto carrier = static_cast<std::uint16_t>(number * 11 % Carriers + dice.below(10));
     GSMCell cell;
     cell.identity = static_cast<std::uint16_t>(20000 + number * 10 + (is1800 ? 4 : 1));
     cell.arfcn = static_cast<std::uint16_t>((is1800 ? 520 : 2) + carrier);
@@ -167,13 +176,15 @@ void GSMUMTSRoad::advance(std::chrono::milliseconds step, Dice& dice)
 
 void GSMUMTSRoad::measure()
 {
-    const double valley = valleyLoss(_journey.distanceTo(ValleyCentre, 0));
+    const double tunnel = _journey.tunnelLoss();
+    const double hills = scene() == Scene::Journey ? OutOfReach : valleyLoss(_journey.distanceTo(ValleyCentre, 0));
     double carrier = watts(ReceiverNoise);
     for (std::size_t index = 0; index < _umts.size(); ++index) {
         UMTSCell& cell = _umts[index];
-        const double loss = pathLoss(_journey.distanceTo(cell.position, cell.offset)) + valley
+        const double loss = pathLoss(_journey.distanceTo(cell.position, cell.offset)) + hills + tunnel
             + sectorLoss(cell.azimuth, _journey.ahead(cell.position), cell.offset);
-        cell.rscp = std::min(cell.power - loss + _umtsShadowing[index].decibels(), -25.0);
+        const double water = index == 0 ? Water.gainAt(_journey) : 0;
+        cell.rscp = std::min(cell.power - loss + _umtsShadowing[index].decibels() + water, -25.0);
         carrier += watts(cell.rscp + cell.load);
     }
     _carrierRssi = 10 * std::log10(carrier);
@@ -181,7 +192,7 @@ void GSMUMTSRoad::measure()
         cell.ecno = cell.rscp - _carrierRssi;
     for (std::size_t index = 0; index < _gsm.size(); ++index) {
         GSMCell& cell = _gsm[index];
-        const double loss = pathLoss(_journey.distanceTo(cell.position, cell.offset));
+        const double loss = pathLoss(_journey.distanceTo(cell.position, cell.offset)) + tunnel;
         cell.rssi = std::min(cell.power - loss + _gsmShadowing[index].decibels(), -40.0);
     }
 }

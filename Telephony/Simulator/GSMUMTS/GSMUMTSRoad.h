@@ -23,6 +23,10 @@ public:
     /// Drives on, and hears every cell anew.
     void advance(std::chrono::milliseconds step, Dice& dice);
 
+    Scene scene() const
+    {
+        return _journey.scene();
+    }
     const std::vector<UMTSCell>& umts() const
     {
         return _umts;
@@ -49,6 +53,7 @@ private:
     void addGSMCell(double position, bool is1800, Dice& dice);
     void measure();
 
+    double _length; // metres
     Journey _journey;
     std::vector<UMTSCell> _umts;
     std::vector<GSMCell> _gsm;

@@ -16,6 +16,7 @@ constexpr auto TReselection = 2s; // to GSM
 constexpr auto RankedTogether = 600ms; // until the report shows both systems
 constexpr double WeakEcno = -14; // dB, event 2d in a connection
 constexpr auto WeakTime = 600ms;
+constexpr auto LossTime = 2s; // without any suitable cell
 constexpr double LostEcno = -22; // dB: nothing gets through
 
 constexpr double FDDQMin = -10; // dB (3GPP TS 45.008, 6.6.5)
@@ -35,7 +36,7 @@ constexpr std::array<PLMN, 2> EquivalentNetworks {{{{0, 0, 1}, {2, 0, 0}}, {{0, 
 GSMUMTSWorld::GSMUMTSWorld(Scene scene, std::uint32_t seed)
     : _dice(seed)
     , _road(scene, _dice)
-    , _usage(_dice)
+    , _usage(scene, _dice)
     , _umts(_road, _moves)
     , _gsm(_road, _moves)
 {
@@ -52,7 +53,7 @@ void GSMUMTSWorld::advance(std::chrono::milliseconds step)
     const Demand wanted = demand();
     _umts.advance(step, wanted);
     _gsm.advance(step, wanted, _dice);
-    _mobility.advance(step, {place(), isConnected(), _usage.wantsCall(), _usage.wantsTransfer()});
+    _mobility.advance(step, {place(), isConnected(), isRejecting(), _usage.wantsCall(), _usage.wantsTransfer()});
     _traffic.advance(step, _umts, wanted, _dice);
     transfer(step);
     _before = _now;
@@ -85,7 +86,7 @@ void GSMUMTSWorld::chooseSystem(std::chrono::milliseconds step)
 {
     switch (system()) {
     case RadioSystem::None:
-        return chooseFirstSystem();
+        return searchSystem();
     case RadioSystem::UMTS:
         return considerGSM(step);
     case RadioSystem::GSM:
@@ -93,17 +94,33 @@ void GSMUMTSWorld::chooseSystem(std::chrono::milliseconds step)
     }
 }
 
-void GSMUMTSWorld::chooseFirstSystem()
+void GSMUMTSWorld::searchSystem()
 {
     if (_elapsed < SearchTime)
         return;
     if (_umts.strongestCell().ecno > SelectableEcno) {
         _umts.enter(RRCState::Disconnected);
-        _moves.first(nameOf(_umts.servingCell()));
-    } else {
+        noteFound(nameOf(_umts.servingCell()));
+    } else if (_gsm.strongestCell().c1() > 0) {
         _gsm.enter(RRState::PLMNListConstruction);
-        _moves.first(nameOf(_gsm.servingCell()));
+        noteFound(nameOf(_gsm.servingCell()));
     }
+}
+
+void GSMUMTSWorld::noteFound(const CellName& cell)
+{
+    if (!_lostCell)
+        _moves.first(cell);
+    else if (*_lostCell != cell)
+        _moves.moved(*_lostCell, cell, AfterServiceLost);
+}
+
+void GSMUMTSWorld::loseService(const CellName& last)
+{
+    _lostCell = last;
+    _umts.leave();
+    _gsm.leave();
+    _leaving = _departing = 0ms;
 }
 
 bool GSMUMTSWorld::measuresGSM() const
@@ -136,6 +153,8 @@ void GSMUMTSWorld::considerGSM(std::chrono::milliseconds step)
     if (_mobility.isSignalling() && _umts.servingCell().ecno > LostEcno)
         return; // the procedure is let finish
     const CellName from = nameOf(_umts.servingCell());
+    if (_gsm.strongestCell().c1() < 0)
+        return loseService(from);
     const MoveCause cause = causeOfMoveToGSM();
     const RRState onAChannel = _mobility.isCalling() ? RRState::FromUMTSByHandover : RRState::FromUMTSByOrder;
     _umts.leave();
@@ -153,6 +172,9 @@ MoveCause GSMUMTSWorld::causeOfMoveToGSM() const
 
 void GSMUMTSWorld::considerUMTS(std::chrono::milliseconds step)
 {
+    keepTime(_fading, _gsm.strongestCell().c1() < 0, step);
+    if (_fading >= LossTime)
+        return loseService(nameOf(_gsm.servingCell()));
     if (_departing > 0ms)
         return moveToUMTS(step);
     const UMTSCell& cell = _umts.strongestCell();
@@ -196,6 +218,12 @@ RankingReport GSMUMTSWorld::ranking() const
     if (_gsm.isOn() || !measuresGSM())
         return {_umts.ranking(), {}};
     return {_leaving >= RankedTogether ? _umts.ranking() : std::vector<RankedUMTSCell>(), gsmRanking()};
+}
+
+bool GSMUMTSWorld::isRejecting() const
+{
+    constexpr std::uint16_t RejectingArea = 1202;
+    return _road.scene() == Scene::Rejected && place().locationArea == RejectingArea;
 }
 
 std::span<const PLMN> GSMUMTSWorld::equivalentNetworks() const
@@ -271,5 +299,54 @@ Situation GSMUMTSWorld::situation() const
     situation.hasSession = _usage.hasSession();
     return situation;
 }
+
+void GSMUMTSWorld::advanceAway(std::chrono::milliseconds step)
+{
+    _moves.begin();
+    _elapsed += step;
+    _road.advance(step, _dice);
+}
+
+Coverage GSMUMTSWorld::coverage() const
+{
+    const GSMCell& cell = _gsm.strongestCell();
+    return {nameOf(cell), cell.rssi, cell.c1(), false};
+}
+
+double GSMUMTSWorld::servingMargin() const
+{
+    return _gsm.isOn() ? _gsm.servingCell().c1() : 0;
+}
+
+CellName GSMUMTSWorld::servingName() const
+{
+    return nameOf(_gsm.servingCell());
+}
+
+bool GSMUMTSWorld::isOnOwnChannel() const
+{
+    return _gsm.isConnected();
+}
+
+bool GSMUMTSWorld::isSettled() const
+{
+    return _gsm.isSettled() && !_mobility.isSignalling() && !_mobility.isCalling();
+}
+
+void GSMUMTSWorld::arrive(Technology from, MoveKind how)
+{
+    const RRState fromUMTS = how == MoveKind::Redirection ? RRState::FromUMTSByOrder : RRState::FromUMTSByReselection;
+    _gsm.enter(from == Technology::UTRAN ? fromUMTS : RRState::CellSelection);
+    _now = _before = situation();
+}
+
+void GSMUMTSWorld::leave()
+{
+    _umts.leave();
+    _gsm.leave();
+    _leaving = _departing = _fading = 0ms;
+}
+
+void GSMUMTSWorld::setOthers(const Coverage&, const Coverage&) { }
 
 } // namespace spectrel

@@ -2,6 +2,7 @@
 
 #include "Telephony/Reports/GSMUMTSCellInformation.h"
 #include "Telephony/Reports/GSMUMTSReports.h"
+#include "Telephony/Simulator/Coverage.h"
 #include "Telephony/Simulator/GSMUMTS/GSMReceiver.h"
 #include "Telephony/Simulator/GSMUMTS/GSMUMTSRoad.h"
 #include "Telephony/Simulator/GSMUMTS/MobilityManagement.h"
@@ -101,15 +102,29 @@ public:
     /// None between sessions.
     std::optional<PacketTransfer> session() const;
 
+    // On a journey between technologies, as `TechnologyPart` says.
+    void advanceAway(std::chrono::milliseconds step);
+    Coverage coverage() const;
+    double servingMargin() const;
+    CellName servingName() const;
+    bool isOnOwnChannel() const;
+    bool isSettled() const;
+    void arrive(Technology from, MoveKind how);
+    void leave();
+    void setOthers(const Coverage& utran, const Coverage& gsm);
+
 private:
     Demand demand() const;
     Place place() const;
+    bool isRejecting() const;
     bool isConnected() const
     {
         return _umts.isConnected() || _gsm.isConnected();
     }
     void chooseSystem(std::chrono::milliseconds step);
-    void chooseFirstSystem();
+    void searchSystem();
+    void loseService(const CellName& last);
+    void noteFound(const CellName& cell);
     void considerGSM(std::chrono::milliseconds step);
     void considerUMTS(std::chrono::milliseconds step);
     void moveToUMTS(std::chrono::milliseconds step);
@@ -132,6 +147,8 @@ private:
     std::chrono::milliseconds _elapsed {0};
     std::chrono::milliseconds _leaving {0}; // for so long the other system has been the better one
     std::chrono::milliseconds _departing {0}; // on the way from GSM to UMTS
+    std::chrono::milliseconds _fading {0}; // for so long there is no suitable cell on GSM
+    std::optional<CellName> _lostCell; // the one before service was lost
     double _received = 0;
     double _sent = 0;
     Situation _now;

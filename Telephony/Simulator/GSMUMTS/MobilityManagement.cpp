@@ -29,20 +29,40 @@ void MobilityManagement::advanceMM(std::chrono::milliseconds step)
 {
     _inMM += step;
     const bool isIdle = _mm.state == MMState::Idle;
-    keepTime(_updateNeeded, isIdle && !isSearching() && !isLocationKnown(), step);
+    keepTime(_updateNeeded, isIdle && !isSearching() && !isLocationKnown() && !isForbidden(), step);
     if (const MMState next = nextMM(); next != _mm.state) {
-        if (_mm.state == MMState::LocationUpdateInitiated && next == MMState::WaitForNetworkCommand) {
-            _location = _inputs.place;
-            _mm.status = UpdateStatus::Updated;
-        }
+        if (_mm.state == MMState::LocationUpdateInitiated)
+            noteAnswer();
         _mm.state = next;
         _inMM = 0ms;
     }
     _mm.subState = mmSubState();
 }
 
+/// Of the network, to a location update (3GPP TS 24.008, 4.4.4.6 and 4.4.4.7).
+void MobilityManagement::noteAnswer()
+{
+    switch (nextMM()) {
+    case MMState::WaitForNetworkCommand:
+        _location = _inputs.place;
+        _mm.status = UpdateStatus::Updated;
+        _forbiddenArea.reset();
+        return;
+    case MMState::LocationUpdateRejected:
+        _location = _routing = {};
+        _forbiddenArea = _inputs.place.locationArea;
+        _mm.status = _gmm.status = UpdateStatus::AreaNotAllowed;
+        _gmm.state = GMMState::Deregistered;
+        return;
+    default:
+        return;
+    }
+}
+
 MMState MobilityManagement::nextMM() const
 {
+    if (isSearching() && _mm.state != MMState::Null)
+        return MMState::Idle; // without a cell every procedure ends
     switch (_mm.state) {
     case MMState::Null:
         return _inMM >= PowerOnTime ? MMState::Idle : MMState::Null;
@@ -53,7 +73,9 @@ MMState MobilityManagement::nextMM() const
     case MMState::LocationUpdateInitiated:
         if (!_inputs.isConnected)
             return MMState::Idle; // lost: it begins anew
-        return _inMM >= UpdateTime ? MMState::WaitForNetworkCommand : _mm.state;
+        if (_inMM < UpdateTime)
+            return _mm.state;
+        return _inputs.isRejected ? MMState::LocationUpdateRejected : MMState::WaitForNetworkCommand;
     case MMState::WaitForRRConnectionToCall:
         if (!_inputs.wantsCall)
             return MMState::Idle;
@@ -63,6 +85,7 @@ MMState MobilityManagement::nextMM() const
     case MMState::ConnectionActive:
         return _inputs.wantsCall ? _mm.state : MMState::WaitForNetworkCommand;
     case MMState::WaitForNetworkCommand:
+    case MMState::LocationUpdateRejected:
         return _inMM >= NetworkReleaseTime ? MMState::Idle : _mm.state;
     }
     return _mm.state;
@@ -83,6 +106,8 @@ MMSubState MobilityManagement::mmSubState() const
         return MMSubState::None;
     if (isSearching())
         return _mm.status == UpdateStatus::Updated ? MMSubState::NoCellAvailable : MMSubState::PLMNSearch;
+    if (isForbidden())
+        return MMSubState::LimitedService;
     return isLocationKnown() ? MMSubState::NormalService : MMSubState::LocationUpdateNeeded;
 }
 
@@ -141,7 +166,9 @@ GMMState MobilityManagement::afterRegistered() const
 GMMSubState MobilityManagement::gmmSubState() const
 {
     if (_gmm.state == GMMState::Deregistered)
-        return isSearching() ? GMMSubState::PLMNSearch : GMMSubState::AttachNeeded;
+        return isSearching() ? GMMSubState::PLMNSearch
+            : isForbidden()  ? GMMSubState::LimitedService
+                             : GMMSubState::AttachNeeded;
     if (_gmm.state != GMMState::Registered)
         return GMMSubState::None;
     if (isSearching())
@@ -149,6 +176,11 @@ GMMSubState MobilityManagement::gmmSubState() const
     if (isSuspended())
         return GMMSubState::Suspended;
     return isRoutingKnown() ? GMMSubState::NormalService : GMMSubState::UpdateNeeded;
+}
+
+bool MobilityManagement::isForbidden() const
+{
+    return !isSearching() && _forbiddenArea == _inputs.place.locationArea;
 }
 
 bool MobilityManagement::isLocationKnown() const

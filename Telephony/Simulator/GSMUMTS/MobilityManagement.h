@@ -3,6 +3,8 @@
 #include "Telephony/Reports/GSMUMTSReports.h"
 
 #include <chrono>
+#include <cstdint>
+#include <optional>
 
 namespace spectrel {
 
@@ -14,6 +16,7 @@ public:
     struct Inputs {
         Place place;
         bool isConnected = false; // signalling gets through
+        bool isRejected = false; // the network rejects updates: the location area is not allowed
         bool wantsCall = false;
         bool wantsTransfer = false;
     };
@@ -63,10 +66,13 @@ private:
     bool isLocationKnown() const;
     bool isRoutingKnown() const;
     bool isSuspended() const;
+    bool isForbidden() const;
+    void noteAnswer();
 
     Inputs _inputs;
     Place _location;
     Place _routing;
+    std::optional<std::uint16_t> _forbiddenArea; // where the last update was rejected
     MMReport _mm;
     GMMReport _gmm;
     std::chrono::milliseconds _inMM {0};

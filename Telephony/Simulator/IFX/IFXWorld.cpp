@@ -13,6 +13,7 @@ constexpr double SiteDistance = 700; // metres
 constexpr double CellPower = 33; // dBm; the path loss at 900 MHz is some 10 dB below that of the formula
 constexpr double Hysteresis = 4; // dB by which a cell must be better
 constexpr double Sensitivity = -104; // dBm
+constexpr double Weakest = -110; // dBm, the lower end of RXLEV: nothing is heard
 constexpr std::size_t MaxNeighbours = 6; // that a phone measures at once (3GPP TS 45.008, 7.1)
 
 constexpr std::chrono::milliseconds Round = 120s;
@@ -27,7 +28,8 @@ CellName nameOf(const IFXCell& cell)
 } // namespace
 
 IFXWorld::IFXWorld(Scene scene, std::uint32_t seed)
-    : _dice(seed)
+    : _isAlwaysTalking(scene == Scene::Handover)
+    , _dice(seed)
     , _road(scene, Sites, SiteDistance, _dice)
 {
     for (std::size_t site = 0; site < Sites; ++site) {
@@ -52,12 +54,7 @@ void IFXWorld::advance(std::chrono::milliseconds step)
     _elapsed += step;
     _road.advance(step, _dice);
     measure();
-    if (const std::size_t best = strongest(); _cells[best].level > serving().level + Hysteresis) {
-        _moves.moved(nameOf(serving()), nameOf(_cells[best]),
-            isTalking() ? ByHandover : byReselection(ReselectionRule::EqualPriority));
-        _serving = best;
-        ++_cellsVisited;
-    }
+    reselect();
     const double margin = serving().level - Sensitivity;
     _quality = static_cast<unsigned>(std::clamp((20 - margin) / 3 + _dice.between(-0.5, 1), 0.0, 7.0));
     if (!isTalking()) { // one at a time: class B
@@ -66,10 +63,27 @@ void IFXWorld::advance(std::chrono::milliseconds step)
     }
 }
 
+void IFXWorld::reselect()
+{
+    const std::size_t best = strongest();
+    if (_isInService && serving().level <= Weakest)
+        _isInService = false;
+    if (!_isInService && _cells[best].level < Sensitivity)
+        return;
+    const bool wasInService = _isInService;
+    _isInService = true;
+    if (_cells[best].level <= serving().level + Hysteresis)
+        return;
+    const MoveCause inService = isTalking() ? ByHandover : byReselection(ReselectionRule::EqualPriority);
+    _moves.moved(nameOf(serving()), nameOf(_cells[best]), wasInService ? inService : AfterServiceLost);
+    _serving = best;
+    ++_cellsVisited;
+}
+
 void IFXWorld::measure()
 {
     for (std::size_t mast = 0; mast < _cells.size(); ++mast)
-        _cells[mast].level = std::clamp(CellPower - _road.loss(mast), -110.0, -48.0);
+        _cells[mast].level = std::clamp(CellPower - _road.loss(mast), Weakest, -48.0);
 }
 
 std::size_t IFXWorld::strongest() const
@@ -92,11 +106,15 @@ std::vector<IFXCell> IFXWorld::neighbours() const
 bool IFXWorld::isTalking() const
 {
     const auto now = _elapsed % Round;
+    if (!_isInService || _isAlwaysTalking)
+        return _isInService;
     return now >= CallStart && now < CallEnd;
 }
 
 std::chrono::seconds IFXWorld::talkingFor() const
 {
+    if (_isAlwaysTalking)
+        return std::chrono::duration_cast<std::chrono::seconds>(_elapsed);
     return isTalking() ? std::chrono::duration_cast<std::chrono::seconds>(_elapsed % Round - CallStart) : 0s;
 }
 
@@ -107,8 +125,8 @@ unsigned IFXWorld::timingAdvance() const
 
 IFXReport IFXWorld::report() const
 {
-    return {serving(), neighbours(), isTalking(), talkingFor(), quality(), timingAdvance(), cellsVisited(),
-        bytesReceived(), bytesSent()};
+    return {_isInService, serving(), neighbours(), isTalking(), talkingFor(), quality(), timingAdvance(),
+        cellsVisited(), bytesReceived(), bytesSent()};
 }
 
 } // namespace spectrel

@@ -28,6 +28,10 @@ public:
     }
     /// The strongest other cells that can be heard, strongest first.
     std::vector<IFXCell> neighbours() const;
+    bool isInService() const
+    {
+        return _isInService;
+    }
     bool isTalking() const;
     /// Seconds since the call began; 0 without one.
     std::chrono::seconds talkingFor() const;
@@ -61,8 +65,11 @@ public:
 
 private:
     void measure();
+    void reselect();
     std::size_t strongest() const;
 
+    bool _isAlwaysTalking;
+    bool _isInService = true;
     Dice _dice;
     MastRoad _road;
     std::vector<IFXCell> _cells; // one a mast

@@ -2,6 +2,7 @@
 #include "Telephony/Encoders/PropertyListRecords.h"
 #include "Telephony/Simulator/Baseband.h"
 #include "Telephony/Simulator/LTE/LTEWorld.h"
+#include "Telephony/Simulator/TechnologyPart.h"
 
 #include <array>
 
@@ -16,25 +17,37 @@ Bytes connectedMode(const LTEWorld& world, Moment time)
     return world.isConnected() ? lteConnectedModeRecord(world.connectedReport(), time) : Bytes();
 }
 
+bool isCamping(const LTEWorld& world)
+{
+    return world.isInService() && !world.isConnected();
+}
+
 Bytes servingMeasurement(const LTEWorld& world, Moment time)
 {
-    return world.isConnected() ? Bytes() : lteServingMeasurementRecord(world.idleMode().serving(), time);
+    return isCamping(world) ? lteServingMeasurementRecord(world.idleMode().serving(), time) : Bytes();
 }
 
 Bytes neighbourMeasurement(const LTEWorld& world, Moment time)
 {
-    return world.isConnected() ? Bytes() : lteNeighbourMeasurementRecord(world.idleMode().neighbours(), time);
+    return isCamping(world) ? lteNeighbourMeasurementRecord(world.idleMode().neighbours(), time) : Bytes();
 }
 
 Bytes reselection(const LTEWorld& world, Moment time)
 {
-    return world.isConnected() ? Bytes() : lteReselectionRecord(world.idleMode().candidate(), time);
+    return isCamping(world) ? lteReselectionRecord(world.idleMode().candidate(), time) : Bytes();
 }
 
 Bytes cellInformation(const LTEWorld& world, Moment time)
 {
     constexpr std::size_t Neighbours = 4;
+    if (!world.isInService())
+        return {};
     return lteCellInformationRecord(world.servingCell(), world.neighbours(Neighbours), time);
+}
+
+template <auto Encode> Bytes ofServingCell(const LTEWorld& world, Moment time)
+{
+    return world.isInService() ? Encode(world.servingCell(), time) : Bytes();
 }
 
 constexpr std::array<Cadence<LTEWorld>, 9> Cadences {{
@@ -44,8 +57,8 @@ constexpr std::array<Cadence<LTEWorld>, 9> Cadences {{
         [](const LTEWorld& world, Moment time) {
             return contextsRecord(world.bytesReceived(), world.bytesSent(), time);
         }},
-    {400ms, false, [](const LTEWorld& world, Moment time) { return lteServingCellRecord(world.servingCell(), time); }},
-    {800ms, false, [](const LTEWorld& world, Moment time) { return lteAntennasRecord(world.servingCell(), time); }},
+    {400ms, false, ofServingCell<lteServingCellRecord>},
+    {800ms, false, ofServingCell<lteAntennasRecord>},
     {200ms, false, connectedMode},
     {LTEIdleMode::Cycle, true, servingMeasurement},
     {LTEIdleMode::Cycle, true, neighbourMeasurement},
@@ -57,6 +70,11 @@ constexpr std::array<Cadence<LTEWorld>, 9> Cadences {{
 std::unique_ptr<Baseband> makeLTEBaseband(Scene scene, std::uint32_t seed)
 {
     return std::make_unique<SteadyBaseband<LTEWorld>>(Technology::LTE, scene, seed, Cadences);
+}
+
+std::unique_ptr<TechnologyPart> makeLTEPart(std::uint32_t seed)
+{
+    return std::make_unique<SteadyPart<LTEWorld>>(Technology::LTE, seed, Cadences);
 }
 
 } // namespace spectrel

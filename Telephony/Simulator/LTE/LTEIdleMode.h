@@ -42,6 +42,9 @@ public:
     /// One cycle. Returns the cell to move to, if any, and by which rule.
     std::optional<Reselection> cycle();
 
+    /// What is left to a phone without a suitable cell.
+    std::optional<std::size_t> strongestSuitable() const;
+
     const LTEServingReport& serving() const
     {
         return _report;
@@ -59,7 +62,6 @@ private:
     std::vector<const LTELayer*> carriersToMeasure() const;
     std::optional<std::size_t> bestOf(std::chrono::milliseconds minTime) const;
     ReselectionRule ruleFor(const LTECell& cell) const;
-    std::optional<std::size_t> strongestSuitable() const;
     const LTECell& servingCell() const
     {
         return _road.cells()[_serving];

@@ -10,6 +10,8 @@ namespace {
 constexpr double SiteDistance = 500;
 constexpr Valley SiteLess {2500, 4500, 16}; // the sites at both ends stand
 
+constexpr OpenWater Water {1900, 2400}; // in front of the first site
+
 constexpr double ResourceBlockElements = 12; // subcarriers of a resource block
 constexpr double Noise = -125; // dBm in one subcarrier of 15 kHz, noise figure 7 dB
 constexpr double Fading = 1.5; // dB, from one measurement to the next
@@ -55,15 +57,13 @@ constexpr std::array<LTELayer, 3> Layers {{
         .threshServingLow = 24},
 }};
 
-using Technology = ReselectionTechnology;
-
 constexpr std::array<OtherCell, 6> OtherCells {{
-    {{Technology::UTRAN, 3, 10700, 311, 0}, 2950, 33, -115},
-    {{Technology::UTRAN, 3, 10700, 118, 0}, 3900, 33, -115},
-    {{Technology::GERAN, 1, 62, 0x2B, 0}, 3200, 43, -104},
-    {{Technology::GERAN, 1, 612, 0x15, 1}, 4100, 43, -104},
-    {{Technology::CDMA1xRTT, 1, 283, 168, 0}, 3500, 36, -108},
-    {{Technology::CDMAHRPD, 2, 37, 300, 0}, 3500, 36, -108},
+    {{ReselectionTechnology::UTRAN, 3, 10700, 311, 0}, 2950, 33, -115},
+    {{ReselectionTechnology::UTRAN, 3, 10700, 118, 0}, 3900, 33, -115},
+    {{ReselectionTechnology::GERAN, 1, 62, 0x2B, 0}, 3200, 43, -104},
+    {{ReselectionTechnology::GERAN, 1, 612, 0x15, 1}, 4100, 43, -104},
+    {{ReselectionTechnology::CDMA1xRTT, 1, 283, 168, 0}, 3500, 36, -108},
+    {{ReselectionTechnology::CDMAHRPD, 2, 37, 300, 0}, 3500, 36, -108},
 }};
 
 double milliwatts(double dBm)
@@ -143,17 +143,32 @@ void LTERoad::advance(std::chrono::milliseconds step, const Journey& journey, Di
     }
 }
 
+void LTERoad::setOtherCells(const Coverage& utran, const Coverage& gsm)
+{
+    const auto cell = [](ReselectionTechnology technology, std::uint8_t priority, const Coverage& found) {
+        const ReselectionCandidate candidate {technology, priority, static_cast<std::uint16_t>(found.cell.channel),
+            static_cast<std::uint16_t>(found.cell.id), 0};
+        const int qRxLevMin = static_cast<int>(found.level - found.margin);
+        return OtherCell {candidate, 0, std::nullopt, qRxLevMin, found.level};
+    };
+    _otherCells = {cell(ReselectionTechnology::UTRAN, 3, utran), cell(ReselectionTechnology::GERAN, 1, gsm)};
+}
+
 void LTERoad::receive(const Journey& journey, Dice& dice)
 {
-    const double loss = SiteLess.lossAt(journey);
+    const double loss = SiteLess.lossAt(journey) + journey.tunnelLoss();
     for (std::size_t index = 0; index < _cells.size(); ++index) {
         LTECell& cell = _cells[index];
         const double distance = journey.distanceTo(cell.position, cell.offset);
-        const double received = cell.power - pathLoss(distance) - loss + _shadowing[index].decibels();
+        const double water = index == 0 ? Water.gainAt(journey) : 0;
+        const double received = cell.power - pathLoss(distance) - loss + _shadowing[index].decibels() + water;
         cell.measured.rsrp = std::clamp(received + dice.between(-Fading, Fading), -139.0, -44.0);
     }
-    for (OtherCell& cell : _otherCells)
-        cell.level = cell.power - pathLoss(journey.distanceTo(cell.position, 80));
+    for (OtherCell& cell : _otherCells) {
+        if (!cell.power)
+            continue;
+        cell.level = *cell.power - pathLoss(journey.distanceTo(cell.position, 80)) - journey.tunnelLoss();
+    }
 }
 
 /// The RSSI of a carrier: what all its cells send, and the noise, in all its resource blocks.

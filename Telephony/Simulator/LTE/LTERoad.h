@@ -2,11 +2,13 @@
 
 #include "Telephony/Reports/LTECell.h"
 #include "Telephony/Reports/LTEReports.h"
+#include "Telephony/Simulator/Coverage.h"
 #include "Telephony/Simulator/Dice.h"
 #include "Telephony/Simulator/Journey.h"
 #include "Telephony/Simulator/Propagation.h"
 
 #include <chrono>
+#include <optional>
 #include <span>
 #include <vector>
 
@@ -16,7 +18,7 @@ namespace spectrel {
 struct OtherCell {
     ReselectionCandidate candidate;
     double position; // metres along the road
-    double power; // dBm
+    std::optional<double> power; // dBm; none: another world measures it
     int qRxLevMin; // dBm
     double level = -140; // dBm, now
 
@@ -32,6 +34,9 @@ class LTERoad {
 public:
     static constexpr double Length = 6000; // metres
 
+    static constexpr double PacingPlace = 1250; // metres along it, between two sites
+    static constexpr double PacingReach = 90;
+
     explicit LTERoad(Dice& dice);
 
     /// Measures every cell from where the phone is.
@@ -45,6 +50,8 @@ public:
     {
         return _otherCells;
     }
+    /// The best cells of other technologies, instead of those along the road.
+    void setOtherCells(const Coverage& utran, const Coverage& gsm);
     /// The carriers of the network.
     static std::span<const LTELayer> layers();
 

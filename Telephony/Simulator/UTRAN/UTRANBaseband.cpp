@@ -1,6 +1,7 @@
 #include "Telephony/Encoders/PropertyListRecords.h"
 #include "Telephony/Encoders/UTRANRecords.h"
 #include "Telephony/Simulator/Baseband.h"
+#include "Telephony/Simulator/TechnologyPart.h"
 #include "Telephony/Simulator/UTRAN/UTRANWorld.h"
 
 #include <array>
@@ -52,6 +53,11 @@ constexpr std::array<Cadence<UTRANWorld>, 9> Cadences {{
 std::unique_ptr<Baseband> makeUTRANBaseband(Scene scene, std::uint32_t seed)
 {
     return std::make_unique<SteadyBaseband<UTRANWorld>>(Technology::UTRAN, scene, seed, Cadences);
+}
+
+std::unique_ptr<TechnologyPart> makeUTRANPart(std::uint32_t seed)
+{
+    return std::make_unique<SteadyPart<UTRANWorld>>(Technology::UTRAN, seed, Cadences);
 }
 
 } // namespace spectrel

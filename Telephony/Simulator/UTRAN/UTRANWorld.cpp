@@ -10,10 +10,15 @@ namespace {
 
 using namespace std::chrono_literals;
 
-constexpr double RoadLength = 5000; // metres, a ring
+constexpr double OwnLength = 5000; // metres, a ring
 constexpr double SiteDistance = 400;
 constexpr double GSMSiteDistance = 700;
-constexpr Valley SiteLess {2000, 3200, 22};
+constexpr Valley OwnSiteLess {2000, 3200, 22};
+constexpr Valley SiteLessOnJourney {3300, 4700, 22};
+
+constexpr OpenWater Water {1500, 1950}; // in front of the first site
+constexpr double PacingPlace = 1000; // between two sites
+constexpr double PacingReach = 75;
 
 constexpr double Power = 33; // dBm, common control channel
 constexpr double GSMPower = 43;
@@ -34,12 +39,6 @@ constexpr double GSMAudible = -108; // dBm
 double milliwatts(double dBm)
 {
     return std::pow(10, dBm / 10);
-}
-
-/// Metres along the ring.
-double between(double one, double other)
-{
-    return std::fabs(std::remainder(one - other, RoadLength));
 }
 
 /// Percent: one at the target, ten times as many with each 4 dB less.
@@ -63,28 +62,30 @@ std::uint8_t signalSteps(double decibels)
 
 UTRANWorld::UTRANWorld(Scene scene, std::uint32_t seed)
     : _dice(seed)
-    , _journey(scene, RoadLength, _dice)
+    , _roadLength(scene == Scene::Journey ? Journey::SharedLength : OwnLength)
+    , _siteLess(scene == Scene::Journey ? SiteLessOnJourney : OwnSiteLess)
+    , _journey(scene, _roadLength, _dice)
     , _calls({40, 80}, {15, 30}, {25, 40}, _dice)
     , _transfers({15, 45}, {8, 20}, {4, 8}, _dice)
 {
     buildRoad();
+    if (scene == Scene::PingPong)
+        _journey.stayAround(PacingPlace, PacingReach);
     measure();
-    const auto strongest =
-        std::ranges::max_element(_cells, [](const UTRANCell& a, const UTRANCell& b) { return a.rscp < b.rscp; });
-    _serving = static_cast<std::size_t>(strongest - _cells.begin());
+    _serving = strongest();
     _moves.first(nameOf(servingCell()));
 }
 
 void UTRANWorld::buildRoad()
 {
     std::uint32_t number = 301;
-    for (double position = 0; position < RoadLength; position += SiteDistance, ++number) {
-        if (position > SiteLess.from && position < SiteLess.to)
+    for (double position = 0; position < _roadLength; position += SiteDistance, ++number) {
+        if (position > _siteLess.from && position < _siteLess.to)
             continue;
         UTRANCell cell;
         cell.identity = 12u << 16 | number;
-        cell.locationArea = static_cast<std::uint16_t>(position < RoadLength / 2 ? 4101 : 4102);
-        cell.registrationArea = static_cast<std::uint8_t>(position < RoadLength / 2 ? 17 : 18);
+        cell.locationArea = static_cast<std::uint16_t>(position < _roadLength / 2 ? 4101 : 4102);
+        cell.registrationArea = static_cast<std::uint8_t>(position < _roadLength / 2 ? 17 : 18);
         cell.channel = Channels[_dice.below(Channels.size())];
         cell.cellParameterId = static_cast<std::uint8_t>(_dice.below(128));
         cell.position = position + _dice.between(-40, 40);
@@ -92,7 +93,7 @@ void UTRANWorld::buildRoad()
         _cells.push_back(cell);
         _shadowing.emplace_back(_dice);
     }
-    for (double position = 0; position < RoadLength; position += GSMSiteDistance) {
+    for (double position = 0; position < _roadLength; position += GSMSiteDistance) {
         GSMNeighbour cell;
         cell.identity = static_cast<std::uint16_t>(_dice.below(0x4000));
         cell.networkColour = static_cast<std::uint8_t>(_dice.below(8));
@@ -107,18 +108,13 @@ void UTRANWorld::buildRoad()
 void UTRANWorld::advance(std::chrono::milliseconds step)
 {
     _moves.begin();
-    _journey.advance(step, _dice);
-    for (auto* shadowings : {&_shadowing, &_gsmShadowing}) {
-        for (Shadowing& shadowing : *shadowings)
-            shadowing.advance(step, _dice);
-    }
-    measure();
+    advanceRoad(step);
     reselect(step);
     controlPower();
     _calls.advance(step, _dice);
     _transfers.advance(step, _dice);
     if (isInService())
-        _connection.advance(step, _calls.isOn() || _transfers.isOn());
+        _connection.advance(step, isCalling() || _transfers.isOn());
     else
         _connection.lose();
     if (_connection.isOnDedicatedChannel() && _transfers.isOn()) {
@@ -128,17 +124,28 @@ void UTRANWorld::advance(std::chrono::milliseconds step)
     }
 }
 
+void UTRANWorld::advanceRoad(std::chrono::milliseconds step)
+{
+    _journey.advance(step, _dice);
+    for (auto* shadowings : {&_shadowing, &_gsmShadowing}) {
+        for (Shadowing& shadowing : *shadowings)
+            shadowing.advance(step, _dice);
+    }
+    measure();
+}
+
 void UTRANWorld::measure()
 {
-    const double hills = SiteLess.lossAt(_journey);
+    const double hills = _siteLess.lossAt(_journey) + _journey.tunnelLoss();
     for (std::size_t index = 0; index < _cells.size(); ++index) {
         UTRANCell& cell = _cells[index];
         const double loss = pathLoss(_journey.distanceTo(cell.position, cell.offset)) + hills;
-        cell.rscp = std::clamp(Power - loss + _shadowing[index].decibels(), -130.0, -25.0);
+        const double water = index == 0 ? Water.gainAt(_journey) : 0;
+        cell.rscp = std::clamp(Power - loss + _shadowing[index].decibels() + water, -130.0, -25.0);
     }
     for (std::size_t index = 0; index < _gsmCells.size(); ++index) {
         GSMNeighbour& cell = _gsmCells[index];
-        const double loss = pathLoss(_journey.distanceTo(cell.position, 150));
+        const double loss = pathLoss(_journey.distanceTo(cell.position, 150)) + _journey.tunnelLoss();
         cell.rssi = std::clamp(GSMPower - loss + _gsmShadowing[index].decibels(), -115.0, -40.0);
     }
 }
@@ -185,7 +192,7 @@ std::vector<const UTRANCell*> UTRANWorld::otherCells() const
 
 bool UTRANWorld::isNamed(const UTRANCell& cell) const
 {
-    return between(cell.position, servingCell().position) <= NamedDistance;
+    return std::fabs(std::remainder(cell.position - servingCell().position, _roadLength)) <= NamedDistance;
 }
 
 bool UTRANWorld::isMeasured(const UTRANCell& cell) const
@@ -258,7 +265,7 @@ TransportReport UTRANWorld::transportChannels() const
         for (const std::uint8_t channel : channels)
             report.channels.push_back({channel, blockErrors(signal - slots + 1)});
     };
-    if (_calls.isOn())
+    if (isCalling())
         addComposite(1, {1, 2, 3}); // the three classes of speech bits
     if (_transfers.isOn())
         addComposite(3, {6});
@@ -267,5 +274,57 @@ TransportReport UTRANWorld::transportChannels() const
     report.channels.push_back({24, blockErrors(signal)}); // signalling
     return report;
 }
+
+void UTRANWorld::advanceAway(std::chrono::milliseconds step)
+{
+    _moves.begin();
+    advanceRoad(step);
+}
+
+std::size_t UTRANWorld::strongest() const
+{
+    return static_cast<std::size_t>(std::ranges::max_element(_cells, {}, &UTRANCell::rscp) - _cells.begin());
+}
+
+Coverage UTRANWorld::coverage() const
+{
+    constexpr double ThreshHigh = 16; // dB
+    const UTRANCell& cell = _cells[strongest()];
+    const double margin = cell.rscp - UTRANThresholds::QRxLevMin;
+    return {nameOf(cell), cell.rscp, margin, margin > ThreshHigh};
+}
+
+double UTRANWorld::servingMargin() const
+{
+    return srxlev();
+}
+
+CellName UTRANWorld::servingName() const
+{
+    return nameOf(servingCell());
+}
+
+bool UTRANWorld::isOnOwnChannel() const
+{
+    return _connection.isOnDedicatedChannel();
+}
+
+bool UTRANWorld::isSettled() const
+{
+    return true;
+}
+
+void UTRANWorld::arrive(Technology, MoveKind)
+{
+    _serving = strongest();
+    _candidateFor = 0ms;
+}
+
+void UTRANWorld::leave()
+{
+    _connection.lose();
+}
+
+void UTRANWorld::setOthers(const Coverage&, const Coverage&) { }
 
 } // namespace spectrel

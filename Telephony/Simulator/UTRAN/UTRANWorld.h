@@ -2,6 +2,7 @@
 
 #include "Telephony/Reports/UTRANCell.h"
 #include "Telephony/Reports/UTRANReports.h"
+#include "Telephony/Simulator/Coverage.h"
 #include "Telephony/Simulator/Dice.h"
 #include "Telephony/Simulator/Journey.h"
 #include "Telephony/Simulator/Move.h"
@@ -65,8 +66,25 @@ public:
         return static_cast<std::uint64_t>(_sent);
     }
 
+    // On a journey between technologies, as `TechnologyPart` says.
+    void advanceAway(std::chrono::milliseconds step);
+    Coverage coverage() const;
+    double servingMargin() const;
+    CellName servingName() const;
+    bool isOnOwnChannel() const;
+    bool isSettled() const;
+    void arrive(Technology from, MoveKind how);
+    void leave();
+    void setOthers(const Coverage& utran, const Coverage& gsm);
+
 private:
+    bool isCalling() const
+    {
+        return _journey.scene() == Scene::Handover || _calls.isOn();
+    }
     void buildRoad();
+    void advanceRoad(std::chrono::milliseconds step);
+    std::size_t strongest() const;
     void measure();
     void reselect(std::chrono::milliseconds step);
     MoveCause causeOfMove() const;
@@ -76,6 +94,8 @@ private:
     void controlPower();
 
     Dice _dice;
+    double _roadLength; // metres
+    Valley _siteLess; // no sites there
     Journey _journey;
     std::vector<UTRANCell> _cells;
     std::vector<Shadowing> _shadowing; // one for each cell

@@ -1,5 +1,6 @@
 #include "Telephony/Simulator/Journey.h"
 
+#include <algorithm>
 #include <cmath>
 #include <gtest/gtest.h>
 #include <utility>
@@ -63,6 +64,52 @@ TEST(SceneTest, NamesAreThoseOfTheCommandLine)
     Scene scene = Scene::Walk;
     EXPECT_FALSE(sceneNamed("fly", scene));
     EXPECT_EQ(scene, Scene::Walk);
+}
+
+TEST(JourneyTest, PingPongStaysAroundItsPlace)
+{
+    Dice dice(3);
+    Journey journey(Scene::PingPong, RingLength, dice);
+    journey.stayAround(30, 100); // across the ring's seam
+    double furthestAhead = 0;
+    double furthestBehind = 0;
+    for (int step = 0; step < 5000; ++step) {
+        journey.advance(100ms, dice);
+        furthestAhead = std::max(furthestAhead, journey.ahead(30));
+        furthestBehind = std::min(furthestBehind, journey.ahead(30));
+    }
+    EXPECT_NEAR(furthestAhead, 100, 3);
+    EXPECT_NEAR(furthestBehind, -100, 3);
+}
+
+TEST(JourneyTest, TunnelsTakeEverySignalForAWhile)
+{
+    Dice dice(4);
+    Journey inTunnels(Scene::Tunnel, RingLength, dice);
+    Journey outside(Scene::Drive, RingLength, dice);
+    int inside = 0;
+    for (int step = 0; step < 6000; ++step) {
+        inTunnels.advance(100ms, dice);
+        outside.advance(100ms, dice);
+        inside += inTunnels.tunnelLoss() > 90;
+        EXPECT_EQ(outside.tunnelLoss(), 0);
+    }
+    EXPECT_GT(inside, 600);
+    EXPECT_LT(inside, 2400);
+}
+
+TEST(JourneyTest, PhonesOfOneJourneyStayTogetherWhateverElseTheirDiceDecide)
+{
+    Dice one(5);
+    Dice other(5);
+    Journey first(Scene::Journey, Journey::SharedLength, one);
+    Journey second(Scene::Journey, Journey::SharedLength, other);
+    for (int step = 0; step < 1000; ++step) {
+        other.number();
+        first.advance(100ms, one);
+        second.advance(100ms, other);
+        ASSERT_EQ(first.ahead(0), second.ahead(0));
+    }
 }
 
 } // namespace

@@ -64,6 +64,19 @@ private:
     int _files = 0;
 };
 
+TEST_F(ReplaySourceTest, ClockThatIsSetNeitherStopsNorHastensTheReplay)
+{
+    const auto source = open({{recordingOf(9)}, 1, false, {}});
+    const auto stream = source->start(collector);
+    loop.advance(1s);
+    loop.setClock(-1h);
+    loop.advance(2s);
+    EXPECT_EQ(collector.messages.size(), 4u);
+    loop.setClock(3h);
+    loop.advance(2s);
+    EXPECT_EQ(collector.messages.size(), 6u);
+}
+
 TEST_F(ReplaySourceTest, MessagesKeepTheirDistances)
 {
     const auto source = open({{recordingOf(5)}, 1, false, {}});

@@ -67,5 +67,26 @@ TEST_F(SimulatorSourceTest, BusyClientLosesNothingOnceItTakesAgain)
     EXPECT_EQ(collector.messages, other.messages);
 }
 
+TEST_F(SimulatorSourceTest, ChannelsEndWhenThePhoneChangesItsTechnology)
+{
+    SimulatorSource travelling(loop, loop, makeBaseband(Technology::LTE, Scene::Journey, 1), 1);
+    auto stream = travelling.start(collector);
+    unsigned changes = 0;
+    travelling.setBasebandHandler([&] {
+        ++changes;
+        stream.reset();
+    });
+    while (changes == 0)
+        loop.advance(1s);
+    EXPECT_EQ(travelling.technology(), Technology::UTRAN);
+    EXPECT_EQ(loop.timers(), 0U);
+    Collector next;
+    stream = travelling.start(next);
+    EXPECT_FALSE(next.messages.empty());
+    while (changes == 1)
+        loop.advance(1s);
+    EXPECT_EQ(travelling.technology(), Technology::GSM);
+}
+
 } // namespace
 } // namespace spectrel

@@ -169,5 +169,33 @@ TEST_F(MobilityManagementTest, LostCoverageKeepsTheRegistration)
     EXPECT_EQ(mobility.mm().subState, MMSubState::NormalService);
 }
 
+TEST_F(MobilityManagementTest, RejectedPhoneHasLimitedServiceUntilItComesToAnotherArea)
+{
+    register_(UMTSPlace);
+    inputs.isRejected = true;
+    register_(OtherUMTSPlace);
+    EXPECT_EQ(mobility.mm(), (MMReport {MMState::Idle, MMSubState::LimitedService, UpdateStatus::AreaNotAllowed}));
+    EXPECT_EQ(mobility.gmm(),
+        (GMMReport {GMMState::Deregistered, GMMSubState::LimitedService, UpdateStatus::AreaNotAllowed}));
+    EXPECT_EQ(mobility.service(), ServiceType::Limited);
+    EXPECT_EQ(mobility.registration(), (RegistrationReport {RegistrationState::Idle, PLMNSelection::Limited}));
+    EXPECT_FALSE(mobility.isSignalling()) << "it does not ask again";
+    inputs.isRejected = false;
+    register_(GSMPlace);
+    EXPECT_EQ(mobility.mm(), (MMReport {MMState::Idle, MMSubState::NormalService, UpdateStatus::Updated}));
+    EXPECT_EQ(mobility.gmm().status, UpdateStatus::Updated);
+}
+
+TEST_F(MobilityManagementTest, LostCellEndsACall)
+{
+    register_(UMTSPlace);
+    inputs.wantsCall = true;
+    settle();
+    EXPECT_EQ(mobility.mm().state, MMState::ConnectionActive);
+    inputs.place = {};
+    pass(100ms);
+    EXPECT_EQ(mobility.mm(), (MMReport {MMState::Idle, MMSubState::NoCellAvailable, UpdateStatus::Updated}));
+}
+
 } // namespace
 } // namespace spectrel

@@ -1,4 +1,4 @@
-#include "CommandLine/Output/JsonText.h"
+#include "Values/JsonText.h"
 
 #include <rapidjson/writer.h>
 
