@@ -44,12 +44,12 @@ int run(const Arguments& arguments, const Context& context)
         return view(arguments, context);
     case Job::Record:
         return record(arguments.record, context);
+    case Job::Mark:
+        return mark(arguments.mark, context);
     case Job::Channel:
         return channel(arguments.channel);
-    case Job::Mark:
-        return mark(arguments.mark);
     case Job::Report:
-        return writeReport(arguments.report);
+        return writeReport(arguments.report, context);
     case Job::Application:
         return runApplication(arguments, context);
     }

@@ -25,7 +25,7 @@ constexpr double WholeWidth = 960;
 constexpr double HalfWidth = 600;
 constexpr double Height = 240;
 constexpr double Left = 46;
-constexpr double Margin = 10; // on the right
+constexpr double Margin = 18; // on the right
 constexpr double Top = 34;
 constexpr double Bottom = 212;
 constexpr double StripTop = 8; // of the strip that names the serving cells
@@ -226,9 +226,10 @@ private:
     void appendMark(const ReportedEvent& event, double x)
     {
         const bool isMove = event.mark == Mark::Move;
-        _out += "<path class=\"" + std::string(isMove ? "move" : "note") + "\" d=\"M" + at(x) + " " + at(Top) + "V"
-            + at(Bottom) + (isMove ? "" : "m-5 0h10l-5 -8z") + "\"><title>" + clockText(event.time) + " "
-            + escaped(event.text) + "</title></path>";
+        const std::string shape = isMove ? "M" + at(x) + " " + at(StripTop + StripHeight + 2) + "v8"
+                                         : "M" + at(x) + " " + at(Top) + "V" + at(Bottom) + "m-5 0h10l-5 -8z";
+        _out += "<path class=\"" + std::string(isMove ? "move" : "note") + "\" d=\"" + shape + "\"><title>"
+            + clockText(event.time) + " " + escaped(event.text) + "</title></path>";
     }
 
     void appendTable()

@@ -44,8 +44,8 @@ void appendTop(const Recordings& recordings, std::string& out)
 void appendLevels(const Recordings& recordings, std::string& out)
 {
     out += "<section>\n<h2>Levels</h2>\n<p class=\"soft\">Each colour and letter is a serving cell, as in the table of "
-           "cells; a pale band spans the values around the mean. Dashed: the phone moved. Triangle: bookmark or alarm. "
-           "Red: without service.</p>\n";
+           "cells; a pale band spans the values around the mean. Ticks below the cells: the phone moved. Triangle: "
+           "bookmark or alarm. Red: without service.</p>\n";
     for (std::size_t i = 0; i < LevelCount; ++i) {
         const auto level = static_cast<Level>(i);
         if (std::none_of(recordings.begin(), recordings.end(),
@@ -74,7 +74,7 @@ void appendLevels(const Recordings& recordings, std::string& out)
 void appendDistributions(const Recordings& recordings, std::string& out)
 {
     out += "<section>\n<h2>Distributions</h2>\n<p class=\"soft\">Which share of the values was at or below a "
-           "level.</p>\n<div class=\"side\">\n";
+           "level.</p>\n<div class=\"side pair\">\n";
     for (std::size_t i = 0; i < LevelCount; ++i) {
         const auto level = static_cast<Level>(i);
         if (std::any_of(recordings.begin(), recordings.end(),

@@ -15,19 +15,19 @@ h1{font-size:1.6rem;margin:.5rem 0 0}h2{font-size:1.2rem;margin:2.2rem 0 .5rem;b
 h3{font-size:1rem;margin:1.2rem 0 .3rem}p{margin:.3rem 0}small,.soft{color:var(--soft)}
 figure{margin:0 0 1rem;min-width:0}svg{display:block;width:100%;height:auto;font:11px system-ui,sans-serif;fill:var(--text)}
 .side{display:grid;gap:0 2rem;grid-template-columns:repeat(auto-fit,minmax(min(100%,26rem),1fr))}
-.wide{overflow-x:auto}.small{font-size:.8rem}.small th,.small td{padding-right:.6rem}table{border-collapse:collapse;font-variant-numeric:tabular-nums}
+.wide{overflow-x:auto}.k{white-space:nowrap}.small{font-size:.8rem}.small th,.small td{padding-right:.6rem}table{border-collapse:collapse;font-variant-numeric:tabular-nums}
 caption{text-align:left;color:var(--soft);font-size:.85rem}th,td{text-align:left;vertical-align:top;padding:.2rem .9rem .2rem 0;border-bottom:1px solid var(--line)}
 thead th{color:var(--soft);font-weight:600;white-space:nowrap}tbody th{font-weight:600;white-space:nowrap}
 ul{margin:.2rem 0;padding-left:1.1rem}code{font-size:.85em}details{font-size:.9rem}summary{color:var(--soft);cursor:pointer}
 .swatch{display:inline-block;width:.75em;height:.75em;margin-right:.4em;border-radius:2px;background:var(--c,transparent)}
 .grid path{stroke:var(--line);fill:none}.grid text{fill:var(--soft)}.end{text-anchor:end}.mid{text-anchor:middle}
 .f{fill:var(--c)}.on{fill:var(--on);font-weight:600}.l{fill:none;stroke:var(--c,var(--soft));stroke-width:1.5;stroke-linejoin:round;stroke-linecap:round}
-.b{fill:var(--c,var(--soft));opacity:.22}.move{stroke:var(--soft);stroke-width:.8;stroke-dasharray:2 3;fill:none}
+.b{fill:var(--c,var(--soft));opacity:.22}.move{stroke:var(--soft);fill:none}
 .note{stroke:var(--text);fill:var(--text);stroke-width:1}.lost{fill:var(--lost);opacity:.22}
 .d1{stroke-dasharray:7 3}.d2{stroke-dasharray:2 3}.d3{stroke-dasharray:8 3 2 3}
 .c0{--c:var(--c0)}.c1{--c:var(--c1)}.c2{--c:var(--c2)}.c3{--c:var(--c3)}.c4{--c:var(--c4)}.c5{--c:var(--c5)}.c6{--c:var(--c6)}.c7{--c:var(--c7)}.c8{--c:var(--c8)}.c9{--c:var(--c9)}
 @media print{body{max-width:none;padding:0;font-size:10pt}figure,tr,h2,h3{break-inside:avoid}h2,h3{break-after:avoid}
-*{print-color-adjust:exact;-webkit-print-color-adjust:exact}.wide{overflow:visible}details:not([open]){display:none}}
+*{print-color-adjust:exact;-webkit-print-color-adjust:exact}.wide{overflow:visible}.pair{grid-template-columns:1fr 1fr}details:not([open]){display:none}}
 )css";
 
 } // namespace spectrel

@@ -7,6 +7,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <initializer_list>
+#include <map>
 #include <numeric>
 #include <string_view>
 
@@ -65,6 +66,15 @@ std::string joined(const std::vector<std::string>& texts, std::string_view betwe
     for (const std::string& text : texts)
         out += (out.empty() ? "" : std::string(between)) + text;
     return out;
+}
+
+/// The names of a few, else the first and the last.
+std::string filesText(const std::vector<std::string>& files)
+{
+    constexpr std::size_t Few = 4;
+    return files.size() <= Few
+        ? joined(files, ", ")
+        : files.front() + " to " + files.back() + " (" + std::to_string(files.size()) + " files)";
 }
 
 std::size_t countOf(const ReportedRecording& recording, ReportedEvent::Mark mark)
@@ -128,17 +138,18 @@ void appendEvidence(const ReportedEvent& event, std::string& out)
 {
     if (event.evidence.empty())
         return;
-    out += "<ul>";
+    out += "<br><small>";
     for (const auto& [path, value] : event.evidence)
-        out += "<li><code>" + escaped(path) + "</code> " + escaped(value) + "</li>";
-    out += "</ul>";
+        out += "<code>" + escaped(path) + "</code> " + escaped(value) + "; ";
+    out.resize(out.size() - 2);
+    out += "</small>";
 }
 
 void appendEventRow(const ReportedEvent& event, std::string& out)
 {
     out += "<tr><th scope=\"row\">" + timeElement(event.time) + "</th>";
-    appendCellOf(escaped(event.kind), out);
-    out += "<td>" + escaped(event.text) + (event.seconds ? " (" + durationText(*event.seconds) + ")" : "");
+    out += "<td class=\"k\">" + escaped(event.kind) + "</td><td>" + escaped(event.text)
+        + (event.seconds ? " (" + durationText(*event.seconds) + ")" : "");
     if (!event.cause.empty()) {
         out += "<br><small><b>" + escaped(event.cause) + "</b>"
             + (event.causeText.empty() ? "" : ": " + escaped(event.causeText)) + "</small>";
@@ -160,14 +171,28 @@ void appendEventTable(
     }
 }
 
+/// "ping-pong 9, hole 6".
+std::string countsText(const std::vector<ReportedEvent>& events)
+{
+    std::map<std::string, std::size_t> counts;
+    for (const ReportedEvent& event : events)
+        ++counts[event.kind];
+    std::string out;
+    for (const auto& [kind, count] : counts)
+        out += (out.empty() ? "" : ", ") + escaped(kind) + " " + std::to_string(count);
+    return out;
+}
+
 } // namespace
 
 void appendFindings(const ReportedRecording& recording, std::string& out)
 {
     if (recording.findings.empty())
         out += "<p>Nothing remarkable in " + escaped(recording.title) + ".</p>\n";
-    else
+    else {
+        out += "<p>" + countsText(recording.findings) + "</p>\n";
         appendEventTable(recording.title, recording.findings, recording.moreFindings, out);
+    }
 }
 
 void appendOverview(const std::vector<ReportedRecording>& recordings, std::string& out)
@@ -179,7 +204,7 @@ void appendOverview(const std::vector<ReportedRecording>& recordings, std::strin
     out += "</tr></thead>\n<tbody>\n";
     const auto row = [&recordings, &out](
                          std::string_view title, auto textOf) { appendRow(title, recordings, textOf, out); };
-    row("files", [](const ReportedRecording& it) { return joined(it.files, ", "); });
+    row("files", [](const ReportedRecording& it) { return filesText(it.files); });
     row("basebands", [](const ReportedRecording& it) { return joined(it.technologies, ", "); });
     row("from", [](const ReportedRecording& it) { return it.messages ? dateText(it.first) + " UTC" : ""; });
     row("to", [](const ReportedRecording& it) { return it.messages ? dateText(it.last) + " UTC" : ""; });

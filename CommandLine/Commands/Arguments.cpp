@@ -43,7 +43,7 @@ constexpr OptionForm<std::string> NoteForm {"TEXT", parseNote, "is no note of 1 
 static_assert(LongestNote == 4096);
 
 constexpr OptionForm<std::vector<TableColumn>> ColumnsForm {
-    "PATH[=NAME],...", parseTableColumns, "is no list of columns PATH[=NAME],..."};
+    "PATH[=NAME],...|cells", parseTableColumns, "is no list of columns PATH[=NAME],..."};
 
 constexpr OptionForm<TimeForm> TimeFormForm {"seconds|rfc3339", timeFormNamed, "is not one of seconds, rfc3339"};
 
@@ -58,7 +58,7 @@ void addOutput(CLI::App& command, OutputOptions& output)
         ->take_all()
         ->check([](const std::string& glob) { return glob.empty() ? "'' is no path" : ""; });
     addFormedOption(command, "--columns", output.columns, ColumnsForm,
-        "With --format table: the leaves that make its columns, and what stands above them");
+        "With --format table: the leaves that make its columns, and what stands above them; cells: the serving cell");
     addFormedOption(command, "--time", output.time, TimeFormForm,
         "How times are printed: seconds since 1970 (default), or as 2024-03-05T14:07:31.123456Z");
     command.add_flag("--sources", output.withSources, "With --format cells: where in the tree each value comes from");
@@ -283,8 +283,7 @@ void addReport(CLI::App& program, Arguments& arguments)
     command
         .add_option("FILE", report.files,
             "The recordings. Files that `record` has numbered (drive.pcap, drive-2.pcap) are one recording; others "
-            "stand "
-            "side by side. - is standard input")
+            "stand side by side. - is standard input")
         ->required()
         ->type_name("");
     addFormedOption(command, "-o,--output", report.output, FileForm,

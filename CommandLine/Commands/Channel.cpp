@@ -1,9 +1,9 @@
 #include "CommandLine/Commands/Channel.h"
 
 #include "Analysis/Bands/Bands.h"
-#include "Values/JsonText.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/ExitStatus.h"
+#include "Values/JsonText.h"
 #include "Values/Table.h"
 
 #include <array>

@@ -3,11 +3,13 @@
 #include "CommandLine/Commands/EventOutput.h"
 #include "CommandLine/Commands/SeparateDecoding.h"
 #include "CommandLine/Output/CellOutput.h"
+#include "CommandLine/Output/TableOutput.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/ProviderNames.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/MessageText.h"
 #include "Monitor/Viewing/OfflineSession.h"
+#include "Records/Beside/Marks.h"
 
 #include <cstdio>
 #include <exception>
@@ -28,8 +30,10 @@ public:
     {
         if (options.output.format == OutputFormat::Events || options.events.hasAlarms())
             _events.emplace(_session.displayState(), options.events, options.output, _output, &_operators);
-        if (options.output.format == OutputFormat::Table)
-            _session.setTickHandler([this](Moment tick) { _output.printRow(tick, _session.display()); });
+        if (options.output.format == OutputFormat::Table) {
+            _table.emplace(_session.displayState(), _output, options.output, &_operators);
+            _session.setTickHandler([this](Moment tick) { _table->refresh(tick); });
+        }
         if (printsCells(options.output.format)) {
             _cells.emplace(_session.displayState(), _output, options.output, &_operators);
             _session.setTickHandler([this](Moment tick) { _cells->refresh(tick); });
@@ -60,7 +64,8 @@ private:
     /// What ticks print, once more after the last message.
     void printLast()
     {
-        _output.printRow(_session.lastTime(), _session.display());
+        if (_table)
+            _table->refresh(_session.lastTime());
         if (_cells)
             _cells->refresh(_session.lastTime());
     }
@@ -89,6 +94,8 @@ private:
             return true;
         }
         _session.useTechnology(*technology);
+        if (!isStandardInput)
+            readBookmarks(path);
         RecordedMessage message;
         while (reader->next(message)) {
             if (!decodeMessage(file, message))
@@ -97,6 +104,17 @@ private:
         if (!reader->damage().empty())
             fail(file + ": " + reader->damage());
         return true;
+    }
+
+    void readBookmarks(const std::string& path)
+    {
+        if (_options.output.format != OutputFormat::Events)
+            return;
+        const Marks read = readMarks(path);
+        for (const Mark& mark : read.marks)
+            _events->addBookmark(mark.time, mark.note);
+        if (!read.damage.empty())
+            fail(read.damage);
     }
 
     bool decodeMessage(const std::string& file, const RecordedMessage& message)
@@ -135,6 +153,7 @@ private:
     OutputWriter _output;
     ProviderNames _operators;
     std::optional<CellOutput> _cells;
+    std::optional<TableOutput> _table;
     std::optional<EventOutput> _events; // where events are printed
     std::uint64_t _n = 0;
     int _status = 0;

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "Platform/Context.h"
+
 #include <optional>
 #include <string>
 
@@ -12,6 +14,6 @@ struct MarkOptions {
 };
 
 /// Writes a bookmark of this moment beside a recording. Answers the program's exit status.
-int mark(const MarkOptions& options);
+int mark(const MarkOptions& options, const Context& context);
 
 } // namespace spectrel

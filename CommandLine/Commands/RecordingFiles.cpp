@@ -180,7 +180,7 @@ Outcome RecordingFiles::createNext(Technology technology)
         const bool mayOverwrite = isTarget && (_path == "-" || _options.overwrite || isOther(_path));
         auto created = (mayOverwrite ? createRecording : createNewRecording)(_path, technology);
         if (created) {
-            if (_path != "-")
+            if (_path != "-" && !isOther(_path))
                 removeBeside(_path); // of an earlier recording of this name
             _writer = *std::move(created);
             return Done();

@@ -6,9 +6,12 @@
 #include "CommandLine/Output/ReportFile.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/ExitStatus.h"
+#include "CommandLine/Program/ProviderNames.h"
 #include "LogGenerator/LogGenerator.h"
 #include "Monitor/MessageText.h"
 #include "Monitor/Viewing/OfflineSession.h"
+#include "Records/Beside/Gaps.h"
+#include "Records/Beside/Marks.h"
 
 #include <algorithm>
 #include <array>
@@ -27,11 +30,12 @@ constexpr std::size_t MaxRemarks = 10; // of a recording
 /// Plays one recording, which may be several files, and gathers what the report shows of it.
 class RecordingAnalysis {
 public:
-    RecordingAnalysis(const ReportOptions& options, ReportedRecording& recording)
+    RecordingAnalysis(
+        const ReportOptions& options, ReportedRecording& recording, OperatorNames& operators, const Context& context)
         : _options(options)
         , _recording(recording)
-        , _session(&LogGenerator::generatorFromTechnology, false)
-        , _collector(_session.displayState(), recording, options.thresholds, nullptr)
+        , _session(&LogGenerator::generatorFromTechnology, false, context)
+        , _collector(_session.displayState(), recording, options.thresholds, &operators)
     {
     }
 
@@ -45,6 +49,7 @@ public:
         }
         noteTechnology(*technology);
         _session.useTechnology(*technology);
+        readBeside(input.path);
         if (!input.isEmpty)
             playMessages(input);
         if (!input.reader->damage().empty())
@@ -65,6 +70,23 @@ private:
         auto& names = _recording.technologies;
         if (std::find(names.begin(), names.end(), name) == names.end())
             names.push_back(name);
+    }
+
+    /// The bookmarks of a recording and its gaps.
+    void readBeside(const std::string& path)
+    {
+        if (path == "-")
+            return;
+        const Marks marks = readMarks(path);
+        for (const Mark& mark : marks.marks)
+            _collector.addBookmark(mark.time, mark.note);
+        const Gaps gaps = readGaps(path);
+        for (const Gap& gap : gaps.gaps)
+            _recording.lostMessages += gap.lost;
+        for (const std::string& damage : {marks.damage, gaps.damage}) {
+            if (!damage.empty())
+                complain(damage);
+        }
     }
 
     void playMessages(RecordingInput& input)
@@ -146,17 +168,18 @@ std::string recordingOfFile(std::string_view path)
     return (file.parent_path() / stem).string();
 }
 
-int writeReport(const ReportOptions& options)
+int writeReport(const ReportOptions& options, const Context& context)
 {
     RecordingInputs opened = openRecordings(options.files);
     for (const std::string& failure : opened.failures)
         report(failure);
     bool isWhole = opened.failures.empty();
+    ProviderNames operators;
     std::vector<ReportedRecording> recordings;
     for (std::vector<RecordingInput>& files : recordingsOf(std::move(opened.inputs))) {
         ReportedRecording& recording = recordings.emplace_back();
         recording.title = titleOf(files);
-        RecordingAnalysis analysis(options, recording);
+        RecordingAnalysis analysis(options, recording, operators, context);
         for (RecordingInput& file : files)
             analysis.play(file);
         isWhole = analysis.finish() && isWhole;

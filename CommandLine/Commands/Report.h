@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Analysis/Events/Thresholds.h"
+#include "Platform/Context.h"
 #include "Records/Recording.h"
 
 #include <optional>
@@ -23,6 +24,6 @@ struct ReportOptions {
 std::string recordingOfFile(std::string_view path);
 
 /// Writes the recordings as one HTML page. Answers the program's exit status.
-int writeReport(const ReportOptions& options);
+int writeReport(const ReportOptions& options, const Context& context);
 
 } // namespace spectrel

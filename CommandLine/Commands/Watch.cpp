@@ -1,6 +1,7 @@
 #include "CommandLine/Commands/Watch.h"
 
 #include "CommandLine/Output/CellOutput.h"
+#include "CommandLine/Output/TableOutput.h"
 #include "CommandLine/Program/CrashReport.h"
 #include "CommandLine/Program/ErrorLine.h"
 #include "CommandLine/Program/LiveServices.h"
@@ -27,6 +28,8 @@ public:
     {
         if (options.output.format == OutputFormat::Events || options.events.hasAlarms())
             _events.emplace(_model.displayState(), options.events, options.output, _output, &_operators);
+        if (options.output.format == OutputFormat::Table)
+            _table.emplace(_model.displayState(), _output, options.output, &_operators);
         if (printsCells(options.output.format))
             _cells.emplace(_model.displayState(), _output, options.output, &_operators);
     }
@@ -57,7 +60,8 @@ public:
             _output.printLine("");
         if (_journal)
             _output.printChanges(_refreshes, _live.clock().now(), display, *_journal);
-        _output.printRow(_live.clock().now(), display);
+        if (_table)
+            _table->refresh(_live.clock().now());
         if (_cells)
             _cells->refresh(_live.clock().now());
         if (_events)
@@ -107,6 +111,7 @@ private:
     Journal* const _journal; // where changes are printed
     ProviderNames _operators;
     std::optional<CellOutput> _cells;
+    std::optional<TableOutput> _table;
     std::optional<EventOutput> _events; // where events are printed or alarms raised
     std::uint64_t _refreshes = 0;
     int _status = 0;

@@ -1,5 +1,6 @@
 #include "CommandLine/Output/OutputWriter.h"
 
+#include "CommandLine/Output/CsvField.h"
 #include "CommandLine/Output/DisplayPrinter.h"
 #include "Values/JsonText.h"
 #include "Values/Moment.h"
@@ -12,32 +13,6 @@ namespace spectrel {
 namespace {
 
 constexpr std::size_t WriteSize = 64 * 1024;
-
-/// Whether the field holds nothing that must be quoted. Looks at all of it, so that the machine looks at many at once.
-bool isPlainCsv(std::string_view field)
-{
-    unsigned special = 0;
-    for (const char character : field)
-        special |= unsigned(character == ',') | unsigned(character == '"') | unsigned(character == '\r')
-            | unsigned(character == '\n');
-    return special == 0;
-}
-
-/// A field of RFC 4180: quoted where it holds a separator, a quote or a line end.
-void appendCsvField(std::string_view field, std::string& out)
-{
-    if (isPlainCsv(field)) {
-        out += field;
-        return;
-    }
-    out += '"';
-    for (const char character : field) {
-        if (character == '"')
-            out += '"';
-        out += character;
-    }
-    out += '"';
-}
 
 bool isCsv(OutputFormat format)
 {
@@ -89,20 +64,8 @@ OutputWriter::OutputWriter(std::FILE* stream, const OutputOptions& options)
     , _lineStart(lineStart(options))
     , _changes(_paths)
 {
-    if (isCsv(_format) && options.hasHeader)
-        printHeader();
-}
-
-void OutputWriter::printHeader()
-{
-    if (!_options.file.empty())
-        _gathered += "file,";
-    _gathered += _format == OutputFormat::Csv ? "n,time,path,value" : "time";
-    for (const TableColumn& column : _options.columns) {
-        _gathered += ',';
-        appendCsvField(column.name, _gathered);
-    }
-    _gathered += "\r\n";
+    if (_format == OutputFormat::Csv && options.hasHeader)
+        _gathered += _options.file.empty() ? "n,time,path,value\r\n" : "file,n,time,path,value\r\n";
 }
 
 void OutputWriter::printDisplay(const Value& display)
@@ -155,19 +118,6 @@ void OutputWriter::printChanges(std::uint64_t n, Moment time, const Value& displ
             _gathered += "null";
         _gathered += "}\n";
     });
-    flushWhenLarge();
-}
-
-void OutputWriter::printRow(Moment time, const Value& display)
-{
-    if (_format != OutputFormat::Table)
-        return;
-    _gathered += _lineStart + timeText(time, _options.time);
-    for (const TableColumn& column : _options.columns) {
-        _gathered += ',';
-        appendCsvField(leafAtPath(display, column.path).value_or(""), _gathered);
-    }
-    _gathered += "\r\n";
     flushWhenLarge();
 }
 

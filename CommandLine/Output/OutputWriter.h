@@ -48,7 +48,7 @@ struct OutputOptions {
 /// Prints displays in one format to a stream, in large writes.
 class OutputWriter {
 public:
-    /// Csv and Table begin with their header at once. The options outlive this.
+    /// Csv begins with its header at once. The options outlive this.
     OutputWriter(std::FILE* stream, const OutputOptions& options);
 
     /// The whole display: a tree, or JSON on one line. Nothing for the other formats.
@@ -57,14 +57,11 @@ public:
     void printNumberedJson(std::uint64_t n, const Value& display);
     /// What has changed since the last call, in Changes or Csv form; the journal follows the display.
     void printChanges(std::uint64_t n, Moment time, const Value& display, Journal& journal);
-    /// One row of a Table; nothing for the other formats.
-    void printRow(Moment time, const Value& display);
     void printLine(std::string_view line);
     /// Writes out what has gathered. False once the stream has failed (a full disk, a closed pipe).
     bool flush();
 
 private:
-    void printHeader();
     void flushWhenLarge();
 
     std::FILE* _stream;

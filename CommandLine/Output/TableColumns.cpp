@@ -13,6 +13,8 @@ namespace spectrel {
 
 namespace {
 
+constexpr std::string_view ServingCell = "cells";
+
 void removeSlashes(std::string_view& text)
 {
     text.remove_prefix(std::min(text.find_first_not_of('/'), text.size()));
@@ -60,6 +62,10 @@ std::optional<std::vector<TableColumn>> parseTableColumns(std::string_view text)
         TableColumn& column = columns.back();
         if (column.path.empty())
             return false;
+        if (column.path == ServingCell && !isName) {
+            column.isServingCell = true;
+            return true;
+        }
         if (!column.path.starts_with('/'))
             column.path.insert(0, "/");
         if (!std::exchange(isName, false))

@@ -46,11 +46,7 @@ std::string timeText(Moment time, TimeForm form)
 {
     if (form == TimeForm::RFC3339)
         return rfc3339(time);
-    const auto [seconds, microseconds] = split(time);
-    char text[40];
-    std::snprintf(
-        text, sizeof text, "%lld.%06lld", static_cast<long long>(seconds.time_since_epoch().count()), microseconds);
-    return text;
+    return secondsForm(time);
 }
 
 std::string jsonTimeText(Moment time, TimeForm form)

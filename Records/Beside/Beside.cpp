@@ -90,12 +90,15 @@ Outcome appendBeside(const std::string& path, std::string_view line)
     const int file = ::open(path.c_str(), O_RDWR | O_APPEND | O_CREAT | O_NOFOLLOW | O_CLOEXEC, 0600);
     if (file < 0)
         return Failure::ofSystem().of(path);
+    struct stat status { };
+    if (::fstat(file, &status) != 0 || !S_ISREG(status.st_mode) || status.st_uid != ::geteuid()) {
+        ::close(file);
+        return Failure {path + ": is not a file of this user", Failure::Code::Refused};
+    }
     std::string text(line);
     text += '\n';
-    struct stat status { };
     char last = '\n';
-    if (::fstat(file, &status) == 0 && status.st_size > 0 && ::pread(file, &last, 1, status.st_size - 1) == 1
-        && last != '\n')
+    if (status.st_size > 0 && ::pread(file, &last, 1, status.st_size - 1) == 1 && last != '\n')
         text.insert(0, "\n");
     const ::ssize_t written = ::write(file, text.data(), text.size());
     const int error = written < 0 ? errno : ENOSPC;

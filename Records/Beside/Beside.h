@@ -27,7 +27,8 @@ void removeBeside(const std::string& recording);
 std::string readBeside(const std::string& path, const std::function<bool(const JsonObject&)>& read);
 
 /// Appends one line by a single write, so that several programs may do so at once; makes the file (mode 0600) at need.
-/// Where somebody was cut off in the midst of a line, that one is ended first. Does not follow a link.
+/// Where somebody was cut off in the midst of a line, that one is ended first. Does not follow a link, and writes to
+/// nothing but a file of this user.
 Outcome appendBeside(const std::string& path, std::string_view line);
 
 /// The member "time": seconds since 1970. None where there is none, or none between 1970 and the year 9999.

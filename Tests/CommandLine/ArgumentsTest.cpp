@@ -202,7 +202,7 @@ TEST(ReadArgumentsTest, StandardOutputTakesNoOptionOfSeveralFiles)
 
 TEST(ReadArgumentsTest, EveryCommandTellsHelpAndVersion)
 {
-    for (const char* command : {"watch", "decode", "view", "record", "channel", "mark"}) {
+    for (const char* command : {"watch", "decode", "view", "record", "channel", "mark", "report"}) {
         for (const char* option : {"--help", "--version"}) {
             Arguments arguments;
             testing::internal::CaptureStdout();
@@ -216,8 +216,8 @@ TEST(ReadArgumentsTest, WrongUsageIsStatus2)
 {
     for (const std::vector<const char*>& words : std::vector<std::vector<const char*>> {{"--gui", "--terminal"},
              {"play"}, {"watch", "--count", "0"}, {"watch", "--duration", "soon"}, {"record"}, {"decode"}, {"view"},
-             {"view", "a", "b"}, {"channel"}, {"channel", "lte"}, {"channel", "lte", "-1"},
-             {"view", "--gui", "--terminal", "a"}, {"view", "--technology", "5g", "a"}}) {
+             {"view", "a", "b"}, {"report", "a"}, {"report", "-o", "a"}, {"channel"}, {"channel", "lte"},
+             {"channel", "lte", "-1"}, {"view", "--gui", "--terminal", "a"}, {"view", "--technology", "5g", "a"}}) {
         Arguments arguments;
         EXPECT_EQ(read(words, arguments), ExitStatus::WrongUsage) << words.front();
     }

@@ -27,6 +27,17 @@ TEST(ParseTableColumnsTest, ColumnHasANameOfItsOwnOrItsPath)
     EXPECT_EQ(columns("/A="), "[/A|]");
 }
 
+TEST(ParseTableColumnsTest, CellsAreTheColumnsOfTheServingCell)
+{
+    const auto parsed = parseTableColumns("cells,/A,cells=c,/cells");
+    ASSERT_TRUE(parsed);
+    ASSERT_EQ(parsed->size(), 4u);
+    EXPECT_TRUE((*parsed)[0].isServingCell);
+    EXPECT_FALSE((*parsed)[1].isServingCell);
+    EXPECT_FALSE((*parsed)[2].isServingCell);
+    EXPECT_FALSE((*parsed)[3].isServingCell);
+}
+
 TEST(ParseTableColumnsTest, BackslashMakesTextOfASign)
 {
     EXPECT_EQ(columns(R"(/A\,B\=C=x\,y)"), "[/A,B=C|x,y]");

@@ -97,6 +97,15 @@ class Mark(Place):
         self.assert_refused(self.mark("here", "--recording", self.path("a.pcap")),
                             f"{self.path('a.marks')}: Is a directory")
 
+    def test_bookmarks_are_events_of_their_recording(self):
+        file = self.write("a.pcap", capture([serving_cell(5), serving_cell(5), serving_cell(5)]))
+        self.write("a.marks", b'{"time": 1700000001.5, "note": "tunnel"}\nnonsense\n')
+        done = self.run_spectrel("decode", "--format", "events", file)
+        self.assertEqual(done.returncode, 1)
+        self.assertIn(f"spectrel: {self.path('a.marks')}: line 2 is not understood\n", done.stderr)
+        bookmarks = [event for event in map(json.loads, done.stdout.splitlines()) if event["event"] == "bookmark"]
+        self.assertEqual([(event["time"], event["note"]) for event in bookmarks], [(1700000001.5, "tunnel")])
+
     def test_new_recording_has_no_bookmarks_of_an_earlier_one(self):
         self.start_service("--simulate", "lte")
         self.write("drive.marks", b'{"time": 1, "note": "long ago"}\n')

@@ -73,6 +73,26 @@ class Table(Place):
         self.assertEqual(self.decode(file, f"{PCI}=PCI,/No/Such=none,/SIM Info/EF-ICCID"), [
             ["time", "PCI", "none", "/SIM Info/EF-ICCID"], ["1700000000.000000", "5", "", "-"]])
 
+    def test_cells_are_the_keys_and_levels_of_the_serving_cell(self):
+        for name in ("lte-five-minutes", "gsm-drive", "cdma-drive", "ifx-drive", "utran-five-minutes"):
+            file = os.path.join(GOLDEN, name + ".pcap")
+            rows = self.decode(file, "cells")
+            reports = [json.loads(line) for line in
+                       self.run_spectrel("decode", "--format", "cells", file).stdout.splitlines()]
+            self.assertEqual(rows[0][:4], ["time", "technology", "plmn", "operator"])
+            self.assertEqual(rows[0][-10:], ["RSRP", "RSRQ", "RSSI", "RSCP", "EcNo", "EcIo", "Srxlev", "C1", "C2", "age"])
+            self.assertEqual(len(rows) - 1, len(reports))
+            for row, report in zip(rows[1:], reports):
+                self.assertEqual(len(row), len(rows[0]))
+                shown = {key: value for key, value in zip(rows[0], row) if value}
+                serving = report.get("serving", {})
+                expected = {"time": report["time"], **serving, **serving.get("levels", {})}
+                expected.pop("levels", None)
+                self.assertEqual(list(shown), [key for key in rows[0] if key in expected])
+                for key, value in shown.items():
+                    same = float(value) if isinstance(expected[key], (int, float)) else value
+                    self.assertEqual(same, expected[key])
+
     def test_recording_without_a_message_has_no_row(self):
         self.assertEqual(self.decode(self.write("a.pcap", capture([])), "/A"), [["time", "/A"]])
 

@@ -40,7 +40,7 @@ TEST_F(PropertyListReadersTest, RecordsOfOtherCodesInBetweenChangeNothingOfThat)
     const RecordBuilder record = contexts("a");
     const DictionaryRef node = (*ContextArrayReader(RecordView(record), payloads).contexts())[0].dictionary();
     const RecordBuilder cells = RecordBuilder::withPropertyList(CellInfoArrayReader::Code, Value(List::make()));
-    EXPECT_TRUE(CellInfoArrayReader(RecordView(cells), payloads).holdsAnything());
+    EXPECT_TRUE(CellInfoArrayReader(RecordView(cells), payloads, log).holdsAnything());
     EXPECT_EQ((*ContextArrayReader(RecordView(record), payloads).contexts())[0].dictionary(), node);
 }
 

@@ -141,6 +141,11 @@ TEST_F(BesideTest, FileThatCannotBeWrittenIsNamed)
     ASSERT_FALSE(linked);
     EXPECT_TRUE(linked.failure().text.starts_with(file + ": ")) << linked.failure().text;
     EXPECT_FALSE(std::filesystem::exists(folder.file("elsewhere")));
+    std::filesystem::remove(file);
+    ASSERT_EQ(::mkfifo(file.c_str(), 0600), 0);
+    const Outcome piped = append("tunnel");
+    ASSERT_FALSE(piped);
+    EXPECT_EQ(piped.failure().text, file + ": is not a file of this user");
 }
 
 TEST_F(BesideTest, GapsAreReadLikewise)
