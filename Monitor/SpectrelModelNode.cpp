@@ -72,16 +72,21 @@ NodeRef nodeInIndex(const PathIndex& index, std::string_view path)
 
 std::string pathByAppending(std::string_view path, std::string_view component)
 {
-    component.remove_prefix(std::min(component.find_first_not_of('/'), component.size()));
     std::string joined;
     joined.reserve(path.size() + 1 + component.size());
     joined = path;
-    if (component.empty())
-        return joined;
-    if (!joined.ends_with('/'))
-        joined += '/';
-    joined += component;
+    appendPathComponent(joined, component);
     return joined;
+}
+
+void appendPathComponent(std::string& path, std::string_view component)
+{
+    component.remove_prefix(std::min(component.find_first_not_of('/'), component.size()));
+    if (component.empty())
+        return;
+    if (!path.ends_with('/'))
+        path += '/';
+    path += component;
 }
 
 NodeRef SpectrelModelNode::makeTreeFromObject(const Value& display, PathIndex& pathDictionary)

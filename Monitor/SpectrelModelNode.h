@@ -22,6 +22,8 @@ NodeRef nodeInIndex(const PathIndex& index, std::string_view path);
 
 /// A path with one more component, joined by exactly one "/".
 std::string pathByAppending(std::string_view path, std::string_view component);
+/// The same to the path itself.
+void appendPathComponent(std::string& path, std::string_view component);
 
 /// What a leaf that is no text shows.
 inline constexpr std::string_view UnknownText = "(unknown)";

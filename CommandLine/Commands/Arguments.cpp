@@ -209,6 +209,10 @@ void addDecode(CLI::App& program, Arguments& arguments)
     addFormedOption(command, "--snapshot", decode.snapshotDirectory, FolderForm,
         "Write a snapshot file into this folder at the end");
     command.add_flag("--keep-going", decode.keepGoing, "Go on after a message that would end the program");
+    command.add_flag("--separate", decode.separate,
+        "Each file a session of its own, several at a time; lines begin with their file");
+    addFormedOption(command, "--jobs", decode.jobs, CountForm,
+        "With --separate: so many files at a time (default: as many as processors)");
 }
 
 void addView(CLI::App& program, Arguments& arguments)
@@ -302,6 +306,10 @@ void checkTogether(const Arguments& arguments)
     checkOutput(arguments.watch.output);
     if (arguments.decode.each && arguments.decode.output.format != OutputFormat::Json)
         throw CLI::ValidationError("--each", "goes with --format json only");
+    if (arguments.decode.jobs && !arguments.decode.separate)
+        throw CLI::ValidationError("--jobs", "goes with --separate only");
+    if (arguments.decode.separate && arguments.logFile)
+        throw CLI::ValidationError("--log", "takes the lines of one session, not those of --separate");
     const RecordingFilesOptions& files = arguments.record.files;
     if (files.target == "-" && (files.largestFile || files.longestFile || files.keep))
         throw CLI::ValidationError(files.largestFile ? "--rollover"

@@ -1,6 +1,7 @@
 #include "CommandLine/Commands/Decode.h"
 
 #include "CommandLine/Commands/EventOutput.h"
+#include "CommandLine/Commands/SeparateDecoding.h"
 #include "CommandLine/Output/CellOutput.h"
 #include "CommandLine/Output/TableOutput.h"
 #include "CommandLine/Program/ErrorLine.h"
@@ -160,6 +161,8 @@ private:
 
 int decode(const DecodeOptions& options, const Context& context)
 {
+    if (options.separate)
+        return decodeSeparately(options, context);
     return Decoding(options, context).run();
 }
 

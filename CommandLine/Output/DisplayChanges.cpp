@@ -8,6 +8,8 @@
 #include <charconv>
 #include <cstddef>
 #include <functional>
+#include <iterator>
+#include <optional>
 #include <string_view>
 #include <unordered_map>
 #include <utility>
@@ -31,26 +33,24 @@ template <typename Visit> void forEachShownChild(const Value& container, Visit v
 
 } // namespace
 
-/// The shadows of a container's children as they stood, taken out by name, namesakes in their order.
-///
-/// While the names come in the same order, the next one is at hand; from the first that does not they are looked up.
+/// The shadows of children that do not stand where they stood, taken out by name, namesakes in their order.
 class DisplayChanges::FormerChildren {
 public:
     FormerChildren(ShadowList children, std::uint64_t& comparisons)
         : _children(std::move(children))
-        , _isSame {&comparisons}
-        , _firstOf(0, {}, _isSame)
+        , _firstOf(0, {}, {&comparisons})
+        , _namesakeBehind(_children.size(), None)
     {
+        for (std::size_t position = _children.size(); position-- > 0;) {
+            const auto [first, isNew] = _firstOf.try_emplace(_children[position]->name, position);
+            if (!isNew)
+                _namesakeBehind[position] = std::exchange(first->second, position);
+        }
     }
 
     /// Null when there is none of the name left.
     ShadowRef take(std::string_view name)
     {
-        if (!_isIndexed) {
-            if (_next < _children.size() && _isSame(_children[_next]->name, name))
-                return std::move(_children[_next++]);
-            makeIndex();
-        }
         const auto found = _firstOf.find(name);
         if (found == _firstOf.end() || found->second == None)
             return nullptr;
@@ -60,9 +60,9 @@ public:
     /// Appends what is left, in its order.
     void appendRest(ShadowList& to)
     {
-        for (; _next < _children.size(); ++_next) {
-            if (_children[_next])
-                to.push_back(std::move(_children[_next]));
+        for (ShadowRef& child : _children) {
+            if (child)
+                to.push_back(std::move(child));
         }
     }
 
@@ -78,24 +78,31 @@ private:
         }
     };
 
-    void makeIndex()
-    {
-        _isIndexed = true;
-        _namesakeBehind.resize(_children.size(), None);
-        for (std::size_t position = _children.size(); position-- > _next;) {
-            const auto [first, isNew] = _firstOf.try_emplace(_children[position]->name, position);
-            if (!isNew)
-                _namesakeBehind[position] = std::exchange(first->second, position);
-        }
-    }
-
     ShadowList _children;
-    CountedEquality _isSame;
-    std::size_t _next = 0; // those before were taken
-    bool _isIndexed = false;
     std::unordered_map<std::string_view, std::size_t, std::hash<std::string_view>, CountedEquality>
         _firstOf; // the names belong to the shadows, wherever they are
     std::vector<std::size_t> _namesakeBehind;
+};
+
+/// Makes the path that of a child, and the container's again when it goes.
+class DisplayChanges::Step {
+public:
+    Step(std::string& path, std::string_view name)
+        : _path(path)
+        , _length(path.size())
+    {
+        appendPathComponent(path, name);
+    }
+    Step(const Step&) = delete;
+    Step& operator=(const Step&) = delete;
+    ~Step()
+    {
+        _path.resize(_length);
+    }
+
+private:
+    std::string& _path;
+    std::size_t _length;
 };
 
 void DisplayChanges::update(const Value& display, Journal& journal, const Report& report)
@@ -160,43 +167,56 @@ void DisplayChanges::updateContainer(Shadow& shadow, bool isNew, const Value& va
 /// The children are those that were there, but some of them have changed inside.
 void DisplayChanges::updateBelow(Shadow& shadow, const Value& value, const Report& report)
 {
-    const std::string parentPath = _path;
     std::size_t position = 0;
     forEachShownChild(value, [&](std::string_view name, const Value& child) {
         Shadow& childShadow = *shadow.children[position++];
         ++_comparisons;
         if (Journal::stampOf(child).changedWithin < _period)
             return;
-        _path = pathByAppending(parentPath, name);
+        const Step step(_path, name);
         updateNode(childShadow, false, child, report);
     });
-    _path = parentPath;
 }
 
 void DisplayChanges::updateChildren(Shadow& shadow, const Value& value, const Report& report)
 {
-    const std::string parentPath = _path;
-    FormerChildren former(std::exchange(shadow.children, {}), _comparisons);
+    ShadowList& children = shadow.children;
+    std::size_t count = 0; // of the children that are there
+    std::optional<FormerChildren> former; // from the first one on that does not stand where it stood
     forEachShownChild(value, [&](std::string_view name, const Value& child) {
-        ShadowRef childShadow = former.take(name);
+        const Step step(_path, name);
+        if (!former && count < children.size()) {
+            ++_comparisons;
+            if (children[count]->name == name)
+                return updateNode(*children[count++], false, child, report);
+            former.emplace(takeFrom(children, count), _comparisons);
+        }
+        ShadowRef childShadow = former ? former->take(name) : nullptr;
         const bool isNew = !childShadow;
         if (isNew)
             childShadow = std::make_unique<Shadow>(shadowBelow(shadow, name));
-        _path = pathByAppending(parentPath, name);
         updateNode(*childShadow, isNew, child, report);
-        shadow.children.push_back(std::move(childShadow));
+        children.push_back(std::move(childShadow));
+        ++count;
     });
-    _path = parentPath;
-    const std::size_t count = shadow.children.size();
-    former.appendRest(shadow.children);
+    if (former)
+        former->appendRest(children);
     if (value.dictionary() && value.dictionary()->contains(SortedMarker))
         settleNamesakes(shadow, count, report);
-    for (std::size_t gone = count; gone < shadow.children.size(); ++gone) {
-        _path = pathByAppending(parentPath, shadow.children[gone]->name);
-        reportGone(*shadow.children[gone], report);
+    for (std::size_t gone = count; gone < children.size(); ++gone) {
+        const Step step(_path, children[gone]->name);
+        reportGone(*children[gone], report);
     }
-    shadow.children.resize(count);
-    _path = parentPath;
+    children.resize(count);
+}
+
+/// Takes the shadows from the position on out of the list.
+DisplayChanges::ShadowList DisplayChanges::takeFrom(ShadowList& children, std::size_t position)
+{
+    const auto first = children.begin() + static_cast<std::ptrdiff_t>(position);
+    ShadowList taken(std::make_move_iterator(first), std::make_move_iterator(children.end()));
+    children.resize(position);
+    return taken;
 }
 
 /// Children under different keys may share a name, and so a path, where the last of them stands. That one is reported
@@ -229,12 +249,10 @@ void DisplayChanges::reportGone(const Shadow& shadow, const Report& report)
 {
     if (shadow.isLeaf)
         return report(_path, nullptr);
-    const std::string parentPath = _path;
     for (const ShadowRef& child : shadow.children) {
-        _path = pathByAppending(parentPath, child->name);
+        const Step step(_path, child->name);
         reportGone(*child, report);
     }
-    _path = parentPath;
 }
 
 } // namespace spectrel

@@ -56,12 +56,14 @@ private:
         PathChoice::Position position; // of its path in those that were asked for
     };
     class FormerChildren;
+    class Step;
 
     Shadow shadowBelow(const Shadow& parent, std::string_view name) const;
     void updateNode(Shadow& shadow, bool isNew, const Value& value, const Report& report);
     void updateContainer(Shadow& shadow, bool isNew, const Value& value, const Report& report);
     void updateBelow(Shadow& shadow, const Value& value, const Report& report);
     void updateChildren(Shadow& shadow, const Value& value, const Report& report);
+    static ShadowList takeFrom(ShadowList& children, std::size_t position);
     void settleNamesakes(Shadow& parent, std::size_t count, const Report& report);
     void reportGone(const Shadow& shadow, const Report& report);
 

@@ -14,6 +14,25 @@ namespace {
 
 constexpr std::size_t WriteSize = 64 * 1024;
 
+bool isCsv(OutputFormat format)
+{
+    return format == OutputFormat::Csv || format == OutputFormat::Table;
+}
+
+std::string lineStart(const OutputOptions& options)
+{
+    std::string start = isCsv(options.format) ? "" : "{";
+    if (options.file.empty())
+        return start;
+    if (isCsv(options.format)) {
+        appendCsvField(options.file, start);
+        return start + ',';
+    }
+    start += "\"file\": ";
+    appendJsonText(options.file, start);
+    return start + ", ";
+}
+
 } // namespace
 
 std::optional<OutputFormat> outputFormatNamed(std::string_view name)
@@ -42,26 +61,32 @@ OutputWriter::OutputWriter(std::FILE* stream, const OutputOptions& options)
     , _options(options)
     , _format(options.format)
     , _paths(options.paths)
+    , _lineStart(lineStart(options))
     , _changes(_paths)
 {
-    if (_format == OutputFormat::Csv)
-        _gathered += "n,time,path,value\r\n";
+    if (_format == OutputFormat::Csv && options.hasHeader)
+        _gathered += _options.file.empty() ? "n,time,path,value\r\n" : "file,n,time,path,value\r\n";
 }
 
 void OutputWriter::printDisplay(const Value& display)
 {
+    const bool isNamed = !_options.file.empty();
     if (_format == OutputFormat::Tree) {
+        if (isNamed)
+            _gathered += "==> " + _options.file + " <==\n";
         appendTree(display, _gathered, _paths);
     } else if (_format == OutputFormat::Json) {
+        if (isNamed)
+            _gathered += _lineStart + "\"display\": ";
         appendJson(display, _gathered, _paths);
-        _gathered += '\n';
+        _gathered += isNamed ? "}\n" : "\n";
     }
     flushWhenLarge();
 }
 
 void OutputWriter::printNumberedJson(std::uint64_t n, const Value& display)
 {
-    _gathered += "{\"n\": " + std::to_string(n) + ", \"display\": ";
+    _gathered += _lineStart + "\"n\": " + std::to_string(n) + ", \"display\": ";
     appendJson(display, _gathered, _paths);
     _gathered += "}\n";
     flushWhenLarge();
@@ -69,17 +94,22 @@ void OutputWriter::printNumberedJson(std::uint64_t n, const Value& display)
 
 void OutputWriter::printChanges(std::uint64_t n, Moment time, const Value& display, Journal& journal)
 {
+    std::string stamp; // what each line of the message begins with
     _changes.update(display, journal, [&](const std::string& path, const std::string* value) {
         if (_format == OutputFormat::Csv) {
-            _gathered += std::to_string(n) + "," + timeText(time, _options.time) + ",";
+            if (stamp.empty())
+                stamp = _lineStart + std::to_string(n) + "," + timeText(time, _options.time) + ",";
+            _gathered += stamp;
             appendCsvField(path, _gathered);
             _gathered += ',';
             appendCsvField(value ? std::string_view(*value) : std::string_view(), _gathered);
             _gathered += "\r\n";
             return;
         }
-        _gathered +=
-            "{\"n\": " + std::to_string(n) + ", \"time\": " + jsonTimeText(time, _options.time) + ", \"path\": ";
+        if (stamp.empty())
+            stamp = _lineStart + "\"n\": " + std::to_string(n) + ", \"time\": " + jsonTimeText(time, _options.time)
+                + ", \"path\": ";
+        _gathered += stamp;
         appendJsonText(path, _gathered);
         _gathered += ", \"value\": ";
         if (value)
@@ -93,6 +123,10 @@ void OutputWriter::printChanges(std::uint64_t n, Moment time, const Value& displ
 
 void OutputWriter::printLine(std::string_view line)
 {
+    if (!_options.file.empty() && line.starts_with('{')) {
+        _gathered += _lineStart;
+        line.remove_prefix(1);
+    }
     _gathered += line;
     _gathered += '\n';
     flushWhenLarge();

@@ -39,6 +39,8 @@ struct OutputOptions {
     OutputFormat format = OutputFormat::Tree;
     std::vector<std::string> paths; // globs of the leaves that Tree, Json, Changes and Csv are to show; empty: all
     std::vector<TableColumn> columns; // of Table
+    std::string file; // said first on every line, and above a tree; empty: nowhere
+    bool hasHeader = true; // of Csv and Table
     TimeForm time = TimeForm::Seconds;
     bool withSources = false; // with Cells: the paths that values come from
 };
@@ -66,6 +68,7 @@ private:
     const OutputOptions& _options;
     const OutputFormat _format;
     PathChoice _paths;
+    const std::string _lineStart; // of CSV; of JSON's objects, their brace included
     std::string _gathered;
     DisplayChanges _changes;
     bool _hasFailed = false;

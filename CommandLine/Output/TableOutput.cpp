@@ -97,7 +97,9 @@ TableOutput::TableOutput(
 {
     if (std::ranges::any_of(options.columns, &TableColumn::isServingCell))
         _analysis.emplace(display, operators);
-    _line = "time";
+    if (!_options.hasHeader)
+        return;
+    _line = _options.file.empty() ? "time" : "file,time";
     for (const TableColumn& column : options.columns) {
         if (column.isServingCell) {
             appendCellNames(_line);
@@ -111,7 +113,12 @@ TableOutput::TableOutput(
 
 void TableOutput::refresh(Moment time)
 {
-    _line = timeText(time, _options.time);
+    _line.clear();
+    if (!_options.file.empty()) {
+        appendCsvField(_options.file, _line);
+        _line += ',';
+    }
+    _line += timeText(time, _options.time);
     for (const TableColumn& column : _options.columns) {
         if (column.isServingCell) {
             appendCell(_analysis->serving(), time, _line);

@@ -273,5 +273,81 @@ class Snapshots(Decode):
         self.assertEqual(done.returncode, 1)
 
 
+class Separate(Decode):
+    """decode --separate: each file a session of its own."""
+
+    def setUp(self):
+        super().setUp()
+        self.files = [self.write(f"{number}.pcap", capture([(1733000000 + number, serving_cell(5 + number)), b"short"]))
+                      for number in range(5)]
+
+    def separate(self, *arguments):
+        return self.decode("--separate", *arguments)
+
+    def test_each_file_is_a_session_of_its_own_in_the_order_of_the_files(self):
+        for jobs in ("1", "2", "9"):
+            done = self.separate("--jobs", jobs, "--format", "json", *self.files)
+            self.assertEqual(done.returncode, 0, done.stderr)
+            lines = [json.loads(line) for line in done.stdout.splitlines()]
+            self.assertEqual([line["file"] for line in lines], self.files)
+            self.assertEqual([line["display"] for line in lines], [self.display(file) for file in self.files])
+
+    def test_lines_begin_with_the_file(self):
+        for arguments in (["--format", "changes"], ["--format", "json", "--each"]):
+            expected = ""
+            for file in self.files:
+                lines = self.decode(*arguments, file).stdout.splitlines()
+                expected += "".join('{"file": "%s", %s\n' % (file, line[1:]) for line in lines)
+            self.assertEqual(self.separate(*arguments, *self.files).stdout, expected)
+
+    def test_csv_has_one_header_and_the_file_in_front(self):
+        rows = list(csv.reader(io.StringIO(self.separate("--format", "csv", *self.files).stdout)))
+        self.assertEqual(rows[0], ["file", "n", "time", "path", "value"])
+        expected = [[file] + row for file in self.files
+                    for row in list(csv.reader(io.StringIO(self.decode("--format", "csv", file).stdout)))[1:]]
+        self.assertEqual(rows[1:], expected)
+
+    def test_trees_have_their_file_above(self):
+        expected = "".join(f"==> {file} <==\n" + self.decode(file).stdout for file in self.files)
+        self.assertEqual(self.separate(*self.files).stdout, expected)
+
+    def test_each_damage_is_reported_with_its_file_and_the_others_are_decoded(self):
+        whole = capture([serving_cell(1), serving_cell(2)])
+        cut = self.write("cut.pcap", whole[:-3])
+        missing = self.path("missing.pcap")
+        files = [self.files[0], cut, missing, self.files[1]]
+        done = self.separate("--format", "json", *files)
+        self.assertEqual(done.returncode, 1)
+        self.assertEqual([json.loads(line)["file"] for line in done.stdout.splitlines()], files)
+        complaints = [line for line in done.stderr.splitlines() if line.startswith("spectrel: ")]
+        self.assertEqual([line.split(": ")[:2] for line in complaints], [["spectrel", cut], ["spectrel", missing]])
+
+    def test_a_message_that_ends_the_program_ends_its_file_alone(self):
+        ends = self.write("ends.pcap", capture([serving_cell(1), record(0xFF0000, b"no list"), serving_cell(2)]))
+        done = self.separate("--format", "changes", ends, self.files[0])
+        self.assertEqual(done.returncode, 1)
+        self.assertIn(ends + ": message 1", done.stderr)
+        self.assertIn(self.files[0], done.stdout)
+
+    def test_standard_input_has_its_name(self):
+        with open(self.files[0], "rb") as file:
+            done = subprocess.run([os.path.join(BIN, "spectrel"), "decode", "--separate", "--format", "json", "-"],
+                                  stdin=file, env=self.environment, capture_output=True, encoding="utf-8")
+        self.assertEqual(json.loads(done.stdout)["file"], "standard input")
+
+    def test_options_that_need_the_other_are_wrong_without_it(self):
+        self.assertEqual(self.decode("--jobs", "2", *self.files).returncode, 2)
+        self.assertEqual(self.separate("--jobs", "0", *self.files).returncode, 2)
+        self.assertEqual(self.separate("--log", self.path("log"), *self.files).returncode, 2)
+
+    @unittest.skipUnless(os.path.exists("/dev/full"), "there is no /dev/full")
+    def test_an_output_that_cannot_be_written_fails(self):
+        with open("/dev/full", "w") as full:
+            done = subprocess.run([os.path.join(BIN, "spectrel"), "decode", "--separate", *self.files], stdout=full,
+                                  env=self.environment, stderr=subprocess.PIPE, encoding="utf-8")
+        self.assertEqual(done.returncode, 1)
+        self.assertIn("standard output: cannot be written", done.stderr)
+
+
 if __name__ == "__main__":
     unittest.main()
