@@ -192,7 +192,7 @@ Outcome RecordingFiles::createNext(Technology technology)
         while (!created && created.failure().code == Failure::Code::NoRoom && makeRoom())
             created = create(technology, isTarget);
         if (created) {
-            if (!_stream && !isOther(_path))
+            if (!_stream)
                 removeBeside(_path); // of an earlier recording of this name
             _writer = *std::move(created);
             return Done();
