@@ -187,8 +187,8 @@ AlarmWatch::~AlarmWatch()
     _analysis.removeListener(*this);
 }
 
-void AlarmWatch::messageAnalysed(const AppliedMessage& message, const Journal& journal, const Analysis& analysis,
-    const AnalysedChanges& changes)
+void AlarmWatch::messageAnalysed(
+    const AppliedMessage& message, const Journal& journal, const Analysis& analysis, const AnalysedChanges& changes)
 {
     _latest = message.number;
     if (!_condition.level)

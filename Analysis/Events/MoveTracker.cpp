@@ -124,8 +124,7 @@ bool MoveTracker::isElsewhere(const Cell& stored) const
     if (!_current)
         return true;
     return stored.technology != _current->technology || isOther(stored.channel, _current->channel)
-        || isOther(stored.id, _current->id)
-        || isOtherCellIdentity(stored.technology, stored.cell, _current->cell);
+        || isOther(stored.id, _current->id) || isOtherCellIdentity(stored.technology, stored.cell, _current->cell);
 }
 
 void MoveTracker::begin(const Cell& stored, std::uint64_t n, Moment time, bool isAfterLoss)

@@ -4,7 +4,6 @@
 #include <chrono>
 #include <optional>
 
-
 namespace spectrel {
 
 namespace {
@@ -67,8 +66,7 @@ Moment aboveSince(const EvidenceLog& log, const CellMove& move, double offset)
         const auto c1 = signed16(sample->number("C1 Value"));
         if (sample->n >= move.n || sample->number("ARFCN") != move.to.channel || !c1)
             continue;
-        const EvidenceSample* const serving =
-            log.latestWith(EvidenceSection::GSMServing, "C2 Value", sample->n);
+        const EvidenceSample* const serving = log.latestWith(EvidenceSection::GSMServing, "C2 Value", sample->n);
         if (!serving || since - sample->time > Recent || *c1 + offset <= *signed16(serving->number("C2 Value")))
             break;
         since = sample->time;
@@ -180,13 +178,13 @@ FittingRule gsmToUMTSRule(const EvidenceLog& log, const CellMove& move)
     if (!serving || !other)
         return {};
     FittingRule fitting;
-    fitting.evidence = {
-        serving->evidence("C1 Value"), other->evidence("RSCP"), other->evidence("Energy Per Chip")};
+    fitting.evidence = {serving->evidence("C1 Value"), other->evidence("RSCP"), other->evidence("Energy Per Chip")};
     // Without priorities there is but one rule to UMTS while the GSM cell is suitable: a cell that is good enough, and
     // strong enough beside the GSM cells.
     if (*signed16(serving->number("C1 Value")) >= 0) {
         fitting.rule = CauseRule::EqualPriority;
-        fitting.text = "a UMTS cell good enough beside GSM (Ec/No " + numberText(*other->number("Energy Per Chip")) + " dB)";
+        fitting.text =
+            "a UMTS cell good enough beside GSM (Ec/No " + numberText(*other->number("Energy Per Chip")) + " dB)";
     }
     return fitting;
 }

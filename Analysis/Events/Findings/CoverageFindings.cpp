@@ -105,10 +105,8 @@ void CoverageFindings::considerHole(const CellReport& report)
 void CoverageFindings::considerBetterNeighbour(const CellReport& report)
 {
     const auto cells = comparable(report);
-    const auto best = std::ranges::max_element(
-        cells, {}, [](const NeighbourCell* cell) { return *cell->difference; });
-    const bool isBetter =
-        best != cells.end() && *(*best)->difference >= _thresholds[Threshold::BetterNeighbourMargin];
+    const auto best = std::ranges::max_element(cells, {}, [](const NeighbourCell* cell) { return *cell->difference; });
+    const bool isBetter = best != cells.end() && *(*best)->difference >= _thresholds[Threshold::BetterNeighbourMargin];
     if (_betterCell && (!isBetter || !isSameCell(*_betterCell, **best)))
         end(_better, Threshold::BetterNeighbourTime);
     _betterCell.reset();

@@ -20,7 +20,8 @@ struct Finding {
 };
 
 /// The leaf that holds a cell's value, with the number as the cell has it.
-inline void speak(std::vector<Evidence>& evidence, const Analysis& analysis, const Cell& cell, CellKey key, double value)
+inline void speak(
+    std::vector<Evidence>& evidence, const Analysis& analysis, const Cell& cell, CellKey key, double value)
 {
     if (const Origin& origin = cell.origin(key))
         evidence.push_back({analysis.pathOf(origin), numberText(value), origin.time});
