@@ -40,13 +40,15 @@ struct Failure {
 ///         return reader.failure();
 template <typename Value> class [[nodiscard]] Result {
 public:
-    /// From whatever a value is made of, such as a pointer to a derived class.
+    /// From whatever a value is made of, such as a pointer to a derived class; its constraint keeps copies out.
+    // NOLINTBEGIN(bugprone-forwarding-reference-overload)
     template <typename Source = Value>
     requires std::convertible_to<Source, Value> &&(!std::same_as<std::remove_cvref_t<Source>, Result>)&&(
         !std::same_as<std::remove_cvref_t<Source>, Failure>)Result(Source&& value)
         : _held(std::in_place_index<0>, std::forward<Source>(value))
     {
     }
+    // NOLINTEND(bugprone-forwarding-reference-overload)
     Result(Failure failure)
         : _held(std::in_place_index<1>, std::move(failure))
     {

@@ -66,7 +66,7 @@ class CCTRCHSIRMeasurement final : public SectionOf<CCTRCHSIRMeasurement> {
 
     static DictionaryRef channelEntry(RecordView record, std::size_t start)
     {
-        const DictionaryRef entry = entryWithFields(record, EntryFields, start);
+        DictionaryRef entry = entryWithFields(record, EntryFields, start);
         entry->set("SIR", eachEntry(TransportChannelRecord::timeSlots(start), [record](std::size_t slot) {
             return Value(TextBuffer().decimal(record.u8(slot)).view());
         }));
