@@ -89,7 +89,8 @@ public:
     }
     ~Follower() override
     {
-        if (!emptied.empty())
+        // Also when it has settled before the message is finished, and holds nothing any more.
+        if (!journal._refilled.empty())
             std::erase(journal._refilled, this);
     }
 
